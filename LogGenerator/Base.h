@@ -1,0 +1,67 @@
+// The base of all record decoders. A decoder names its section, lists the log codes that it wants, and writes
+// rows into its section's container inside the display dictionary. It keeps no copy of a record.
+//
+// A dictionary section is written by setting keys; an array section only through replaceArrayWith or
+// clearElementsInArray, so that whoever walks it under the array lock never sees it half filled.
+#pragma once
+
+#include <cstdint>
+#include <span>
+#include <string_view>
+
+#include "LogGenerator/LogCode.h"
+#include "LogGenerator/RecordView.h"
+#include "Platform/Platform.h"
+#include "Platform/SystemLog.h"
+#include "Plist/PlistValue.h"
+
+namespace kelvasi {
+
+class ClassDictionary;
+class CodeDictionary;
+
+class Base {
+ public:
+  explicit Base(const Platform& platform) : platform_(platform) {}
+  virtual ~Base() = default;
+  Base(const Base&) = delete;
+  Base& operator=(const Base&) = delete;
+
+  // Registers the decoder under its section name and under each of its log codes. Both dictionaries refer to
+  // it and must not outlive it.
+  void initWithDictCodeDict(ClassDictionary& classDict, CodeDictionary& codeDict);
+  void updateLogCodeDict(CodeDictionary& codeDict);
+
+  // The container that the decoder writes into from now on: a dictionary or an array, shared with the
+  // display.
+  void updateSectionRef(PlistValue container);
+
+  // Abstract: on Base itself each throws UnimplementedMethodError.
+  virtual void updateWithData(RecordView record, LogCode logCode);
+  virtual std::string_view getSectionName() const;
+  virtual std::span<const LogCode> getLogCodeArray() const;
+
+  static void clearElementsInArray(PlistArray& array);
+  static void replaceArrayWith(PlistArray& target, const PlistArray& source);
+
+  // Whole dB for a linear Ec/No, 524288 being 0 dB; 0 for values of 705 and below.
+  static std::int16_t lookUpECNO(std::uint32_t linear);
+
+ protected:
+  SystemLog& log() const { return platform_.log; }
+  const Platform& platform() const { return platform_; }
+  const PlistValue& sectionRef() const { return sectionRef_; }
+  // Null when the section is of the other kind, or not bound to a display yet: then there is nowhere to
+  // write.
+  PlistDictionary* sectionRows() const { return sectionRef_.dictionary(); }
+  PlistArray* sectionList() const { return sectionRef_.array(); }
+
+  void trace(std::string_view text, LogPriority priority = LogPriority::warning) const;
+  void logUnknownMessage(LogCode logCode) const;
+
+ private:
+  Platform platform_;
+  PlistValue sectionRef_;
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,58 @@
+#include "LogGenerator/C2K/ActiveSet1x.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "LogGenerator/C2K/DeviceStatus.h"
+#include "LogGenerator/C2K/PilotList.h"
+
+namespace kelvasi {
+
+namespace {
+
+using namespace deviceStatus;
+
+constexpr double leastRatio = 0.00001;  // -50 dB
+
+std::int64_t field(RecordView subPacket, std::size_t place) {
+  return valueOf(subPacket, activeSetLayout[place]);
+}
+
+// Linear Ec/Io of a pilot's energy: energy * power / divisor - noise.
+struct EnergyScale {
+  explicit EnergyScale(RecordView subPacket) {
+    const auto window = static_cast<double>(field(subPacket, indexIn(activeSetLayout, "window")));
+    const auto gain = static_cast<double>(field(subPacket, indexIn(activeSetLayout, "gain")));
+    const auto exponent = static_cast<int>(field(subPacket, indexIn(activeSetLayout, "energy exponent")));
+    power = std::ldexp(1.0, 2 * exponent - 3);
+    divisor = gain * 9 * window * window;
+    noise = 1 / window;
+  }
+  double decibels(std::uint16_t energy) const {
+    return 10 * std::log10(std::max(power * energy / divisor - noise, leastRatio));
+  }
+
+  double power;
+  double divisor;
+  double noise;
+};
+
+}  // namespace
+
+PlistValue activeSet1x(RecordView subPacket) {
+  const EnergyScale scale(subPacket);
+  const std::int64_t count = field(subPacket, indexIn(activeSetLayout, "count"));
+  const std::int64_t fingers = field(subPacket, indexIn(activeSetLayout, "fingers"));
+  const std::int64_t reference = field(subPacket, indexIn(activeSetLayout, "reference PN offset"));
+  PilotList pilots;
+  for (std::size_t place = 0; place < static_cast<std::size_t>(count); ++place) {
+    const RecordView pilot = subPacket.from(pilotStride(fingers) * place);
+    const std::int64_t offset = valueOf(pilot, pilotLayout[indexIn(pilotLayout, "PN offset")]);
+    pilots.add(place, offset,
+               C2KText("%s%+.2f dB", offset == reference ? "(ref pilot) " : "",
+                       scale.decibels(pilot.u16(pilotEnergyAt(fingers)))));
+  }
+  return pilots.list();
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,104 @@
+#include "LogGenerator/C2K/C2KLogGenerator.h"
+
+#include <algorithm>
+#include <array>
+
+#include "LogGenerator/C2K/C2KLookup.h"
+#include "LogGenerator/C2K/C2KRecords.h"
+#include "LogGenerator/C2K/DeviceStatus.h"
+#include "LogGenerator/C2K/EvdoActiveSet.h"
+#include "LogGenerator/C2K/EvdoRates.h"
+#include "LogGenerator/C2K/EvdoStatus.h"
+#include "LogGenerator/C2K/Fingers.h"
+#include "LogGenerator/C2K/SystemParameters.h"
+#include "LogGenerator/C2K/TrafficFER.h"
+#include "LogGenerator/RecordFraming.h"
+#include "Platform/PlistSerialiser.h"
+#include "Platform/Resources.h"
+
+namespace kelvasi {
+
+namespace {
+
+// In the order in which the start command names the codes. A new record adds its line here.
+constexpr std::array records{
+    C2KRecord{fingers::logCode, parseFingers},
+    C2KRecord{evdoStatus::logCode, parseEvdoStatus},
+    C2KRecord{evdoForwardRate::logCode, parseEvdoForwardRate},
+    C2KRecord{evdoActiveSet::logCode, parseEvdoActiveSet},
+    C2KRecord{deviceStatus::logCode, parseDeviceStatus},
+    C2KRecord{trafficFER::logCode, parseTrafficFER},
+    C2KRecord{evdoReverseRate::logCode, parseEvdoReverseRate},
+    C2KRecord{systemParameters::logCode, parseSystemParameters},
+};
+
+PlistValue loadTemplate(const Platform& platform) {
+  const auto bytes = platform.resources.contents("C2KTemplate", "plist");
+  const auto parsed = bytes ? platform.plists.parse(*bytes) : std::nullopt;
+  return parsed && parsed->dictionary() ? *parsed : PlistValue();
+}
+
+}  // namespace
+
+std::unique_ptr<LogGenerator> C2KLogGenerator::generator(const Platform& platform) {
+  return std::make_unique<C2KLogGenerator>(platform);
+}
+
+void C2KLogGenerator::updateState(PlistDictionary& state, std::span<const std::uint8_t> data) {
+  static const PlistDictionary nothing;
+  getDisplayFromState(state, platform());
+  const PlistValue lookup = state.get("Lookup");
+  updateFromLogUsingLookupUsingState(data, lookup.dictionary() ? *lookup.dictionary() : nothing, state);
+}
+
+void C2KLogGenerator::updateFromLogUsingLookupUsingState(std::span<const std::uint8_t> data,
+                                                         const PlistDictionary& lookup,
+                                                         PlistDictionary& state) {
+  const auto framed = frameRecord(data);
+  if (!framed) return;
+  // Despite its wording the line does not stop the record.
+  if (framed->logType != 1) {
+    platform().log.print(LogPriority::error, "Invalid log type: %x. Dropping.", unsigned{framed->logType});
+  }
+  const auto* const record = std::ranges::find(records, framed->logCode, &C2KRecord::logCode);
+  if (record == records.end()) return;
+  record->parse({framed->record, state, lookup, platform().log});
+  appendRawMessage(framed->record.bytes());
+}
+
+PlistValue C2KLogGenerator::generateLogUsingState(PlistDictionary& state) {
+  const PlistValue display = getDisplayFromState(state, platform());
+  moveRawMessagesInto(state);
+  updateHistoryInState(state, platform().clock);
+  return display;
+}
+
+PlistValue C2KLogGenerator::getStartCommand() const {
+  const auto logCodes = PlistArray::make();
+  for (const C2KRecord& record : records) logCodes->append(record.logCode);
+  return PlistDictionary::make({{"SetState", "Streaming"}, {"SetOrvaneLogCodes", logCodes}});
+}
+
+PlistValue C2KLogGenerator::getDisplayFromState(PlistDictionary& state, const Platform& platform) {
+  if (const PlistValue* display = state.find("Display")) return *display;
+  if (!state.find("Template")) {
+    const PlistValue loaded = loadTemplate(platform);
+    if (loaded.isAbsent()) {
+      platform.log.print(LogPriority::error, "Cannot load C2K template for display");
+      return {};
+    }
+    state.set("Template", loaded);
+  }
+  const PlistValue display = PlistDictionary::make();
+  const PlistValue lookup = PlistDictionary::make();
+  const PlistValue displayTemplate = state.get("Template");
+  if (displayTemplate.dictionary()) {
+    fillFromTemplate(*displayTemplate.dictionary(), display, *lookup.dictionary(), platform.log);
+  }
+  state.set("Display", display);
+  state.set("Lookup", lookup);
+  state.set("ExtraInfo", PlistDictionary::make());
+  return display;
+}
+
+}  // namespace kelvasi

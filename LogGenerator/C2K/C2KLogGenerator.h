@@ -1,0 +1,32 @@
+// The generator of the Orvane CDMA2000 baseband. It has no decoder classes: the template is walked into a
+// display and a lookup table, and the record parsers write by lookup name.
+//
+// Besides the keys of every generator the state holds "Lookup", and what the parsers keep from record to
+// record: "TrafficFER", "FLDataSeqNum", "FLDataSent", "RLDataSeqNum" and "RLDataSent".
+#pragma once
+
+#include "LogGenerator/OrvaneLogGenerator.h"
+
+namespace kelvasi {
+
+class C2KLogGenerator : public OrvaneLogGenerator {
+ public:
+  static std::unique_ptr<LogGenerator> generator(const Platform& platform);
+
+  using OrvaneLogGenerator::OrvaneLogGenerator;
+
+  void updateState(PlistDictionary& state, std::span<const std::uint8_t> data) override;
+  PlistValue generateLogUsingState(PlistDictionary& state) override;
+  PlistValue getStartCommand() const override;
+
+  // Frames a message and hands the record to its parser. A record of a known code is kept, without the
+  // prefix, for the raw log, whatever its parser made of it.
+  void updateFromLogUsingLookupUsingState(std::span<const std::uint8_t> data, const PlistDictionary& lookup,
+                                          PlistDictionary& state);
+
+  // The state's display, built with its lookup table on the first call; absent when the template cannot be
+  // loaded.
+  static PlistValue getDisplayFromState(PlistDictionary& state, const Platform& platform);
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,95 @@
+#include "LogGenerator/C2K/EvdoRates.h"
+
+#include <string>
+
+#include "LogGenerator/C2K/C2KRecords.h"
+
+namespace kelvasi {
+
+namespace {
+
+std::int64_t forwardSent(RecordView record) {
+  using namespace evdoForwardRate;
+  std::int64_t sent = 0;
+  for (std::size_t place = 0; place < weights.size(); ++place) {
+    sent += record.u32(firstCounter + 4 * place) * weights[place];
+  }
+  return sent;
+}
+
+std::int64_t packetsOfRate(RecordView record, std::size_t rate) {
+  using namespace evdoReverseRate;
+  std::int64_t packets = 0;
+  for (std::size_t subFrame = 0; subFrame < subFrames; ++subFrame) {
+    for (std::size_t half = 0; half < halves; ++half) {
+      const std::size_t base = firstCounter + subFrameStep * subFrame + halfStep * half + rateStep * rate;
+      for (std::size_t counter = 0; counter < counters; ++counter) {
+        packets += record.u32(base + counterStep * counter);
+      }
+    }
+  }
+  return packets;
+}
+
+std::int64_t reverseSent(RecordView record) {
+  std::int64_t sent = 0;
+  for (std::size_t rate = 0; rate < evdoReverseRate::weights.size(); ++rate) {
+    sent += packetsOfRate(record, rate) * evdoReverseRate::weights[rate];
+  }
+  return sent;
+}
+
+// One link's names: "FL" or "RL" in front of the state's keys.
+struct Link {
+  const char* rateName;
+  std::string sequenceKey;
+  std::string sentKey;
+};
+
+void showRate(const C2KUpdate& update, const Link& link, std::uint32_t sequence, std::int64_t sent) {
+  const PlistValue sequenceBefore = update.state.get(link.sequenceKey);
+  const PlistValue sentBefore = update.state.get(link.sentKey);
+  if (sequenceBefore.integer() && sentBefore.integer()) {
+    const auto steps =
+        static_cast<std::int32_t>(sequence - static_cast<std::uint32_t>(*sequenceBefore.integer()));
+    if (steps >= 1) {
+      const auto bits = static_cast<double>(sent - *sentBefore.integer());
+      update.set(link.rateName, C2KText("%.2f kbps", bits / (steps * 1024.0)));
+    }
+    update.setExtraInfo(link.sequenceKey + "2", sequenceBefore);
+    update.setExtraInfo(link.sentKey + "2", sentBefore);
+  } else {
+    update.set(link.rateName, C2KText("%s", ""));
+  }
+  update.state.set(link.sequenceKey, sequence);
+  update.state.set(link.sentKey, sent);
+  update.setExtraInfo(link.sequenceKey + "1", sequence);
+  update.setExtraInfo(link.sentKey + "1", sent);
+}
+
+bool isLongEnough(const C2KUpdate& update, unsigned logCode, std::size_t minimumLength) {
+  if (update.record.size() >= minimumLength) return true;
+  update.log.print(LogPriority::error, "Log code 0x%x is %d bytes long but must be at least %ld bytes.",
+                   logCode, static_cast<int>(update.length()), static_cast<long>(minimumLength));
+  return false;
+}
+
+}  // namespace
+
+void parseEvdoForwardRate(const C2KUpdate& update) {
+  using namespace evdoForwardRate;
+  if (!isLongEnough(update, logCode, minimumLength)) return;
+  const auto sequence =
+      static_cast<std::uint32_t>(valueOf(update.record, layout[indexIn(layout, "sequence number")]));
+  showRate(update, {"kFLDataRate", "FLDataSeqNum", "FLDataSent"}, sequence, forwardSent(update.record));
+}
+
+void parseEvdoReverseRate(const C2KUpdate& update) {
+  using namespace evdoReverseRate;
+  if (!isLongEnough(update, logCode, minimumLength)) return;
+  const auto sequence =
+      static_cast<std::uint32_t>(valueOf(update.record, layout[indexIn(layout, "sequence number")]));
+  showRate(update, {"kRLDataRate", "RLDataSeqNum", "RLDataSent"}, sequence, reverseSent(update.record));
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,38 @@
+#include "LogGenerator/GSM/GSMRRInfo.h"
+
+#include "LogGenerator/GSM/GPRSCellOptions.h"
+#include "LogGenerator/GSM/GSMMeasurements.h"
+#include "LogGenerator/GSM/GSMRRRecords.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr std::array logCodes{rrState::logCode, gsmMeasurements::logCode, dtx::logCode,
+                              gprsCellOptions::logCode};
+
+// Whole words, of which the serving cell's section shows the low halves as C1 and C2.
+constexpr std::array measurementRows{
+    Row{.key = "Serving Rx Level", .field = indexIn(gsmMeasurements::layout, "receive level")},
+    Row{.key = "Rx Quality Full", .field = indexIn(gsmMeasurements::layout, "C1 or full receive quality")},
+    Row{.key = "Rx Quality Sub", .field = indexIn(gsmMeasurements::layout, "C2 or sub receive quality")},
+};
+constexpr std::array optionRows{
+    Row{.key = "DRX Used", .field = indexIn(gprsCellOptions::layout, "DRX timer maximum"), .unit = " sec"},
+};
+constexpr std::array records{
+    rrState::record,
+    RecordRows{gsmMeasurements::logCode, gsmMeasurements::minimumLength, gsmMeasurements::layout,
+               measurementRows},
+    dtx::record,
+    RecordRows{gprsCellOptions::logCode, gprsCellOptions::minimumLength, gprsCellOptions::layout, optionRows},
+};
+
+constexpr StateSection section{
+    .name = "GSM RR Info", .trace = "GSMRRInfo", .logCodes = logCodes, .records = records};
+
+}  // namespace
+
+GSMRRInfo::GSMRRInfo(const Platform& platform) : StateDecoder(platform, section) {}
+
+}  // namespace kelvasi

@@ -1,0 +1,45 @@
+// Record 0x4005: the UMTS and GSM cells ranked for reselection (3GPP TS 25.304, 5.2.6).
+#pragma once
+
+#include <array>
+
+#include "LogGenerator/EntryList.h"
+#include "LogGenerator/LogCode.h"
+
+namespace kelvasi::neighbourSets {
+
+inline constexpr LogCode logCode = 0x4005;
+inline constexpr std::size_t minimumLength = 15;
+
+inline constexpr std::array layout{
+    Field{.name = "UMTS cells", .byte = 13},
+    Field{.name = "GSM cells", .byte = 14},
+};
+static_assert(inWireOrder(layout));
+
+inline constexpr std::array umtsLayout{
+    Field{.name = "downlink UARFCN", .byte = 0, .width = 16, .isSigned = true},
+    Field{.name = "scrambling code", .byte = 2, .width = 16},
+    Field{.name = "RSCP", .byte = 4, .isSigned = true},
+    Field{.name = "rank-cell RSCP", .byte = 5, .width = 16, .isSigned = true},
+    Field{.name = "Ec/No in half dB", .byte = 7, .isSigned = true},
+    Field{.name = "ranking value", .byte = 8, .width = 16, .isSigned = true},
+};
+static_assert(inWireOrder(umtsLayout));
+
+inline constexpr std::array gsmLayout{
+    Field{.name = "ARFCN", .byte = 0, .width = 16},
+    Field{.name = "BSIC", .byte = 2, .width = 16},
+    Field{.name = "RSSI", .byte = 4, .isSigned = true},
+    Field{.name = "ranking value", .byte = 5, .width = 16, .isSigned = true},
+};
+static_assert(inWireOrder(gsmLayout));
+
+// Both lists begin at the same byte, whatever the other one counts.
+inline constexpr std::size_t firstEntry = 15;
+inline constexpr EntryList umtsCells{
+    .count = fieldIn(layout, "UMTS cells"), .start = firstEntry, .stride = 10, .layout = umtsLayout};
+inline constexpr EntryList gsmCells{
+    .count = fieldIn(layout, "GSM cells"), .start = firstEntry, .stride = 7, .layout = gsmLayout};
+
+}  // namespace kelvasi::neighbourSets

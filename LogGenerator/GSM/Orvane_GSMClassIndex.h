@@ -1,0 +1,72 @@
+// The decoders of the GSM/UMTS technology.
+//
+// To add one: declare the record in a header of its own (layout, count and entries, rows), write the decoder
+// beside the others around a StateSection or a ListSection table, list its .cpp in
+// LogGenerator/CMakeLists.txt, and add a line below. The order is the order of creation, and so the order in
+// which the subscribers of one log code receive a record; it is also the order of release.
+#pragma once
+
+#include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/GSM/ActiveSet.h"
+#include "LogGenerator/GSM/BLER.h"
+#include "LogGenerator/GSM/CellChangeCounters.h"
+#include "LogGenerator/GSM/CodingScheme.h"
+#include "LogGenerator/GSM/DetectedSet.h"
+#include "LogGenerator/GSM/EquivalentPLMNList.h"
+#include "LogGenerator/GSM/GPRSInformation.h"
+#include "LogGenerator/GSM/GSMRRInfo.h"
+#include "LogGenerator/GSM/GSMServingCell.h"
+#include "LogGenerator/GSM/GSMSet.h"
+#include "LogGenerator/GSM/HSDPAInformation.h"
+#include "LogGenerator/GSM/MobileAllocation.h"
+#include "LogGenerator/GSM/MonitoredSet.h"
+#include "LogGenerator/GSM/NeighboringCells.h"
+#include "LogGenerator/GSM/NonRankedGSMSet.h"
+#include "LogGenerator/GSM/NonRankedUMTSSet.h"
+#include "LogGenerator/GSM/PDPContextList.h"
+#include "LogGenerator/GSM/ProcessCO.h"
+#include "LogGenerator/GSM/ProcessCS.h"
+#include "LogGenerator/GSM/ProcessPS.h"
+#include "LogGenerator/GSM/ServingPLMN.h"
+#include "LogGenerator/GSM/SimInfo.h"
+#include "LogGenerator/GSM/UMTSRRInfo.h"
+#include "LogGenerator/GSM/UMTSRRMeasurement.h"
+#include "LogGenerator/GSM/UMTSSet.h"
+#include "LogGenerator/GSM/VirtualActiveSet.h"
+
+namespace kelvasi {
+
+class Orvane_GSMClassIndex : public ClassIndex {
+ public:
+  using ClassIndex::ClassIndex;
+  ~Orvane_GSMClassIndex() override { deallocWith("Deallocing Orvane_GSMClassIndex"); }
+
+  ActiveSet& objActiveSet = create<ActiveSet>();
+  CodingScheme& objCodingScheme = create<CodingScheme>();
+  GPRSInformation& objGPRSInformation = create<GPRSInformation>();
+  GSMServingCell& objGSMServingCell = create<GSMServingCell>();
+  MobileAllocation& objMobileAllocation = create<MobileAllocation>();
+  NeighboringCells& objNeighboringCells = create<NeighboringCells>();
+  PDPContextList& objPDPContextList = create<PDPContextList>();
+  ProcessPS& objProcessPS = create<ProcessPS>();
+  UMTSRRMeasurement& objUMTSRRMeasurement = create<UMTSRRMeasurement>();
+  CellChangeCounters& objCellChangeCounter = create<CellChangeCounters>();
+  DetectedSet& objDetectedSet = create<DetectedSet>();
+  GSMSet& objGSMSet = create<GSMSet>();
+  NonRankedGSMSet& objNonRankedGSMSet = create<NonRankedGSMSet>();
+  ProcessCO& objProcessCO = create<ProcessCO>();
+  ServingPLMN& objServingPLMN = create<ServingPLMN>();
+  UMTSSet& objUMTSSet = create<UMTSSet>();
+  EquivalentPLMNList& objEquivalentPLMNList = create<EquivalentPLMNList>();
+  GSMRRInfo& objGSMRRInfo = create<GSMRRInfo>();
+  MonitoredSet& objMonitoredSet = create<MonitoredSet>();
+  NonRankedUMTSSet& objNonRankedUMTSSet = create<NonRankedUMTSSet>();
+  ProcessCS& objProcessCS = create<ProcessCS>();
+  UMTSRRInfo& objUMTSRRInfo = create<UMTSRRInfo>();
+  BLER& objBLER = create<BLER>();
+  VirtualActiveSet& objVirtualActiveSet = create<VirtualActiveSet>();
+  SimInfo& objSimInfo = create<SimInfo>();
+  HSDPAInformation& objHSDPAInformation = create<HSDPAInformation>();
+};
+
+}  // namespace kelvasi

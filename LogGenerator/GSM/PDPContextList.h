@@ -1,0 +1,17 @@
+// Section "PDP Context Info": the PDP contexts as the telephony daemon lists them, whatever their keys.
+#pragma once
+
+#include "LogGenerator/Base.h"
+
+namespace kelvasi {
+
+class PDPContextList : public Base {
+ public:
+  using Base::Base;
+
+  void updateWithData(RecordView record, LogCode logCode) override;
+  std::string_view getSectionName() const override { return "PDP Context Info"; }
+  std::span<const LogCode> getLogCodeArray() const override;
+};
+
+}  // namespace kelvasi

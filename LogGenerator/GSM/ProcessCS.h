@@ -1,0 +1,13 @@
+// Section "Process CS": mobility management of the circuit-switched domain.
+#pragma once
+
+#include "LogGenerator/StateDecoder.h"
+
+namespace kelvasi {
+
+class ProcessCS : public StateDecoder {
+ public:
+  explicit ProcessCS(const Platform& platform);
+};
+
+}  // namespace kelvasi

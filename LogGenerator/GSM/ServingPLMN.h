@@ -1,0 +1,16 @@
+// Section "Serving PLMN": the network that the handset is registered in.
+#pragma once
+
+#include "LogGenerator/StateDecoder.h"
+
+namespace kelvasi {
+
+class ServingPLMN : public StateDecoder {
+ public:
+  explicit ServingPLMN(const Platform& platform);
+
+ protected:
+  void decodeOther(RecordView record, LogCode logCode) override;
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,19 @@
+// Section "SIM Info": elementary files of the SIM as the telephony daemon hands them over, whatever their
+// kind.
+#pragma once
+
+#include "LogGenerator/Base.h"
+
+namespace kelvasi {
+
+class SimInfo : public Base {
+ public:
+  using Base::Base;
+
+  // Throws LogCode_0xFF000020::UnknownDataException when the record carries no property list.
+  void updateWithData(RecordView record, LogCode logCode) override;
+  std::string_view getSectionName() const override { return "SIM Info"; }
+  std::span<const LogCode> getLogCodeArray() const override;
+};
+
+}  // namespace kelvasi

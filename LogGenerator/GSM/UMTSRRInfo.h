@@ -1,0 +1,20 @@
+// Section "UMTS RR Info": RRC state, transmit power and serving cell in UMTS.
+#pragma once
+
+#include "LogGenerator/StateDecoder.h"
+
+namespace kelvasi {
+
+class UMTSRRInfo : public StateDecoder {
+ public:
+  explicit UMTSRRInfo(const Platform& platform);
+
+ protected:
+  void decodeOther(RecordView record, LogCode logCode) override;
+
+ private:
+  void showTransmitPower(RecordView record) const;
+  void showServingCell(RecordView record) const;
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,45 @@
+// Record 0xB179: the intra-frequency measurement in connected mode, with its measured and detected cells.
+#pragma once
+
+#include <array>
+
+#include "LogGenerator/EntryList.h"
+#include "LogGenerator/LogCode.h"
+
+namespace kelvasi::lte::connectedModeMeasurement {
+
+inline constexpr LogCode logCode = 0xB179;
+inline constexpr std::size_t minimumLength = 29;
+
+inline constexpr std::array layout{
+    Field{.name = "E-ARFCN", .byte = 17, .width = 16},
+    Field{.name = "serving physical cell identity", .byte = 19, .width = 16},
+    Field{.name = "subframe number", .byte = 21, .width = 16},
+    Field{.name = "filtered RSRP", .byte = 23, .width = 16},
+    Field{.name = "filtered RSRQ", .byte = 25, .width = 16},
+    Field{.name = "measured neighbours", .byte = 27},
+    Field{.name = "detected cells", .byte = 28},
+};
+static_assert(inWireOrder(layout));
+
+inline constexpr std::array measuredLayout{
+    Field{.name = "physical cell identity", .byte = 0, .width = 16},
+    Field{.name = "filtered RSRP", .byte = 2, .width = 16},
+    Field{.name = "filtered RSRQ", .byte = 4, .width = 16},
+};
+static_assert(inWireOrder(measuredLayout));
+
+inline constexpr std::array detectedLayout{
+    Field{.name = "physical cell identity", .byte = 0, .width = 16},
+};
+
+inline constexpr EntryList measured{
+    .count = fieldIn(layout, "measured neighbours"), .start = 29, .stride = 6, .layout = measuredLayout};
+inline constexpr EntryList detected{.count = fieldIn(layout, "detected cells"),
+                                    .start = measured.start,
+                                    .stride = 2,
+                                    .layout = detectedLayout,
+                                    .countBefore = measured.count,
+                                    .bytesPerEntryBefore = measured.stride};
+
+}  // namespace kelvasi::lte::connectedModeMeasurement

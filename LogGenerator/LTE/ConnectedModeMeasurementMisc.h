@@ -1,0 +1,13 @@
+// Section "Connected mode LTE Intra-frequency Measurement": the serving cell as measured in connected mode.
+#pragma once
+
+#include "LogGenerator/StateDecoder.h"
+
+namespace kelvasi {
+
+class ConnectedModeMeasurementMisc : public StateDecoder {
+ public:
+  explicit ConnectedModeMeasurementMisc(const Platform& platform);
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,30 @@
+#include "LogGenerator/LTE/DetectedCells.h"
+
+#include "LogGenerator/LTE/ConnectedModeMeasurement.h"
+
+namespace kelvasi {
+
+namespace {
+
+using namespace lte;
+
+constexpr std::array logCodes{connectedModeMeasurement::logCode};
+
+constexpr std::array rows{
+    Row{.key = "Physical Cell ID",
+        .field = indexIn(connectedModeMeasurement::detectedLayout, "physical cell identity")},
+};
+
+constexpr ListSection section{.name = "Detected Cells",
+                              .trace = "Detected Cells",
+                              .logCodes = logCodes,
+                              .logCode = connectedModeMeasurement::logCode,
+                              .minimumLength = connectedModeMeasurement::minimumLength,
+                              .list = connectedModeMeasurement::detected,
+                              .rows = rows};
+
+}  // namespace
+
+DetectedCells::DetectedCells(const Platform& platform) : ListDecoder(platform, section) {}
+
+}  // namespace kelvasi

@@ -1,0 +1,40 @@
+// The decoders of the LTE technology.
+//
+// To add one: write its class beside the others, then add a line below. The order is the order of creation,
+// and so the order in which the subscribers of one log code receive a record.
+#pragma once
+
+#include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/GSM/PDPContextList.h"
+#include "LogGenerator/GSM/SimInfo.h"
+#include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
+#include "LogGenerator/LTE/DetectedCells.h"
+#include "LogGenerator/LTE/LTEServingCellInfo.h"
+#include "LogGenerator/LTE/MeasuredNeighborCells.h"
+#include "LogGenerator/LTE/NeighborCellsList.h"
+#include "LogGenerator/LTE/NeighborMeasurementMisc.h"
+#include "LogGenerator/LTE/ReselectionCandidatesList.h"
+#include "LogGenerator/LTE/ReselectionCandidatesMisc.h"
+#include "LogGenerator/LTE/ServingCellMeasurement.h"
+
+namespace kelvasi {
+
+class LTEClassIndex : public ClassIndex {
+ public:
+  using ClassIndex::ClassIndex;
+  ~LTEClassIndex() override { deallocWith("Deallocing LTEClassIndex"); }
+
+  LTEServingCellInfo& objLTEServingCellInfo = create<LTEServingCellInfo>();
+  ConnectedModeMeasurementMisc& objConnectedModeMeasurementMisc = create<ConnectedModeMeasurementMisc>();
+  MeasuredNeighborCells& objMeasuredNeighborCells = create<MeasuredNeighborCells>();
+  DetectedCells& objDetectedCells = create<DetectedCells>();
+  ServingCellMeasurement& objServingCellMeasurement = create<ServingCellMeasurement>();
+  NeighborMeasurementMisc& objNeighborMeasurementMisc = create<NeighborMeasurementMisc>();
+  NeighborCellsList& objNeighborCellsList = create<NeighborCellsList>();
+  ReselectionCandidatesMisc& objReselectionCandidatesMisc = create<ReselectionCandidatesMisc>();
+  ReselectionCandidatesList& objReselectionCandidatesList = create<ReselectionCandidatesList>();
+  SimInfo& objSimInfo = create<SimInfo>();
+  PDPContextList& objPDPContextList = create<PDPContextList>();
+};
+
+}  // namespace kelvasi

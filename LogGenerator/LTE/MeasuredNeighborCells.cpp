@@ -1,0 +1,39 @@
+#include "LogGenerator/LTE/MeasuredNeighborCells.h"
+
+#include "LogGenerator/LTE/ConnectedModeMeasurement.h"
+#include "LogGenerator/LTE/MeasurementScales.h"
+
+namespace kelvasi {
+
+namespace {
+
+using namespace lte;
+using connectedModeMeasurement::measuredLayout;
+
+constexpr std::array logCodes{connectedModeMeasurement::logCode};
+
+constexpr std::array rows{
+    Row{.key = "Physical Cell ID", .field = indexIn(measuredLayout, "physical cell identity")},
+    Row{.key = "Filtered RSRP",
+        .field = indexIn(measuredLayout, "filtered RSRP"),
+        .unit = " dBm",
+        .scale = quarterRsrp},
+    Row{.key = "Filtered RSRQ",
+        .field = indexIn(measuredLayout, "filtered RSRQ"),
+        .unit = " dB",
+        .scale = eighthRsrq},
+};
+
+constexpr ListSection section{.name = "Measured Neighbor Cells",
+                              .trace = "Measured Neighbor Cells",
+                              .logCodes = logCodes,
+                              .logCode = connectedModeMeasurement::logCode,
+                              .minimumLength = connectedModeMeasurement::minimumLength,
+                              .list = connectedModeMeasurement::measured,
+                              .rows = rows};
+
+}  // namespace
+
+MeasuredNeighborCells::MeasuredNeighborCells(const Platform& platform) : ListDecoder(platform, section) {}
+
+}  // namespace kelvasi

@@ -1,0 +1,32 @@
+#include "LogGenerator/LTE/ReselectionCandidatesMisc.h"
+
+#include "LogGenerator/LTE/ReselectionCandidates.h"
+
+namespace kelvasi {
+
+namespace {
+
+using lte::reselectionCandidates::layout;
+
+constexpr std::array logCodes{lte::reselectionCandidates::logCode};
+
+constexpr std::array rows{
+    Row{.key = "Version", .field = indexIn(layout, "version")},
+    Row{.key = "Serving EARFCN", .field = indexIn(layout, "serving E-ARFCN")},
+    Row{.key = "Serving Cell ID", .field = indexIn(layout, "serving cell identity")},
+};
+constexpr std::array records{
+    RecordRows{lte::reselectionCandidates::logCode, lte::reselectionCandidates::minimumLength, layout, rows},
+};
+
+constexpr StateSection section{.name = "Reselection Candidates",
+                               .trace = "Reselection Candidates",
+                               .logCodes = logCodes,
+                               .records = records};
+
+}  // namespace
+
+ReselectionCandidatesMisc::ReselectionCandidatesMisc(const Platform& platform)
+    : StateDecoder(platform, section) {}
+
+}  // namespace kelvasi

@@ -1,0 +1,27 @@
+// Remembers what the last bytes parsed gave, so that the decoders that read one record parse it once.
+//
+// What it hands out is shared: readers may pass parts of it on, and change none of it. For one thread.
+#pragma once
+
+#include "Platform/PlistSerialiser.h"
+
+namespace kelvasi {
+
+class LastParsed : public PlistSerialiser {
+ public:
+  // `serialiser` outlives this object.
+  explicit LastParsed(const PlistSerialiser& serialiser) : serialiser_(serialiser) {}
+
+  std::optional<PlistValue> parse(std::span<const std::uint8_t> bytes) const override;
+  std::optional<Bytes> serialiseXml(const PlistValue& value) const override {
+    return serialiser_.serialiseXml(value);
+  }
+
+ private:
+  const PlistSerialiser& serialiser_;
+  mutable bool hasParsed_ = false;
+  mutable Bytes bytes_;
+  mutable std::optional<PlistValue> parsed_;
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,57 @@
+// A decoder of an array section: one dictionary for each entry of a record's list, and, where it asks for
+// the cell list, one for each cell that its table takes. A record with a twist of its own overrides addEntry.
+#pragma once
+
+#include <span>
+#include <string_view>
+
+#include "LogGenerator/Base.h"
+#include "LogGenerator/CellRows.h"
+#include "LogGenerator/EntryList.h"
+#include "LogGenerator/Row.h"
+#include "LogGenerator/RowList.h"
+
+namespace kelvasi {
+
+struct ListSection {
+  std::string_view name;
+  std::string_view trace;  // written to the system log at every update
+  LogPriority tracePriority = LogPriority::warning;
+  std::span<const LogCode> logCodes;
+  LogCode logCode = 0;            // of the record with the list
+  std::size_t minimumLength = 0;  // a shorter record is ignored
+  EntryList list;
+  std::span<const Row> rows = {};    // of an entry
+  bool staysEmpty = false;           // the entries are read and not shown
+  const CellTable* cells = nullptr;  // for the cell-information record
+};
+
+class ListDecoder : public Base {
+ public:
+  // `section` outlives the decoder.
+  ListDecoder(const Platform& platform, const ListSection& section) : Base(platform), section_(section) {}
+
+  void updateWithData(RecordView record, LogCode logCode) override;
+  std::string_view getSectionName() const override { return section_.name; }
+  std::span<const LogCode> getLogCodeArray() const override { return section_.logCodes; }
+
+ protected:
+  // Adds what the section shows of one entry, if anything; unless overridden, the rows of the table.
+  virtual void addEntry(RecordView record, std::size_t place);
+  // A record that neither table describes; unless overridden, the unknown-message line.
+  virtual void decodeOther(RecordView record, LogCode logCode);
+
+  RowWriter addRows() { return list_.add(); }
+  RecordView entry(RecordView record, std::size_t place) const {
+    return entryOf(record, section_.list, place);
+  }
+
+ private:
+  void showList(RecordView record);
+  void showCells(RecordView record);
+
+  const ListSection& section_;
+  RowList list_;
+};
+
+}  // namespace kelvasi

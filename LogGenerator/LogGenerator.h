@@ -1,0 +1,60 @@
+// A log generator turns the diagnostic stream of one radio technology into the generator state, from which
+// the display tree and the snapshot are made.
+//
+// The state is one dictionary per session, owned by the model and handed to every call. Its keys:
+//   "DisplayState"  the raw material of the last interval
+//   "Display"       the display dictionary
+//   "ExtraInfo"     a dictionary, new whenever "Display" is built
+//   "Template"      the display template, loaded once
+//   "History"       at most five history entries, the oldest first
+#pragma once
+
+#include <cstdint>
+#include <memory>
+#include <span>
+#include <string_view>
+
+#include "Platform/Platform.h"
+#include "Plist/PlistValue.h"
+
+namespace kelvasi {
+
+class LogGenerator {
+ public:
+  // For one that is made without a word in the system log.
+  struct Bare {};
+  static constexpr Bare bare{};
+
+  explicit LogGenerator(const Platform& platform);
+  LogGenerator(const Platform& platform, Bare) : platform_(platform) {}
+  virtual ~LogGenerator() = default;
+  LogGenerator(const LogGenerator&) = delete;
+  LogGenerator& operator=(const LogGenerator&) = delete;
+
+  // Abstract: on LogGenerator itself each throws UnimplementedMethodError.
+
+  // Takes in one log message.
+  virtual void updateState(PlistDictionary& state, std::span<const std::uint8_t> data);
+  // The display of this tick; may be absent.
+  virtual PlistValue generateLogUsingState(PlistDictionary& state);
+  // What the session sends to start the stream.
+  virtual PlistValue getStartCommand() const;
+  // The array that goes into a snapshot.
+  virtual PlistValue getSaveContentsFromState(const PlistDictionary& state) const;
+
+  // Appends one history entry made of the state as it is, dropping the oldest past five. An entry ends before
+  // the first of its keys that the state lacks.
+  static void updateHistoryInState(PlistDictionary& state, const Clock& clock);
+
+  // The generator for what the daemon calls the technology; null for one that is not known.
+  static std::unique_ptr<LogGenerator> generatorFromTechnology(std::string_view technology,
+                                                               const Platform& platform);
+
+ protected:
+  const Platform& platform() const { return platform_; }
+
+ private:
+  Platform platform_;
+};
+
+}  // namespace kelvasi

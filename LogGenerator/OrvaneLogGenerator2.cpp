@@ -1,0 +1,151 @@
+#include "LogGenerator/OrvaneLogGenerator2.h"
+
+#include <charconv>
+#include <stdexcept>
+#include <utility>
+
+#include "LogGenerator/RecordFraming.h"
+#include "Platform/PlistSerialiser.h"
+#include "Platform/Resources.h"
+#include "Platform/SystemLog.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr const char* unknownObject = "Received an object of unknown type";
+
+PlistValue storable(PlistValue value) {
+  if (value.isAbsent())
+    throw std::invalid_argument("a display template may hold strings, dictionaries and arrays only");
+  return value;
+}
+
+// Logs ahead of what the base's construction logs.
+const Platform& announced(const Platform& platform, const ClassIndex* cIndex) {
+  platform.log.print(LogPriority::error, "Creating OrvaneLogGenerator2 object with %p",
+                     static_cast<const void*>(cIndex));
+  return platform;
+}
+
+}  // namespace
+
+OrvaneLogGenerator2::OrvaneLogGenerator2(const Platform& platform, std::string pListName,
+                                         std::unique_ptr<ClassIndex> cIndex)
+    : OrvaneLogGenerator(announced(platform, cIndex.get())),
+      pListName_(std::move(pListName)),
+      cIndex_(std::move(cIndex)) {
+  constexpr long owners = 1;  // the index has no other owner than its generator
+  platform.log.print(LogPriority::error, "Class Index: %ld", owners);
+}
+
+OrvaneLogGenerator2::OrvaneLogGenerator2(const Platform& platform) : OrvaneLogGenerator(platform, bare) {}
+
+OrvaneLogGenerator2::~OrvaneLogGenerator2() {
+  // The same text for every template-driven generator.
+  platform().log.print(LogPriority::warning, "Orvane_GSMLogGenerator is destructed %p",
+                       static_cast<void*>(this));
+}
+
+void OrvaneLogGenerator2::updateWithData(std::span<const std::uint8_t> data) {
+  const auto framed = frameRecord(data);
+  if (!framed) return;
+  if (!framed->hasKnownType()) {
+    platform().log.print(LogPriority::error, "Invalid log type: %x. Dropping.", unsigned{framed->logType});
+    return;
+  }
+  if (!cIndex_) return;
+  for (Base* decoder : cIndex_->getSubscribers(framed->logCode)) {
+    decoder->updateWithData(framed->record, framed->logCode);
+  }
+}
+
+void OrvaneLogGenerator2::updateState(PlistDictionary& state, std::span<const std::uint8_t> data) {
+  getDisplayFromState(state);
+  updateWithData(data);
+  appendRawMessage(data);
+}
+
+PlistValue OrvaneLogGenerator2::generateLogUsingState(PlistDictionary& state) {
+  const PlistValue display = getDisplayFromState(state);
+  moveRawMessagesInto(state);
+  updateHistoryInState(state, platform().clock);
+  return display;
+}
+
+PlistValue OrvaneLogGenerator2::getStartCommand() const {
+  const auto logCodes = PlistArray::make();
+  const auto extraCodes = PlistArray::make();
+  for (const std::string& text : cIndex_ ? cIndex_->getAllLogCodes() : std::vector<std::string>()) {
+    LogCode code = 0;
+    std::from_chars(text.data(), text.data() + text.size(), code);
+    if (code >= extraLogCodes) {
+      extraCodes->append(code - extraLogCodes);
+    } else {
+      logCodes->append(code);
+    }
+  }
+  return PlistDictionary::make(
+      {{"SetState", "Streaming"}, {"SetOrvaneLogCodes", logCodes}, {"SetTelvonExtraCodes", extraCodes}});
+}
+
+PlistValue OrvaneLogGenerator2::getDisplayFromState(PlistDictionary& state) {
+  if (const PlistValue* display = state.find("Display")) return *display;
+  if (!cIndex_ || !state.find("Template")) {
+    const PlistValue loaded = loadTemplate();
+    if (loaded.isAbsent()) {
+      platform().log.print(LogPriority::error, "Cannot load template for display");
+      return {};
+    }
+    state.set("Template", loaded);
+  }
+  platform().log.print(LogPriority::warning, "Initialized class index: %p, Self: %p",
+                       static_cast<void*>(cIndex_.get()), static_cast<void*>(this));
+  cIndex_->status();
+  const PlistValue display = processTemplate(state.get("Template"));
+  printDict(display);
+  state.set("Display", display);
+  state.set("ExtraInfo", PlistDictionary::make());
+  return {};
+}
+
+PlistValue OrvaneLogGenerator2::loadTemplate() const {
+  if (!cIndex_) return {};
+  const auto bytes = platform().resources.contents(pListName_, "plist");
+  const auto parsed = bytes ? platform().plists.parse(*bytes) : std::nullopt;
+  return parsed && parsed->dictionary() ? *parsed : PlistValue();
+}
+
+PlistValue OrvaneLogGenerator2::processTemplate(const PlistValue& object) {
+  if (object.string()) return object;
+  if (const PlistDictionary* entries = object.dictionary()) {
+    const auto copy = PlistDictionary::make();
+    for (const auto& [key, value] : *entries) {
+      const PlistValue processed = processTemplate(value);
+      if (Base* decoder = cIndex_ ? cIndex_->getClass(key) : nullptr) decoder->updateSectionRef(processed);
+      copy->set(key, storable(processed));
+    }
+    return copy;
+  }
+  if (const PlistArray* elements = object.array()) {
+    const auto copy = PlistArray::make();
+    for (const PlistValue& element : *elements) copy->append(storable(processTemplate(element)));
+    return copy;
+  }
+  platform().log.print(LogPriority::error, "%s", unknownObject);
+  platform().log.print(LogPriority::warning, "Processing the template");
+  return {};
+}
+
+void OrvaneLogGenerator2::printDict(const PlistValue& object) const {
+  if (object.string()) return;
+  if (const PlistDictionary* entries = object.dictionary()) {
+    for (const auto& [key, value] : *entries) printDict(value);
+  } else if (const PlistArray* elements = object.array()) {
+    for (const PlistValue& element : *elements) printDict(element);
+  } else {
+    platform().log.print(LogPriority::error, "%s", unknownObject);
+  }
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,45 @@
+// The template-driven generator: builds the display once from a property-list template, hands every section
+// in it to the decoder of that name, and dispatches each log record to the decoders that subscribe to its
+// code.
+#pragma once
+
+#include <memory>
+#include <string>
+
+#include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/OrvaneLogGenerator.h"
+
+namespace kelvasi {
+
+class OrvaneLogGenerator2 : public OrvaneLogGenerator {
+ public:
+  // `pListName` is the template's resource name without extension.
+  OrvaneLogGenerator2(const Platform& platform, std::string pListName, std::unique_ptr<ClassIndex> cIndex);
+  // One without template and decoders: it logs nothing at its creation, asks for no records and shows
+  // nothing.
+  explicit OrvaneLogGenerator2(const Platform& platform);
+  ~OrvaneLogGenerator2() override;
+
+  // Frames one log message and gives the record to the subscribers of its effective log code.
+  void updateWithData(std::span<const std::uint8_t> data);
+
+  void updateState(PlistDictionary& state, std::span<const std::uint8_t> data) override;
+  PlistValue generateLogUsingState(PlistDictionary& state) override;
+  PlistValue getStartCommand() const override;
+
+  // A mutable copy of a template, its sections bound to their decoders. Throws std::invalid_argument when a
+  // dictionary or an array holds anything but strings, dictionaries and arrays.
+  PlistValue processTemplate(const PlistValue& object);
+  // Complains in the system log about every element of a processed template that does not belong into one.
+  void printDict(const PlistValue& object) const;
+  // The state's display. The call that builds it returns nothing; every later one returns it.
+  PlistValue getDisplayFromState(PlistDictionary& state);
+
+ private:
+  PlistValue loadTemplate() const;
+
+  std::string pListName_;
+  std::unique_ptr<ClassIndex> cIndex_;  // null without template
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,17 @@
+// A decoder that asks for no records, so that its section shows what the template holds.
+#pragma once
+
+#include "LogGenerator/StateDecoder.h"
+
+namespace kelvasi {
+
+class RecordlessDecoder : public StateDecoder {
+ public:
+  using StateDecoder::StateDecoder;
+
+ protected:
+  // No record is meant for the section, so none is unknown either.
+  void decodeOther(RecordView, LogCode) override {}
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,26 @@
+// The entries of a list section while they are built. The dictionaries are used again from record to record,
+// as long as nobody else holds them, so that a list whose length does not change costs no allocation.
+#pragma once
+
+#include <cstddef>
+#include <vector>
+
+#include "LogGenerator/RowWriter.h"
+#include "Plist/PlistValue.h"
+
+namespace kelvasi {
+
+class RowList {
+ public:
+  // The next entry; it holds what is written through the result. One entry is written at a time.
+  RowWriter add();
+  void startAgain();
+
+  const PlistArray& entries() const { return entries_; }
+
+ private:
+  std::vector<PlistValue::Dictionary> pool_;
+  PlistArray entries_;
+};
+
+}  // namespace kelvasi

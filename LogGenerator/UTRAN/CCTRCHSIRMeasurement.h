@@ -1,0 +1,18 @@
+// Section "CCTRCH SIR": the signal-to-interference ratios of the coded composite channels.
+#pragma once
+
+#include "LogGenerator/ListDecoder.h"
+
+namespace kelvasi {
+
+class CCTRCHSIRMeasurement : public ListDecoder {
+ public:
+  explicit CCTRCHSIRMeasurement(const Platform& platform);
+
+ protected:
+  void addEntry(RecordView record, std::size_t place) override;
+  // A code that it did not ask for is not worth a line.
+  void decodeOther(RecordView, LogCode) override {}
+};
+
+}  // namespace kelvasi

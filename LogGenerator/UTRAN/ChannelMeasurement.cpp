@@ -1,0 +1,12 @@
+#include "LogGenerator/UTRAN/ChannelMeasurement.h"
+
+#include "LogGenerator/Exceptions.h"
+
+namespace kelvasi::utran::channelMeasurement {
+
+std::int64_t ratioOf(RecordView compositeChannel, std::size_t timeslot) {
+  if (timeslot >= timeslots) throw ArrayOutOfBoundsException();
+  return valueOf(compositeChannel.from(timeslot), firstRatio);
+}
+
+}  // namespace kelvasi::utran::channelMeasurement

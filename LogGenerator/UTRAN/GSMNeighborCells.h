@@ -1,0 +1,30 @@
+// Record 0xD00E: the GSM neighbour cells.
+#pragma once
+
+#include <array>
+
+#include "LogGenerator/EntryList.h"
+#include "LogGenerator/LogCode.h"
+
+namespace kelvasi::utran::gsmNeighborCells {
+
+inline constexpr LogCode logCode = 0xD00E;
+inline constexpr std::size_t minimumLength = 17;
+
+inline constexpr std::array layout{Field{.name = "cells", .byte = 16}};
+
+inline constexpr std::array cellLayout{
+    Field{.name = "cell identity", .byte = 0, .bit = 0, .width = 14},
+    Field{.name = "band indicator", .byte = 1, .bit = 6, .width = 1},
+    Field{.name = "BSIC valid", .byte = 1, .bit = 7, .width = 1},
+    Field{.name = "NCC", .byte = 2},
+    Field{.name = "BCC", .byte = 3},
+    Field{.name = "ARFCN", .byte = 4, .width = 16},
+    Field{.name = "RSSI", .byte = 6, .width = 16, .isSigned = true},
+};
+static_assert(inWireOrder(cellLayout));
+
+inline constexpr EntryList cells{
+    .count = fieldIn(layout, "cells"), .start = 17, .stride = 8, .layout = cellLayout};
+
+}  // namespace kelvasi::utran::gsmNeighborCells

@@ -1,0 +1,18 @@
+// Section "Neighbor Cell List": the UTRAN neighbour cells.
+#pragma once
+
+#include "LogGenerator/ListDecoder.h"
+
+namespace kelvasi {
+
+class UTRANNeighbhorMeasurements : public ListDecoder {
+ public:
+  explicit UTRANNeighbhorMeasurements(const Platform& platform);
+
+ protected:
+  void addEntry(RecordView record, std::size_t place) override;
+  // A code that it did not ask for is not worth a line.
+  void decodeOther(RecordView, LogCode) override {}
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,16 @@
+// Section "Serving Cell Info": the serving cell.
+#pragma once
+
+#include "LogGenerator/StateDecoder.h"
+
+namespace kelvasi {
+
+class UTRANServingCellInfo : public StateDecoder {
+ public:
+  explicit UTRANServingCellInfo(const Platform& platform);
+
+ protected:
+  void decodeOther(RecordView record, LogCode logCode) override;
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,17 @@
+// Whether a binary property list is well formed and within bounds.
+#pragma once
+
+#include <cstdint>
+#include <span>
+
+namespace kelvasi {
+
+constexpr char binaryPlistMagic[] = "bplist00";
+
+// True for documents within PlistLimits.h of which every object that can be reached from the top one stands
+// where the trailer says, refers to objects that exist, and is a dictionary with string keys, an array, a
+// string, an integer of 64 bits, a real, a boolean, a finite date or data. Refused besides: objects that
+// contain themselves, and strings with NUL or, in their 8-bit form, anything but UTF-8.
+bool isSafeBinaryPlist(std::span<const std::uint8_t> document);
+
+}  // namespace kelvasi

@@ -1,0 +1,86 @@
+#include <cstdlib>
+#include <string>
+
+#include "Platform/Plist/LibplistNode.h"
+
+namespace kelvasi {
+
+namespace {
+
+struct Free {
+  void operator()(void* memory) const { std::free(memory); }
+};
+
+template <typename Value, void get(plist_t, Value*)>
+Value valueOf(plist_t node) {
+  Value value{};
+  get(node, &value);
+  return value;
+}
+
+PlistValue stringFrom(plist_t node) {
+  const char* text = plist_get_string_ptr(node, nullptr);
+  return std::string(text ? text : "");
+}
+
+PlistValue dataFrom(plist_t node) {
+  std::uint64_t size = 0;
+  const auto* bytes = reinterpret_cast<const std::uint8_t*>(plist_get_data_ptr(node, &size));
+  return bytes ? Bytes(bytes, bytes + size) : Bytes();
+}
+
+PlistValue arrayFrom(plist_t node) {
+  const auto array = PlistArray::make();
+  const std::unique_ptr<void, Free> position(valueOf<plist_array_iter, plist_array_new_iter>(node));
+  for (plist_t item = nullptr;; array->append(fromLibplist(item))) {
+    plist_array_next_item(node, position.get(), &item);
+    if (!item) return array;
+  }
+}
+
+PlistValue dictionaryFrom(plist_t node) {
+  const auto dictionary = PlistDictionary::make();
+  const std::unique_ptr<void, Free> position(valueOf<plist_dict_iter, plist_dict_new_iter>(node));
+  while (true) {
+    char* key = nullptr;
+    plist_t item = nullptr;
+    plist_dict_next_item(node, position.get(), &key, &item);
+    const std::unique_ptr<char, Free> owned(key);
+    if (!item || !key) return dictionary;
+    dictionary->set(key, fromLibplist(item));
+  }
+}
+
+// The library makes its own kind of a dictionary that has but this key.
+PlistValue uidFrom(plist_t node) {
+  return PlistDictionary::make({{"CF$UID", valueOf<std::uint64_t, plist_get_uid_val>(node)}});
+}
+
+}  // namespace
+
+PlistValue fromLibplist(plist_t node) {
+  switch (plist_get_node_type(node)) {
+    case PLIST_BOOLEAN:
+      return valueOf<std::uint8_t, plist_get_bool_val>(node) != 0;
+    case PLIST_UINT:
+      return valueOf<std::uint64_t, plist_get_uint_val>(node);
+    case PLIST_REAL:
+      return valueOf<double, plist_get_real_val>(node);
+    case PLIST_STRING:
+      return stringFrom(node);
+    case PLIST_DATA:
+      return dataFrom(node);
+    case PLIST_DATE:
+      return dateFromLibplist(node);
+    case PLIST_ARRAY:
+      return arrayFrom(node);
+    case PLIST_DICT:
+      return dictionaryFrom(node);
+    case PLIST_UID:
+      return uidFrom(node);
+    default:
+      return {};
+  }
+}
+
+}  // namespace kelvasi

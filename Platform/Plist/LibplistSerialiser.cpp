@@ -1,0 +1,81 @@
+#include "Platform/Plist/LibplistSerialiser.h"
+
+#include <locale.h>
+
+#include <memory>
+#include <string_view>
+
+#include "Platform/Plist/BinaryGuard.h"
+#include "Platform/Plist/LibplistNode.h"
+#include "Platform/Plist/XmlGuard.h"
+
+namespace kelvasi {
+
+namespace {
+
+// The library reads reals as the locale writes them: under one with a decimal comma, 1.5 would be 1.
+class PlainLocale {
+ public:
+  PlainLocale() : plain_(newlocale(LC_ALL_MASK, "C", nullptr)), previous_(uselocale(plain_)) {}
+  ~PlainLocale() {
+    uselocale(previous_);
+    if (plain_) freelocale(plain_);
+  }
+  PlainLocale(const PlainLocale&) = delete;
+  PlainLocale& operator=(const PlainLocale&) = delete;
+
+ private:
+  locale_t plain_;
+  locale_t previous_;
+};
+
+LibplistNode nodeFrom(std::span<const std::uint8_t> bytes) {
+  constexpr std::string_view byteOrderMark = "\xef\xbb\xbf";
+  std::string_view text(reinterpret_cast<const char*>(bytes.data()), bytes.size());
+  plist_t node = nullptr;
+  if (isSafeBinaryPlist(bytes)) {
+    plist_from_bin(text.data(), static_cast<std::uint32_t>(text.size()), &node);
+    return LibplistNode(node);
+  }
+  if (text.starts_with(byteOrderMark)) text.remove_prefix(byteOrderMark.size());
+  if (isSafeXmlPlist(text)) plist_from_xml(text.data(), static_cast<std::uint32_t>(text.size()), &node);
+  return LibplistNode(node);
+}
+
+// A reader would take a bare carriage return for a line feed (XML 1.0, section 2.11).
+Bytes withCarriageReturnsKept(std::string_view text) {
+  constexpr std::string_view reference = "&#13;";
+  Bytes bytes;
+  bytes.reserve(text.size());
+  for (const char character : text) {
+    if (character == '\r') {
+      bytes.insert(bytes.end(), reference.begin(), reference.end());
+    } else {
+      bytes.push_back(static_cast<std::uint8_t>(character));
+    }
+  }
+  return bytes;
+}
+
+}  // namespace
+
+std::optional<PlistValue> LibplistSerialiser::parse(std::span<const std::uint8_t> bytes) const {
+  const PlainLocale locale;
+  const LibplistNode node = nodeFrom(bytes);
+  if (!node) return std::nullopt;
+  return fromLibplist(node.get());
+}
+
+std::optional<Bytes> LibplistSerialiser::serialiseXml(const PlistValue& value) const {
+  const PlainLocale locale;
+  const LibplistNode node = toLibplist(value);
+  if (!node) return std::nullopt;
+  char* text = nullptr;
+  std::uint32_t size = 0;
+  plist_to_xml(node.get(), &text, &size);
+  const std::unique_ptr<char, decltype(&plist_to_xml_free)> owned(text, &plist_to_xml_free);
+  if (!text) return std::nullopt;
+  return withCarriageReturnsKept({text, size});
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,34 @@
+// Property lists through libplist.
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <span>
+
+#include "Platform/PlistSerialiser.h"
+
+namespace kelvasi {
+
+// Reading. The document is checked as a whole before the library sees it: its bounds are those of
+// PlistLimits.h, XmlGuard.h and BinaryGuard.h say what else is refused. In what is accepted
+// - texts are UTF-8 without NUL;
+// - an integer from 2^63 to 2^64 - 1 keeps its 64 bits and so reads as a negative number;
+// - of the entries with one key the last stands, at the place of the first;
+// - a date keeps its fraction of a second, which only the binary format has.
+//
+// Writing. What is written, `parse` and every other reader takes, and yields the value again, save that
+// - a byte that is not UTF-8 and a character XML cannot hold (control characters, NUL) become U+FFFD;
+// - a date loses its fraction of a second, rounded down;
+// - the real -0.0 becomes 0.0.
+// Nothing is returned, besides for absent values, for dates outside the years 1000 to 9999, for containers
+// nested deeper than 128 levels (those that contain themselves too), and for more than 4,000,000 values or
+// 256 MiB of texts and data.
+//
+// Neither depends on the program's locale. Safe to use from several threads at once.
+class LibplistSerialiser : public PlistSerialiser {
+ public:
+  std::optional<PlistValue> parse(std::span<const std::uint8_t> bytes) const override;
+  std::optional<Bytes> serialiseXml(const PlistValue& value) const override;
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,77 @@
+#include "Platform/Plist/Utf8.h"
+
+#include <algorithm>
+
+namespace kelvasi {
+
+namespace {
+
+struct Form {
+  unsigned char mask, lead;  // a first byte has this form when byte & mask == lead
+  std::size_t length;
+  char32_t least;  // a smaller code must be written shorter
+};
+constexpr Form forms[] = {
+    {0x80, 0x00, 1, 0}, {0xe0, 0xc0, 2, 0x80}, {0xf0, 0xe0, 3, 0x800}, {0xf8, 0xf0, 4, 0x10000}};
+
+unsigned char byteAt(std::string_view text, std::size_t at) {
+  return static_cast<unsigned char>(text[at]);
+}
+
+bool isScalarValue(char32_t code) {
+  return code <= 0x10ffff && (code < 0xd800 || code > 0xdfff);
+}
+
+bool isXmlCharacter(char32_t code) {
+  return code >= 0x20 ? code != 0xfffe && code != 0xffff : code == '\t' || code == '\n' || code == '\r';
+}
+
+Utf8Character read(std::string_view text, const Form& form) {
+  if (text.size() < form.length) return {};
+  char32_t code = byteAt(text, 0) & static_cast<unsigned char>(~form.mask);
+  for (std::size_t at = 1; at < form.length; ++at) {
+    if ((byteAt(text, at) & 0xc0) != 0x80) return {};
+    code = code << 6 | (byteAt(text, at) & 0x3f);
+  }
+  if (code < form.least || !isScalarValue(code)) return {};
+  return {code, form.length};
+}
+
+// Most texts are nothing else, and need no closer look.
+std::size_t asciiPrefix(std::string_view text) {
+  const auto isOther = [](unsigned char byte) { return byte == 0 || byte >= 0x80; };
+  return static_cast<std::size_t>(std::ranges::find_if(text, isOther) - text.begin());
+}
+
+}  // namespace
+
+Utf8Character firstCharacter(std::string_view text) {
+  for (const Form& form : forms) {
+    if ((byteAt(text, 0) & form.mask) == form.lead) return read(text, form);
+  }
+  return {};
+}
+
+bool isCleanUtf8(std::string_view text) {
+  while (true) {
+    text.remove_prefix(asciiPrefix(text));
+    if (text.empty()) return true;
+    const Utf8Character character = firstCharacter(text);
+    if (!character.code || *character.code == 0) return false;
+    text.remove_prefix(character.length);
+  }
+}
+
+std::string asXmlText(std::string_view text) {
+  std::string result;
+  result.reserve(text.size());
+  while (!text.empty()) {
+    const Utf8Character character = firstCharacter(text);
+    const bool stands = character.code && isXmlCharacter(*character.code);
+    result += stands ? text.substr(0, character.length) : "\uFFFD";
+    text.remove_prefix(character.length);
+  }
+  return result;
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,23 @@
+// Property lists as bytes.
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <span>
+
+#include "Plist/PlistValue.h"
+
+namespace kelvasi {
+
+class PlistSerialiser {
+ public:
+  virtual ~PlistSerialiser() = default;
+
+  // Parses an XML or binary property list. Nothing when the bytes are not one, or are larger or nested deeper
+  // than the implementation accepts.
+  virtual std::optional<PlistValue> parse(std::span<const std::uint8_t> bytes) const = 0;
+  // An XML property list, format version 1.0. Nothing when the value, or one inside it, is absent.
+  virtual std::optional<Bytes> serialiseXml(const PlistValue& value) const = 0;
+};
+
+}  // namespace kelvasi

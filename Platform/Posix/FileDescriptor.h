@@ -1,0 +1,28 @@
+// An open file descriptor, owned, and whole transfers over it.
+#pragma once
+
+#include <cstdint>
+#include <span>
+
+namespace kelvasi {
+
+class FileDescriptor {
+ public:
+  explicit FileDescriptor(int number) : number_(number) {}  // negative: there is none
+  ~FileDescriptor() { close(); }
+  FileDescriptor(const FileDescriptor&) = delete;
+  FileDescriptor& operator=(const FileDescriptor&) = delete;
+
+  explicit operator bool() const { return number_ >= 0; }
+  int number() const { return number_; }
+  // False, with errno set, when what was written may be lost. True when there is nothing to close.
+  bool close();
+
+ private:
+  int number_;
+};
+
+// Goes on after signals and short writes until all is written. False, with errno set, on failure.
+bool writeAll(int descriptor, std::span<const std::uint8_t> bytes);
+
+}  // namespace kelvasi

@@ -1,0 +1,34 @@
+// Whole files, read and written at once.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <limits>
+#include <optional>
+#include <span>
+#include <string>
+
+#include "Plist/PlistValue.h"
+
+namespace kelvasi {
+
+// What went wrong, for people: "/tmp/a.pcap: No such file or directory". Nothing when all went well.
+using FileError = std::optional<std::string>;
+
+struct FileContents {
+  Bytes bytes;  // empty after an error
+  FileError error;
+};
+
+// Reads to the end of the file, which may be a pipe. A file of more than `limit` bytes is an error.
+FileContents readFile(const std::string& path, std::size_t limit = std::numeric_limits<std::size_t>::max());
+
+// Creates the file or overwrites what is there. After an error a part may have been written.
+FileError writeFile(const std::string& path, std::span<const std::uint8_t> bytes);
+
+// Puts a file in the place of the one of that name, if any, whose permissions it takes over. The name always
+// has a whole file, the old or the new, even if the machine stops; after an error it is the old. A symbolic
+// link is replaced, not followed.
+FileError replaceFile(const std::string& path, std::span<const std::uint8_t> bytes);
+
+}  // namespace kelvasi

@@ -1,0 +1,31 @@
+// Which lines of the system log are written.
+#pragma once
+
+#include <string>
+#include <string_view>
+
+#include "Platform/SystemLog.h"
+
+namespace kelvasi {
+
+class LogLevel {
+ public:
+  // Everything is written.
+  LogLevel() = default;
+  // From a syslog level's name, "emerg" to "debug", or number, 0 to 7. Any other text is everything and a
+  // complaint.
+  explicit LogLevel(std::string_view text);
+  // From KELVASI_LOG_LEVEL; everything where it is not set or empty.
+  static LogLevel fromEnvironment();
+
+  // A priority's level is its lowest three bits; the rest is a facility.
+  bool passes(LogPriority priority) const { return (static_cast<int>(priority) & 7) <= highest_; }
+  // For the log's first line; empty where there is nothing to complain about.
+  const std::string& complaint() const { return complaint_; }
+
+ private:
+  int highest_ = 7;
+  std::string complaint_;
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,31 @@
+// The application package as a directory of files.
+#pragma once
+
+#include <cstddef>
+#include <filesystem>
+
+#include "Platform/Resources.h"
+
+namespace kelvasi {
+
+class PackageResources : public Resources {
+ public:
+  static constexpr std::size_t largestFile = std::size_t{16} << 20;  // bytes; a larger one cannot be read
+
+  explicit PackageResources(std::filesystem::path directory = standardDirectory());
+
+  // KELVASI_RESOURCES where that is set and not empty; else the source tree's directory while it is there;
+  // else the one of the installation.
+  static std::filesystem::path standardDirectory();
+
+  std::vector<std::string> pathsOfType(std::string_view type) const override;
+  // Names and types with a slash or a NUL, empty ones and names that begin with a dot name no resource.
+  std::optional<Bytes> contents(std::string_view name, std::string_view type) const override;
+  std::optional<std::string> bundleVersion() const override;
+  std::string buildTime() const override;
+
+ private:
+  std::filesystem::path directory_;
+};
+
+}  // namespace kelvasi

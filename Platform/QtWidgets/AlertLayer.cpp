@@ -1,0 +1,73 @@
+#include "Platform/QtWidgets/AlertLayer.h"
+
+#include <QGridLayout>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QPainter>
+
+#include "Platform/QtWidgets/BarButton.h"
+#include "Platform/QtWidgets/Fonts.h"
+#include "Platform/QtWidgets/FormParts.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr int cardWidth = 280;
+constexpr double dimming = 0.4;
+
+QLabel* makeText(const QString& text, const Font& font, QWidget& parent) {
+  auto* const label = new QLabel(text, &parent);
+  label->setFont(qtFont(font));
+  label->setAlignment(Qt::AlignCenter);
+  label->setWordWrap(true);
+  label->setTextFormat(Qt::PlainText);
+  return label;
+}
+
+}  // namespace
+
+AlertLayer::AlertLayer(QWidget& parent, const AlertText& text) : Layer(parent) {
+  setAccessibleName(text.title);
+  setAccessibleDescription(text.message);
+  auto* const card = new Card(this);
+  card->setFixedWidth(cardWidth);
+  fill(*card, text);
+  auto* const layout = new QGridLayout(this);
+  layout->addWidget(card, 0, 0, Qt::AlignCenter);
+  show();
+  raise();
+  button_->setFocus();
+}
+
+void AlertLayer::fill(Card& card, const AlertText& text) {
+  button_ = new BarButton(text.button, &card);
+  button_->setDefault(true);
+  button_->setObjectName(QStringLiteral("alertButton"));
+  connect(button_, &QAbstractButton::clicked, this, [this] { close(); });
+  auto* const layout = new QVBoxLayout(&card);
+  layout->setContentsMargins(0, 20, 0, 4);
+  layout->setSpacing(6);
+  layout->addWidget(makeText(text.title, Font::boldSystem(17), card));
+  layout->addWidget(makeText(text.message, Font::system(14), card));
+  layout->addSpacing(8);
+  layout->addWidget(button_);
+}
+
+void AlertLayer::close() {
+  hide();
+  deleteLater();
+}
+
+void AlertLayer::paintEvent(QPaintEvent*) {
+  QColor dark = palette().color(QPalette::Shadow);
+  dark.setAlphaF(static_cast<float>(dimming));
+  QPainter(this).fillRect(rect(), dark);
+}
+
+void AlertLayer::keyPressEvent(QKeyEvent* event) {
+  const int key = event->key();
+  if (key == Qt::Key_Escape || key == Qt::Key_Return || key == Qt::Key_Enter) close();
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,65 @@
+#include "Platform/QtWidgets/BarButton.h"
+
+#include <QPainter>
+
+#include "Platform/QtWidgets/Fonts.h"
+#include "Platform/QtWidgets/Glyphs.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr int buttonHeight = 44;  // as much as a fingertip covers
+constexpr int margin = 10;
+constexpr double fontSize = 16;
+constexpr double pressedOpacity = 0.4;
+
+}  // namespace
+
+BarButton::BarButton(QWidget* parent) : BarButton(QString(), parent) {}
+
+BarButton::BarButton(const QString& text, QWidget* parent) : QPushButton(text, parent) {
+  setFocusPolicy(Qt::TabFocus);
+  setCursor(Qt::PointingHandCursor);
+}
+
+QFont BarButton::textFont() const {
+  return qtFont(isDefault() ? Font::boldSystem(fontSize) : Font::system(fontSize));
+}
+
+void BarButton::setBack(bool back) {
+  isBack_ = back;
+  updateGeometry();
+}
+
+int BarButton::chevronWidth() const {
+  return isBack_ ? 14 : 0;
+}
+
+QSize BarButton::sizeHint() const {
+  return {QFontMetrics(textFont()).horizontalAdvance(text()) + chevronWidth() + 2 * margin, buttonHeight};
+}
+
+QSize BarButton::minimumSizeHint() const {
+  return {buttonHeight, buttonHeight};
+}
+
+void BarButton::paintEvent(QPaintEvent*) {
+  QPainter painter(this);
+  painter.setRenderHint(QPainter::Antialiasing);
+  const QColor colour = palette().color(isEnabled() ? QPalette::Highlight : QPalette::PlaceholderText);
+  if (hasFocus()) {
+    painter.setPen(QPen(colour, 2));
+    painter.drawRoundedRect(QRectF(rect()).adjusted(3, 6, -3, -6), 7, 7);
+  }
+  if (isDown()) painter.setOpacity(pressedOpacity);
+  if (isBack_) drawGlyph(painter, Glyph::back, QRectF(margin, 0, 10, height()), colour);
+  const QRect area = rect().adjusted(margin + chevronWidth(), 0, -margin, 0);
+  painter.setPen(colour);
+  painter.setFont(textFont());
+  const Qt::Alignment alignment = (isBack_ ? Qt::AlignLeft : Qt::AlignHCenter) | Qt::AlignVCenter;
+  painter.drawText(area, static_cast<int>(alignment),
+                   painter.fontMetrics().elidedText(text(), Qt::ElideRight, area.width()));
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,30 @@
+// A button that is a text in the colour of what can be pressed: in bars, forms and alerts. The default
+// button's is bold.
+#pragma once
+
+#include <QPushButton>
+
+namespace kelvasi {
+
+class BarButton : public QPushButton {
+ public:
+  explicit BarButton(QWidget* parent = nullptr);
+  explicit BarButton(const QString& text, QWidget* parent = nullptr);
+
+  // A back button has a chevron before its text, which then ends in an ellipsis where it is too long.
+  void setBack(bool back);
+
+  QSize sizeHint() const override;
+  QSize minimumSizeHint() const override;
+
+ protected:
+  void paintEvent(QPaintEvent* event) override;
+
+ private:
+  QFont textFont() const;
+  int chevronWidth() const;
+
+  bool isBack_ = false;
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,99 @@
+#include "Platform/QtWidgets/CellWidget.h"
+
+#include <QPainter>
+#include <utility>
+
+#include "Platform/QtWidgets/Glyphs.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr double lineIndent = 10;   // where the names of panes begin
+constexpr double labelIndent = 16;  // of the one-label style
+constexpr double glyphWidth = 34;
+
+double rightInset(CellAccessory accessory) {
+  return accessory == CellAccessory::none ? 10 : glyphWidth;
+}
+
+QColor mixed(const QColor& from, const QColor& to, double share) {
+  const auto part = [&](int a, int b) { return static_cast<int>(a + (b - a) * share); };
+  return {part(from.red(), to.red()), part(from.green(), to.green()), part(from.blue(), to.blue())};
+}
+
+}  // namespace
+
+CellWidget::CellWidget(QWidget& table, CellStyle style) : QWidget(&table), style_(style) {
+  setAttribute(Qt::WA_OpaquePaintEvent);
+  setAttribute(Qt::WA_TransparentForMouseEvents);
+  textLabel_.setElided(true);
+  content_.addSubview(textLabel_);
+}
+
+void CellWidget::layOutStandard() {
+  content_.setFrame({0, 0, width() - rightInset(accessory_), static_cast<double>(height())});
+  const double indent = style_ == CellStyle::oneLabel ? labelIndent : lineIndent;
+  textLabel_.setFrame({indent, 0, content_.area.width - indent, content_.area.height});
+}
+
+void CellWidget::setAccessory(CellAccessory accessory) {
+  if (std::exchange(accessory_, accessory) != accessory) update();
+}
+
+void CellWidget::showRow(std::size_t row) {
+  if (std::exchange(row_, row) == row) return;
+  if (QtScrollView* view = scrollView()) view->scrollTo(0);
+}
+
+void CellWidget::setMark(double strength) {
+  if (std::exchange(mark_, strength) != strength) update();
+}
+
+void CellWidget::setFocusMark(bool marked) {
+  if (std::exchange(hasFocusMark_, marked) != marked) update();
+}
+
+QString CellWidget::spokenText() const {
+  QStringList texts;
+  content_.group.collectTexts(texts);
+  return texts.join(QStringLiteral(", "));
+}
+
+QColor CellWidget::ground() const {
+  return mixed(palette().color(QPalette::Base), palette().color(QPalette::AlternateBase), mark_);
+}
+
+void CellWidget::paintEvent(QPaintEvent*) {
+  QPainter painter(this);
+  painter.fillRect(rect(), ground());
+  painter.setBrush(ground());
+  painter.setPen(palette().color(QPalette::Text));
+  content_.group.paint(painter);
+  paintAccessory(painter);
+  paintLine(painter);
+  if (hasFocusMark_) paintFocus(painter);
+}
+
+void CellWidget::paintAccessory(QPainter& painter) const {
+  const QRectF area(width() - glyphWidth, 0, glyphWidth, height());
+  if (opens()) drawGlyph(painter, Glyph::disclosure, area, palette().color(QPalette::PlaceholderText));
+  if (isChecked()) drawGlyph(painter, Glyph::checkmark, area, palette().color(QPalette::Highlight));
+}
+
+// One pixel of the screen, whatever its scale.
+void CellWidget::paintLine(QPainter& painter) const {
+  const double thickness = 1 / devicePixelRatioF();
+  const double indent = style_ == CellStyle::oneLabel ? labelIndent : lineIndent;
+  painter.fillRect(QRectF(indent, height() - thickness, width() - indent, thickness),
+                   palette().color(QPalette::Mid));
+}
+
+void CellWidget::paintFocus(QPainter& painter) const {
+  painter.setRenderHint(QPainter::Antialiasing);
+  painter.setPen(QPen(palette().color(QPalette::Highlight), 2));
+  painter.setBrush(Qt::NoBrush);
+  painter.drawRoundedRect(QRectF(rect()).adjusted(2, 2, -2, -3), 6, 6);
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,38 @@
+// What forms are made of: a ground with rounded corners, the ground behind it that can be touched, and texts.
+#pragma once
+
+#include <QAbstractButton>
+#include <QFrame>
+#include <QLabel>
+
+namespace kelvasi {
+
+class Card : public QFrame {
+ public:
+  explicit Card(QWidget* parent = nullptr);
+
+ protected:
+  void paintEvent(QPaintEvent* event) override;
+};
+
+// Covers a form's background; a click on it is a touch of no other control.
+class BackgroundControl : public QAbstractButton {
+ public:
+  explicit BackgroundControl(QWidget* parent = nullptr);
+
+ protected:
+  void paintEvent(QPaintEvent* event) override;
+};
+
+class FormTitle : public QLabel {
+ public:
+  explicit FormTitle(QWidget* parent = nullptr);
+};
+
+// Above a card.
+class FormHeading : public QLabel {
+ public:
+  explicit FormHeading(QWidget* parent = nullptr);
+};
+
+}  // namespace kelvasi

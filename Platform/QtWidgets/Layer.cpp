@@ -1,0 +1,42 @@
+#include "Platform/QtWidgets/Layer.h"
+
+#include <QApplication>
+#include <QMouseEvent>
+
+namespace kelvasi {
+
+Layer::Layer(QWidget& parent) : QWidget(&parent), focusBefore_(QApplication::focusWidget()) {
+  parent.installEventFilter(this);
+  setGeometry(parent.rect());
+}
+
+Layer::~Layer() {
+  const QWidget* const now = QApplication::focusWidget();
+  if (now && !isAncestorOf(now)) return;  // another layer has it
+  QWidget* const next = focusBefore_ && focusBefore_->isVisible() ? focusBefore_.data() : parentWidget();
+  next->setFocus();
+}
+
+bool Layer::eventFilter(QObject* watched, QEvent* event) {
+  if (event->type() == QEvent::Resize && watched == parent()) setGeometry(parentWidget()->rect());
+  return QWidget::eventFilter(watched, event);
+}
+
+bool Layer::focusNextPrevChild(bool next) {
+  QWidget* const from = QApplication::focusWidget();
+  for (QWidget* widget = from ? from : this;;) {
+    widget = next ? widget->nextInFocusChain() : widget->previousInFocusChain();
+    if (widget == from || !widget) return true;
+    const bool takesTab = (widget->focusPolicy() & Qt::TabFocus) != 0;
+    if (!isAncestorOf(widget) || !takesTab || !widget->isVisible() || !widget->isEnabled()) continue;
+    widget->setFocus(next ? Qt::TabFocusReason : Qt::BacktabFocusReason);
+    return true;
+  }
+}
+
+// Nothing beneath is touched through a layer.
+void Layer::mousePressEvent(QMouseEvent* event) {
+  event->accept();
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,62 @@
+#include "Platform/QtWidgets/NavigationBar.h"
+
+#include <QPainter>
+#include <algorithm>
+
+#include "Platform/QtWidgets/BarButton.h"
+#include "Platform/QtWidgets/Fonts.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr int barHeight = 44;
+constexpr int margin = 12;
+constexpr double titleSize = 17;
+
+}  // namespace
+
+NavigationBar::NavigationBar(QWidget* parent, std::function<void()> goBack)
+    : QWidget(parent), back_(new BarButton(this)) {
+  setFixedHeight(barHeight);
+  setFont(qtFont(Font::boldSystem(titleSize)));
+  back_->setBack(true);
+  back_->setObjectName(QStringLiteral("back"));
+  back_->hide();
+  connect(back_, &QAbstractButton::clicked, this, [goBack = std::move(goBack)] { goBack(); });
+}
+
+void NavigationBar::show(const QString& title, const QString& back) {
+  if (title_ == title && back_->text() == back) return;
+  title_ = title;
+  setAccessibleName(title);
+  back_->setVisible(!back.isEmpty());
+  back_->setText(back);
+  back_->setAccessibleName(tr("Back to %1").arg(back));
+  placeBackButton();
+  update();
+}
+
+void NavigationBar::placeBackButton() {
+  back_->setGeometry(0, 0, std::min(back_->sizeHint().width(), width() / 3), barHeight);
+}
+
+void NavigationBar::resizeEvent(QResizeEvent*) {
+  placeBackButton();
+}
+
+// The title stands in the middle, unless it is so long that it would run into the button.
+void NavigationBar::paintEvent(QPaintEvent*) {
+  QPainter painter(this);
+  painter.fillRect(rect(), palette().color(QPalette::Window));
+  const double line = 1 / devicePixelRatioF();
+  painter.fillRect(QRectF(0, barHeight - line, width(), line), palette().color(QPalette::Mid));
+  const int left = back_->isHidden() ? margin : back_->width() + margin / 2;
+  const int wanted = fontMetrics().horizontalAdvance(title_);
+  const bool fitsInMiddle = (width() - wanted) / 2 >= left;
+  const QRect area = fitsInMiddle ? rect() : rect().adjusted(left, 0, -margin, 0);
+  painter.setPen(palette().color(QPalette::WindowText));
+  painter.drawText(area, Qt::AlignCenter, fontMetrics().elidedText(title_, Qt::ElideRight, area.width()));
+}
+
+}  // namespace kelvasi

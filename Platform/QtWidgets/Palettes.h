@@ -1,0 +1,16 @@
+// The viewer's colours, as palettes: every widget takes them from its own palette.
+//   Base             rows                  AlternateBase  a row that is pressed or selected
+//   Window           bars                  Light          the ground behind cards
+//   Text, WindowText texts                 PlaceholderText  texts of less weight, glyphs
+//   Mid              hairlines             Highlight      what can be pressed
+#pragma once
+
+#include <QPalette>
+
+namespace kelvasi {
+
+enum class ColourScheme { light, dark };
+
+QPalette paletteOf(ColourScheme scheme);
+
+}  // namespace kelvasi

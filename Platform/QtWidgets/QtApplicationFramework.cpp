@@ -1,0 +1,43 @@
+#include "Platform/QtWidgets/QtApplicationFramework.h"
+
+#include <signal.h>
+
+#include <QApplication>
+
+#include "Platform/Qt/QtEventLoop.h"
+
+namespace kelvasi {
+
+namespace {
+
+// Threads that Qt starts with the application leave the signals to the event loop.
+std::unique_ptr<QApplication> makeApplication(int& argumentCount, char** arguments) {
+  sigset_t ending;
+  sigset_t before;
+  ::sigemptyset(&ending);
+  for (const int signal : {SIGINT, SIGTERM}) ::sigaddset(&ending, signal);
+  ::pthread_sigmask(SIG_BLOCK, &ending, &before);
+  auto application = std::make_unique<QApplication>(argumentCount, arguments);
+  ::pthread_sigmask(SIG_SETMASK, &before, nullptr);
+  return application;
+}
+
+}  // namespace
+
+QtApplicationFramework::QtApplicationFramework(int& argumentCount, char** arguments)
+    : application_(makeApplication(argumentCount, arguments)), loop_(std::make_unique<QtEventLoop>()) {
+  QApplication::setApplicationName(QStringLiteral("Kelvasi"));
+  QApplication::setDesktopFileName(QStringLiteral("org.kelvasi.Kelvasi"));
+}
+
+QtApplicationFramework::~QtApplicationFramework() = default;
+
+void QtApplicationFramework::run(const ApplicationClasses& classes, std::string_view applicationClass,
+                                 std::string_view delegateClass) {
+  LaunchedApplication launched(classes, applicationClass, delegateClass);
+  launched.didFinishLaunching();
+  loop_->run();
+  launched.willTerminate();
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,90 @@
+#include "Platform/QtWidgets/QtNavigationStack.h"
+
+#include "Platform/QtWidgets/AlertLayer.h"
+#include "Platform/QtWidgets/ModalLayer.h"
+#include "Platform/QtWidgets/NavigationBar.h"
+#include "Platform/QtWidgets/Page.h"
+#include "Platform/QtWidgets/SlideOverlay.h"
+#include "Platform/QtWidgets/StackWidget.h"
+#include "Platform/QtWidgets/Toolbar.h"
+
+namespace kelvasi {
+
+namespace {
+
+Page& pageOf(const ViewController& controller) {
+  return dynamic_cast<Page&>(controller.body());
+}
+
+// Alerts stay above everything that comes later.
+void raiseAlerts(const QWidget& window) {
+  for (QObject* const child : window.children()) {
+    if (auto* const alert = dynamic_cast<AlertLayer*>(child)) alert->raise();
+  }
+}
+
+}  // namespace
+
+QtNavigationStack::QtNavigationStack(std::unique_ptr<ViewController> root, bool animates)
+    : NavigationStack(std::move(root)),
+      animates_(animates),
+      widget_(std::make_unique<StackWidget>([this] { popViewController(true); })),
+      view_(*widget_) {
+  widget_->toolbar().hide();
+}
+
+QtNavigationStack::~QtNavigationStack() = default;
+
+void QtNavigationStack::setToolbarHidden(bool hidden, bool) {
+  widget_->toolbar().setVisible(!hidden);
+}
+
+void QtNavigationStack::showTop(Change change, bool animated) {
+  const QRect area = widget_->slidingArea();
+  if (change == Change::none || !animated || !animates_ || !widget_->isVisible()) return swapPage();
+  SlideOverlay::Pictures pictures;
+  pictures.before = widget_->grab(area);
+  swapPage();
+  pictures.after = widget_->grab(area);
+  const auto direction =
+      change == Change::pushed ? SlideOverlay::Direction::leftwards : SlideOverlay::Direction::rightwards;
+  new SlideOverlay(*widget_, area, std::move(pictures), direction, widget_->bar().height());
+}
+
+void QtNavigationStack::swapPage() {
+  Page& page = pageOf(topViewController());
+  shown_ = &page;
+  page.setChanged([this, &page] {
+    if (shown_ == &page) showBars();
+  });
+  widget_->showPage(page.widget());
+  showBars();
+  if (!modalViewController()) page.firstFocus().setFocus();
+}
+
+void QtNavigationStack::showBars() {
+  widget_->bar().show(shown_->title(), backTitle());
+  widget_->toolbar().setItems(shown_->toolbarItems());
+}
+
+QString QtNavigationStack::backTitle() const {
+  const auto& controllers = viewControllers();
+  return controllers.size() < 2 ? QString() : pageOf(*controllers[controllers.size() - 2]).title();
+}
+
+void QtNavigationStack::showModal(ViewController& controller, bool animated) {
+  modalLayer_ = std::make_unique<ModalLayer>(*widget_->window(), pageOf(controller), animated && animates_);
+  raiseAlerts(*widget_->window());
+}
+
+void QtNavigationStack::hideModal(ViewController& controller, bool animated) {
+  QWidget& window = *widget_->window();
+  SlideOverlay::Pictures pictures;
+  if (animated && animates_) pictures.before = pageOf(controller).widget().grab();
+  modalLayer_.reset();
+  if (!pictures.before.isNull())
+    new SlideOverlay(window, window.rect(), std::move(pictures), SlideOverlay::Direction::downwards);
+  raiseAlerts(window);
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,28 @@
+// A line edit as a text field.
+#pragma once
+
+#include <QLineEdit>
+
+#include "Platform/QtWidgets/WidgetView.h"
+#include "Platform/UserInterface/TextField.h"
+
+namespace kelvasi {
+
+class QtTextField : public TextField, public HasWidget {
+ public:
+  explicit QtTextField(QLineEdit& edit);
+
+  void setFrame(const Rect& frame) override { edit_.setGeometry(wholePoints(frame)); }
+  Rect bounds() const override;
+  void setDelegate(TextFieldDelegate* delegate) override { delegate_ = delegate; }
+  std::optional<std::string> text() const override { return edit_.text().toStdString(); }
+  // The keyboard then works the form around the field.
+  void resignFirstResponder() override;
+  QWidget& widget() override { return edit_; }
+
+ private:
+  QLineEdit& edit_;
+  TextFieldDelegate* delegate_ = nullptr;
+};
+
+}  // namespace kelvasi

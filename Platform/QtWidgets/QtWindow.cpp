@@ -1,0 +1,48 @@
+#include "Platform/QtWidgets/QtWindow.h"
+
+#include <QVBoxLayout>
+
+#include "Platform/UserInterface/NavigationStack.h"
+
+namespace kelvasi {
+
+namespace {
+constexpr QSize smallest(240, 320);
+}
+
+QtWindow::QtWindow(const Rect& frame, bool fullScreen)
+    : widget_(std::make_unique<QWidget>()), isFullScreen_(fullScreen) {
+  widget_->setMinimumSize(smallest);
+  widget_->resize(wholePoints(frame).size());
+  auto* const layout = new QVBoxLayout(widget_.get());
+  layout->setContentsMargins(0, 0, 0, 0);
+}
+
+QtWindow::~QtWindow() {
+  for (QWidget* const subview : widget_->findChildren<QWidget*>(Qt::FindDirectChildrenOnly)) {
+    subview->hide();
+    subview->setParent(nullptr);
+  }
+}
+
+Rect QtWindow::bounds() const {
+  return {0, 0, static_cast<double>(widget_->width()), static_cast<double>(widget_->height())};
+}
+
+void QtWindow::addSubview(View& view) {
+  widget_->layout()->addWidget(&widgetOf(view));
+  widget_->setFocusProxy(&widgetOf(view));
+}
+
+void QtWindow::makeKeyAndVisible() {
+  widget_->layout()->activate();
+  if (root_) root_->willAppear();
+  if (isFullScreen_) {
+    widget_->showFullScreen();
+  } else {
+    widget_->show();
+  }
+  widget_->activateWindow();
+}
+
+}  // namespace kelvasi

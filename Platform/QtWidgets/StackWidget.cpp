@@ -1,0 +1,84 @@
+#include "Platform/QtWidgets/StackWidget.h"
+
+#include <QAbstractButton>
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QVBoxLayout>
+
+#include "Platform/QtWidgets/NavigationBar.h"
+#include "Platform/QtWidgets/Toolbar.h"
+
+namespace kelvasi {
+
+namespace {
+
+bool isBack(const QKeyEvent& event) {
+  switch (event.key()) {
+    case Qt::Key_Escape:
+    case Qt::Key_Backspace:
+    case Qt::Key_Back:
+      return true;
+    case Qt::Key_Left:
+      return event.modifiers().testFlag(Qt::AltModifier);
+    default:
+      return false;
+  }
+}
+
+}  // namespace
+
+StackWidget::StackWidget(std::function<void()> goBack)
+    : goBack_(std::move(goBack)),
+      bar_(new NavigationBar(this, goBack_)),
+      content_(new QWidget(this)),
+      toolbar_(new Toolbar(this)) {
+  auto* const layout = new QVBoxLayout(this);
+  layout->setContentsMargins(0, 0, 0, 0);
+  layout->setSpacing(0);
+  layout->addWidget(bar_);
+  layout->addWidget(content_, 1);
+  layout->addWidget(toolbar_);
+}
+
+void StackWidget::showPage(QWidget& page) {
+  if (page_ && page_ != &page) page_->hide();
+  page_ = &page;
+  page.setParent(content_);
+  placePage();
+  page.show();
+  setFocusProxy(&page);
+}
+
+void StackWidget::placePage() {
+  if (layout()) layout()->activate();
+  if (page_) page_->setGeometry(content_->rect());
+}
+
+QRect StackWidget::slidingArea() const {
+  return bar_->geometry().united(content_->geometry());
+}
+
+void StackWidget::resizeEvent(QResizeEvent* event) {
+  QWidget::resizeEvent(event);
+  placePage();
+}
+
+// The toolbar's coming and going changes the room for the page too.
+bool StackWidget::event(QEvent* event) {
+  const bool isHandled = QWidget::event(event);
+  if (event->type() == QEvent::LayoutRequest) placePage();
+  return isHandled;
+}
+
+void StackWidget::keyPressEvent(QKeyEvent* event) {
+  if (isBack(*event)) return goBack_();
+  QAbstractButton* const save = toolbar_->saveButton();
+  if (save && event->matches(QKeySequence::Save)) return save->click();
+  event->ignore();
+}
+
+void StackWidget::mousePressEvent(QMouseEvent* event) {
+  if (event->button() == Qt::BackButton) goBack_();
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,42 @@
+// A navigation bar, a page and a toolbar above each other.
+#pragma once
+
+#include <QPointer>
+#include <QWidget>
+#include <functional>
+
+namespace kelvasi {
+
+class NavigationBar;
+class Toolbar;
+
+class StackWidget : public QWidget {
+ public:
+  // Escape, Backspace, Alt+Left and a mouse's back button go back as the bar's button does; Ctrl+S is the
+  // toolbar's Save button.
+  explicit StackWidget(std::function<void()> goBack);
+
+  NavigationBar& bar() const { return *bar_; }
+  Toolbar& toolbar() const { return *toolbar_; }
+  // Shows `page` instead of the one before, which is hidden. Does not own it.
+  void showPage(QWidget& page);
+  // Where bar and page are.
+  QRect slidingArea() const;
+
+ protected:
+  void keyPressEvent(QKeyEvent* event) override;
+  void mousePressEvent(QMouseEvent* event) override;
+  void resizeEvent(QResizeEvent* event) override;
+  bool event(QEvent* event) override;
+
+ private:
+  void placePage();
+
+  std::function<void()> goBack_;
+  NavigationBar* bar_;  // children
+  QWidget* content_;
+  Toolbar* toolbar_;
+  QPointer<QWidget> page_;
+};
+
+}  // namespace kelvasi

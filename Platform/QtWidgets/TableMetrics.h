@@ -1,0 +1,7 @@
+#pragma once
+
+namespace kelvasi {
+
+inline constexpr int rowHeight = 50;  // points
+
+}  // namespace kelvasi

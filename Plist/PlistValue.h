@@ -1,0 +1,80 @@
+// A property-list value: a string, integer, real, boolean, data blob or date, or a handle on a shared mutable
+// dictionary or array. Copying a value copies scalars and shares containers, so that a section of a display
+// that several owners hold is one and the same container.
+#pragma once
+
+#include <concepts>
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <variant>
+#include <vector>
+
+namespace kelvasi {
+
+class PlistArray;
+class PlistDictionary;
+
+using Bytes = std::vector<std::uint8_t>;
+
+// A moment, in seconds since 1 January 1970 UTC.
+struct PlistDate {
+  double secondsSince1970 = 0;
+  bool operator==(const PlistDate&) const = default;
+};
+
+class PlistValue {
+ public:
+  using Array = std::shared_ptr<PlistArray>;
+  using Data = std::shared_ptr<const Bytes>;
+  using Dictionary = std::shared_ptr<PlistDictionary>;
+
+  PlistValue() = default;  // the absent value
+  PlistValue(std::string text) : value_(std::move(text)) {}
+  PlistValue(std::string_view text) : value_(std::string(text)) {}
+  PlistValue(const char* text) : value_(std::string(text)) {}
+  PlistValue(bool flag) : value_(flag) {}
+  template <std::integral Integer>
+  requires(!std::same_as<Integer, bool>) PlistValue(Integer number)
+      : value_(static_cast<std::int64_t>(number)) {}
+  PlistValue(double number) : value_(number) {}
+  PlistValue(PlistDate date) : value_(date) {}
+  PlistValue(Bytes bytes) : value_(std::make_shared<const Bytes>(std::move(bytes))) {}
+  PlistValue(Data data);              // a null pointer is the absent value
+  PlistValue(Dictionary dictionary);  // likewise
+  PlistValue(Array array);            // likewise
+
+  bool isAbsent() const { return std::holds_alternative<std::monostate>(value_); }
+  explicit operator bool() const { return !isAbsent(); }
+
+  // Each returns null when the value is of another kind.
+  const std::string* string() const { return std::get_if<std::string>(&value_); }
+  std::string* string() { return std::get_if<std::string>(&value_); }
+  const std::int64_t* integer() const { return std::get_if<std::int64_t>(&value_); }
+  const double* real() const { return std::get_if<double>(&value_); }
+  const bool* boolean() const { return std::get_if<bool>(&value_); }
+  const PlistDate* date() const { return std::get_if<PlistDate>(&value_); }
+  const Bytes* data() const;
+  PlistDictionary* dictionary() const;
+  PlistArray* array() const;
+
+  // The shared containers themselves; null when the value is of another kind.
+  Dictionary sharedDictionary() const;
+  Array sharedArray() const;
+
+  // The same value, its outermost container copied; nested containers stay shared. Data needs no copy: it
+  // never changes.
+  PlistValue shallowCopy() const;
+
+  // Equal kind and content, dictionaries whatever the order of their keys.
+  bool operator==(const PlistValue& other) const;
+
+ private:
+  std::variant<std::monostate, std::string, std::int64_t, double, bool, PlistDate, Data, Dictionary, Array>
+      value_;
+};
+
+}  // namespace kelvasi
+
+#include "Plist/PlistContainers.h"

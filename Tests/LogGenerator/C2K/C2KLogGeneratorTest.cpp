@@ -1,0 +1,168 @@
+#include "LogGenerator/C2K/C2KLogGenerator.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "LogGenerator/C2K/C2KLookup.h"
+#include "Telvon/Technology.h"
+#include "Tests/LogGenerator/C2K/C2KFixture.h"
+
+namespace kelvasi {
+namespace {
+
+using test::C2KFixture;
+using test::hex;
+using test::record;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+// An EV-DO active set without pilots.
+Bytes emptyActiveSet() {
+  return record(0x12B6, "", 25);
+}
+
+TEST(C2KLogGenerator, IsTheGeneratorOfItsTechnology) {
+  test::TestPlatform surroundings;
+  const auto generator =
+      LogGenerator::generatorFromTechnology(kTelvonLogChannelTechnology_Orvane_CDMA, surroundings.platform());
+  EXPECT_NE(dynamic_cast<C2KLogGenerator*>(generator.get()), nullptr);
+}
+
+TEST(C2KLogGenerator, StartCommandNamesEightCodesInThisOrder) {
+  const C2KFixture fixture({});
+  EXPECT_EQ(
+      fixture.generator.getStartCommand(),
+      PlistValue(PlistDictionary::make(
+          {{"SetState", "Streaming"},
+           {"SetOrvaneLogCodes", PlistArray::make({4234, 4483, 4498, 4790, 4508, 4509, 4734, 4943})}})));
+}
+
+TEST(C2KLogGenerator, TheFirstRequestAlreadyReturnsTheDisplay) {
+  C2KFixture fixture({"kChannel"});
+  EXPECT_EQ(fixture.generator.generateLogUsingState(fixture.state),
+            PlistValue(PlistDictionary::make({{"kChannel", ""}})));
+}
+
+TEST(C2KLogGenerator, AMessageOf12BytesDoesNothingAtAll) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  fixture.surroundings.log.clear();
+  fixture.take(hex("02 0000 B612 00000000000000"));
+  EXPECT_THAT(fixture.errors(), IsEmpty());
+  fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), Bytes{});
+}
+
+TEST(C2KLogGenerator, ARecordOf13BytesWithAnUnknownCodeDoesNothingAtAll) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  fixture.take(record(0x12B7, ""));
+  EXPECT_THAT(fixture.errors(), IsEmpty());
+  fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), Bytes{});
+}
+
+TEST(C2KLogGenerator, APrefixedRecordIsDecodedAndKeptWithoutThePrefix) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  Bytes message = hex("81 77");
+  const Bytes inner = emptyActiveSet();
+  message.insert(message.end(), inner.begin(), inner.end());
+  fixture.take(message);
+  EXPECT_EQ(fixture.text("kActiveSetPilots"), "(none)");
+  fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), inner);
+}
+
+TEST(C2KLogGenerator, AWrongLogTypeIsLoggedButNotDropped) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  fixture.take(test::with(emptyActiveSet(), 0, "07"));
+  EXPECT_THAT(fixture.errors(), ElementsAre("Invalid log type: 7. Dropping."));
+  EXPECT_EQ(fixture.text("kActiveSetPilots"), "(none)");
+}
+
+TEST(C2KLogGenerator, TheDaemonsExtraRecordsHaveOtherCodes) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  fixture.take(test::with(emptyActiveSet(), 0, "FF"));
+  EXPECT_THAT(fixture.errors(), ElementsAre("Invalid log type: ff. Dropping."));
+  EXPECT_EQ(fixture.text("kActiveSetPilots"), "");
+}
+
+TEST(C2KLogGenerator, ARecordIsKeptEvenAfterItsParserRefusedIt) {
+  C2KFixture fixture({});
+  fixture.take(record(0x12B6, "", 24));
+  fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), record(0x12B6, "", 24));
+}
+
+TEST(C2KLogGenerator, TwoTicksWithoutRecordsGiveAnEmptyIntervalTheSecondTime) {
+  C2KFixture fixture({});
+  fixture.take(emptyActiveSet());
+  fixture.generator.generateLogUsingState(fixture.state);
+  fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), Bytes{});
+  EXPECT_EQ(fixture.state.find("History")->array()->size(), 2u);
+}
+
+TEST(C2KLogGenerator, ANameUsedTwiceIsFilledInBothPlaces) {
+  C2KFixture fixture({});
+  fixture.useTemplate(
+      PlistDictionary::make({{"A", PlistDictionary::make({{"First", "kActiveSetPilots"}})},
+                             {"B", PlistDictionary::make({{"Second", "kActiveSetPilots"}})}}));
+  fixture.take(emptyActiveSet());
+  EXPECT_EQ(fixture.display(), "A=First=(none)\n\nB=Second=(none)\n\n");
+}
+
+TEST(C2KLogGenerator, TheTemplateGivesEmptyLeavesKeepsSortMarksAndSkipsTheRest) {
+  C2KFixture fixture({});
+  fixture.useTemplate(PlistDictionary::make({{"_sorted", "_sorted"},
+                                             {"Number", 7},
+                                             {"List", PlistArray::make({"kChannel"})},
+                                             {"Section", PlistDictionary::make({{"Leaf", "kChannel"}})}}));
+  fixture.surroundings.log.clear();
+  EXPECT_EQ(fixture.generator.generateLogUsingState(fixture.state),
+            PlistValue(PlistDictionary::make(
+                {{"_sorted", "_sorted"}, {"Section", PlistDictionary::make({{"Leaf", ""}})}})));
+  EXPECT_THAT(fixture.warnings(), ElementsAre("Processing the template", "Processing the template"));
+}
+
+TEST(C2KLogGenerator, TheLookupTableNamesLeafAndDictionary) {
+  C2KFixture fixture({"kChannel"});
+  fixture.generator.generateLogUsingState(fixture.state);
+  const PlistValue entries = fixture.state.find("Lookup")->dictionary()->get("kChannel");
+  ASSERT_EQ(entries.array()->size(), 1u);
+  const PlistDictionary& entry = *entries.array()->at(0).dictionary();
+  EXPECT_EQ(*entry.get("key").string(), "kChannel");
+  EXPECT_EQ(entry.get("dict").dictionary(), fixture.state.find("Display")->dictionary());
+}
+
+TEST(C2KLogGenerator, ANameThatTheTemplateDoesNotUseIsDropped) {
+  C2KFixture fixture({"kChannel"});
+  fixture.take(emptyActiveSet());
+  EXPECT_EQ(fixture.display(), "kChannel=\n");
+}
+
+TEST(C2KLogGenerator, WithoutATemplateRecordsAreKeptAndNothingIsShown) {
+  C2KFixture fixture({});
+  fixture.surroundings.resources.files.clear();
+  fixture.take(emptyActiveSet());
+  EXPECT_TRUE(fixture.generator.generateLogUsingState(fixture.state).isAbsent());
+  EXPECT_THAT(fixture.errors(),
+              ElementsAre("Cannot load C2K template for display", "Cannot load C2K template for display"));
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), emptyActiveSet());
+}
+
+TEST(SetByLookup, StopsAtAnEntryThatIsNotWhole) {
+  const auto first = PlistDictionary::make();
+  const auto last = PlistDictionary::make();
+  const PlistDictionary lookup{
+      {"name", PlistArray::make({PlistDictionary::make({{"key", "leaf"}, {"dict", first}}),
+                                 PlistDictionary::make({{"key", 7}, {"dict", last}}),
+                                 PlistDictionary::make({{"key", "leaf"}, {"dict", last}})})},
+      {"no list", "text"}};
+  setByLookup("name", "value", lookup);
+  setByLookup("no list", "value", lookup);
+  setByLookup("no such name", "value", lookup);
+  EXPECT_EQ(test::asText(first), "leaf=value\n");
+  EXPECT_TRUE(last->empty());
+}
+
+}  // namespace
+}  // namespace kelvasi

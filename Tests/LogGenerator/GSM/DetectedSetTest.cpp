@@ -1,0 +1,17 @@
+#include "LogGenerator/GSM/DetectedSet.h"
+
+#include "Tests/LogGenerator/GSM/HollowSetTest.h"
+
+namespace kelvasi {
+namespace {
+
+TEST(DetectedSet, EveryRecordEmptiesItAndNoneFillsIt) {
+  test::expectHollow<DetectedSet>();
+}
+
+TEST(DetectedSet, ARecordOf15BytesLeavesItAsItWas) {
+  test::expectShortRecordsIgnored<DetectedSet>();
+}
+
+}  // namespace
+}  // namespace kelvasi

@@ -1,0 +1,17 @@
+#include "LogGenerator/GSM/MonitoredSet.h"
+
+#include "Tests/LogGenerator/GSM/HollowSetTest.h"
+
+namespace kelvasi {
+namespace {
+
+TEST(MonitoredSet, EveryRecordEmptiesItAndNoneFillsIt) {
+  test::expectHollow<MonitoredSet>();
+}
+
+TEST(MonitoredSet, ARecordOf15BytesLeavesItAsItWas) {
+  test::expectShortRecordsIgnored<MonitoredSet>();
+}
+
+}  // namespace
+}  // namespace kelvasi

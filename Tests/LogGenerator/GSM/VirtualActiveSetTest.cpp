@@ -1,0 +1,17 @@
+#include "LogGenerator/GSM/VirtualActiveSet.h"
+
+#include "Tests/LogGenerator/GSM/HollowSetTest.h"
+
+namespace kelvasi {
+namespace {
+
+TEST(VirtualActiveSet, EveryRecordEmptiesItAndNoneFillsIt) {
+  test::expectHollow<VirtualActiveSet>();
+}
+
+TEST(VirtualActiveSet, ARecordOf15BytesLeavesItAsItWas) {
+  test::expectShortRecordsIgnored<VirtualActiveSet>();
+}
+
+}  // namespace
+}  // namespace kelvasi

@@ -1,0 +1,58 @@
+#include "LogGenerator/LastParsed.h"
+
+#include <gtest/gtest.h>
+
+#include "Tests/Support/HexBytes.h"
+
+namespace kelvasi {
+namespace {
+
+using test::hex;
+
+// What stands for the bytes is how many there are; none parse when there are none.
+struct CountingSerialiser : PlistSerialiser {
+  std::optional<PlistValue> parse(std::span<const std::uint8_t> bytes) const override {
+    ++parses;
+    if (bytes.empty()) return std::nullopt;
+    return PlistArray::make({bytes.size()});
+  }
+  std::optional<Bytes> serialiseXml(const PlistValue&) const override { return hex("AB"); }
+  mutable int parses = 0;
+};
+
+TEST(LastParsed, ParsesTheSameBytesOnce) {
+  const CountingSerialiser serialiser;
+  const LastParsed lastParsed(serialiser);
+  const auto first = lastParsed.parse(hex("01 02"));
+  const auto second = lastParsed.parse(hex("01 02"));
+  EXPECT_EQ(serialiser.parses, 1);
+  EXPECT_EQ(*first, PlistValue(PlistArray::make({2})));
+  EXPECT_EQ(first->array(), second->array());
+}
+
+TEST(LastParsed, ParsesOtherBytesAnew) {
+  const CountingSerialiser serialiser;
+  const LastParsed lastParsed(serialiser);
+  lastParsed.parse(hex("01 02"));
+  EXPECT_EQ(*lastParsed.parse(hex("01 02 03")), PlistValue(PlistArray::make({3})));
+  EXPECT_EQ(*lastParsed.parse(hex("01 03")), PlistValue(PlistArray::make({2})));
+  EXPECT_EQ(*lastParsed.parse(hex("01 02")), PlistValue(PlistArray::make({2})));
+  EXPECT_EQ(serialiser.parses, 4);
+}
+
+TEST(LastParsed, RemembersThatBytesDidNotParse) {
+  const CountingSerialiser serialiser;
+  const LastParsed lastParsed(serialiser);
+  EXPECT_FALSE(lastParsed.parse({}));
+  EXPECT_FALSE(lastParsed.parse({}));
+  EXPECT_EQ(serialiser.parses, 1);
+  EXPECT_TRUE(lastParsed.parse(hex("01")));
+}
+
+TEST(LastParsed, SerialisesThroughWhatItWasGiven) {
+  const CountingSerialiser serialiser;
+  EXPECT_EQ(LastParsed(serialiser).serialiseXml("text"), hex("AB"));
+}
+
+}  // namespace
+}  // namespace kelvasi

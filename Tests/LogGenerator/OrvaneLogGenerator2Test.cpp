@@ -1,0 +1,227 @@
+#include "LogGenerator/OrvaneLogGenerator2.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "Tests/Support/HexBytes.h"
+#include "Tests/Support/TestPlatform.h"
+
+namespace kelvasi {
+namespace {
+
+using test::hex;
+using test::record;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+constexpr std::array<LogCode, 2> wantedCodes{0xB0C0, 0xFF0001};
+
+// Notes what it is given: one row per log code, with the record's length.
+class Recorder : public Base {
+ public:
+  using Base::Base;
+  std::string_view getSectionName() const override { return "Recorded"; }
+  std::span<const LogCode> getLogCodeArray() const override { return wantedCodes; }
+  void updateWithData(RecordView view, LogCode logCode) override {
+    if (sectionRows()) sectionRows()->setText(std::to_string(logCode), std::to_string(view.size()));
+  }
+};
+
+class RecorderIndex : public ClassIndex {
+ public:
+  using ClassIndex::ClassIndex;
+  ~RecorderIndex() override { deallocWith("Deallocing RecorderIndex"); }
+  Recorder& recorder = create<Recorder>();
+};
+
+struct Fixture {
+  explicit Fixture(PlistValue displayTemplate) {
+    if (displayTemplate)
+      surroundings.resources.files["T.plist"] = surroundings.plists.standFor(displayTemplate);
+  }
+  void take(const Bytes& message) { generator.updateState(state, message); }
+  PlistValue tick() { return generator.generateLogUsingState(state); }
+
+  test::TestPlatform surroundings;
+  OrvaneLogGenerator2 generator{surroundings.platform(), "T",
+                                std::make_unique<RecorderIndex>(surroundings.platform())};
+  PlistDictionary state;
+};
+
+PlistValue simpleTemplate() {
+  return PlistDictionary::make({{"Recorded", PlistDictionary::make()}, {"Label", "text"}});
+}
+
+PlistValue displayWith(PlistValue rows) {
+  return PlistDictionary::make({{"Recorded", std::move(rows)}, {"Label", "text"}});
+}
+
+TEST(OrvaneLogGenerator2, TheFirstTickWithoutAMessageReturnsNothingTheSecondTheDisplay) {
+  Fixture fixture(simpleTemplate());
+  EXPECT_TRUE(fixture.tick().isAbsent());
+  EXPECT_EQ(fixture.tick(), displayWith(PlistDictionary::make()));
+}
+
+TEST(OrvaneLogGenerator2, AMessageBeforeTheFirstTickBuildsTheDisplay) {
+  Fixture fixture(simpleTemplate());
+  fixture.take(record(0xB0C0, "", 20));
+  EXPECT_EQ(fixture.tick(), displayWith(PlistDictionary::make({{"45248", "20"}})));
+}
+
+TEST(OrvaneLogGenerator2, DispatchesByEffectiveCodeAndWithoutThePrefix) {
+  Fixture fixture(simpleTemplate());
+  fixture.take(hex("FF 0000 0100 0000000000000000"));
+  fixture.take(hex("01 0000 0100 0000000000000000"));
+  fixture.take(hex("8100 01 0000 C0B0 0000000000000000"));
+  EXPECT_EQ(fixture.tick(), displayWith(PlistDictionary::make({{"16711681", "13"}, {"45248", "13"}})));
+}
+
+TEST(OrvaneLogGenerator2, APrefixedMessageOf13BytesIsDispatchedAsARecordOf11) {
+  Fixture fixture(simpleTemplate());
+  fixture.take(hex("8100 01 0000 C0B0 000000000000"));
+  EXPECT_EQ(fixture.tick(), displayWith(PlistDictionary::make({{"45248", "11"}})));
+}
+
+TEST(OrvaneLogGenerator2, AMessageOf12BytesIsIgnoredWithoutALine) {
+  Fixture fixture(simpleTemplate());
+  fixture.surroundings.log.clear();
+  fixture.take(hex("01 0000 C0B0 00000000000000"));
+  EXPECT_THAT(fixture.surroundings.log.errors(), IsEmpty());
+  EXPECT_EQ(fixture.tick(), displayWith(PlistDictionary::make()));
+}
+
+TEST(OrvaneLogGenerator2, AnInvalidLogTypeIsLoggedAndDropped) {
+  Fixture fixture(simpleTemplate());
+  fixture.surroundings.log.clear();
+  fixture.take(hex("FE 0000 C0B0 0000000000000000"));
+  EXPECT_THAT(fixture.surroundings.log.errors(), ElementsAre("Invalid log type: fe. Dropping."));
+  EXPECT_EQ(fixture.tick(), displayWith(PlistDictionary::make()));
+}
+
+TEST(OrvaneLogGenerator2, EveryMessageIsKeptAsReceivedForTheInterval) {
+  Fixture fixture(simpleTemplate());
+  fixture.take(hex("02 AA"));
+  fixture.take(hex("8100 01 0000 C0B0 0000000000000000"));
+  fixture.tick();
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), hex("02 AA 8100 01 0000 C0B0 0000000000000000"));
+}
+
+TEST(OrvaneLogGenerator2, ATickWithoutMessagesStoresAnEmptyBlob) {
+  Fixture fixture(simpleTemplate());
+  fixture.take(hex("02 AA"));
+  fixture.tick();
+  fixture.tick();
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), Bytes{});
+}
+
+TEST(OrvaneLogGenerator2, EachTickAddsAHistoryEntry) {
+  Fixture fixture(simpleTemplate());
+  fixture.take(hex("02 AA"));
+  fixture.tick();
+  fixture.tick();
+  const PlistArray& history = *fixture.state.find("History")->array();
+  ASSERT_EQ(history.size(), 2u);
+  EXPECT_EQ(*history.at(0).dictionary()->get("DisplayState").data(), hex("02 AA"));
+  EXPECT_EQ(history.at(0).dictionary()->size(), 5u);
+}
+
+TEST(OrvaneLogGenerator2, StartCommandSplitsTheCodes) {
+  const Fixture fixture(simpleTemplate());
+  EXPECT_EQ(fixture.generator.getStartCommand(),
+            PlistValue(PlistDictionary::make({{"SetState", "Streaming"},
+                                              {"SetOrvaneLogCodes", PlistArray::make({45248})},
+                                              {"SetTelvonExtraCodes", PlistArray::make({1})}})));
+}
+
+TEST(OrvaneLogGenerator2, ASectionWithoutADecoderStaysAsTheTemplateHasIt) {
+  const PlistValue rows = PlistDictionary::make({{"Static", "text"}, {"List", PlistArray::make({"a", "b"})}});
+  Fixture fixture(PlistDictionary::make({{"Recorded", PlistDictionary::make()}, {"Other", rows}}));
+  fixture.take(record(0xB0C0, ""));
+  EXPECT_EQ(fixture.tick().dictionary()->get("Other"), rows);
+}
+
+TEST(OrvaneLogGenerator2, InitialRowsShowUntilTheDecoderWritesThem) {
+  Fixture fixture(PlistDictionary::make({{"Recorded", PlistDictionary::make({{"45248", "none yet"}})}}));
+  fixture.tick();
+  EXPECT_EQ(*fixture.tick().dictionary()->get("Recorded").dictionary()->get("45248").string(), "none yet");
+  fixture.take(record(0xB0C0, ""));
+  EXPECT_EQ(*fixture.tick().dictionary()->get("Recorded").dictionary()->get("45248").string(), "13");
+}
+
+TEST(OrvaneLogGenerator2, ASectionThatOccursTwiceBindsItsLastOccurrence) {
+  Fixture fixture(
+      PlistDictionary::make({{"A", PlistDictionary::make({{"Recorded", PlistDictionary::make()}})},
+                             {"B", PlistDictionary::make({{"Recorded", PlistDictionary::make()}})}}));
+  fixture.take(record(0xB0C0, ""));
+  const PlistValue display = fixture.tick();
+  EXPECT_TRUE(display.dictionary()->get("A").dictionary()->get("Recorded").dictionary()->empty());
+  EXPECT_EQ(display.dictionary()->get("B").dictionary()->get("Recorded").dictionary()->size(), 1u);
+}
+
+TEST(OrvaneLogGenerator2, TheTemplateItselfIsNotWrittenTo) {
+  Fixture fixture(simpleTemplate());
+  fixture.take(record(0xB0C0, ""));
+  EXPECT_EQ(*fixture.state.find("Template"), simpleTemplate());
+}
+
+TEST(OrvaneLogGenerator2, WithoutATemplateEveryMessageAndTickTriesAgain) {
+  Fixture fixture{PlistValue()};
+  fixture.surroundings.log.clear();
+  fixture.take(record(0xB0C0, ""));
+  EXPECT_TRUE(fixture.tick().isAbsent());
+  EXPECT_THAT(fixture.surroundings.log.errors(),
+              ElementsAre("Cannot load template for display", "Cannot load template for display"));
+  EXPECT_EQ(fixture.state.find("Display"), nullptr);
+  fixture.surroundings.resources.files["T.plist"] = fixture.surroundings.plists.standFor(simpleTemplate());
+  fixture.take(record(0xB0C0, ""));
+  EXPECT_EQ(fixture.tick(), displayWith(PlistDictionary::make({{"45248", "13"}})));
+}
+
+TEST(OrvaneLogGenerator2, ATemplateWhoseRootIsNoDictionaryCannotBeLoaded) {
+  Fixture fixture(PlistArray::make());
+  fixture.surroundings.log.clear();
+  fixture.tick();
+  EXPECT_THAT(fixture.surroundings.log.errors(), ElementsAre("Cannot load template for display"));
+}
+
+TEST(OrvaneLogGenerator2, AValueThatDoesNotBelongIntoATemplateCannotBeStored) {
+  Fixture fixture(PlistDictionary::make({{"Number", 7}}));
+  fixture.surroundings.log.clear();
+  EXPECT_THROW(fixture.tick(), std::invalid_argument);
+  EXPECT_THAT(fixture.surroundings.log.errors(), ElementsAre("Received an object of unknown type"));
+  EXPECT_EQ(fixture.surroundings.log.warnings().back(), "Processing the template");
+}
+
+TEST(OrvaneLogGenerator2, PrintDictComplainsOfEachElementThatDoesNotBelong) {
+  Fixture fixture(simpleTemplate());
+  fixture.surroundings.log.clear();
+  fixture.generator.printDict(
+      PlistDictionary::make({{"a", 1}, {"b", PlistArray::make({"text", true})}, {"c", "text"}}));
+  EXPECT_THAT(fixture.surroundings.log.errors(),
+              ElementsAre("Received an object of unknown type", "Received an object of unknown type"));
+}
+
+TEST(OrvaneLogGenerator2, ANewStateBuildsANewDisplayAndBindsTheDecodersToIt) {
+  Fixture fixture(simpleTemplate());
+  fixture.take(record(0xB0C0, ""));
+  PlistDictionary second;
+  fixture.generator.updateState(second, record(0xFF0001, ""));
+  EXPECT_EQ(fixture.tick(), displayWith(PlistDictionary::make({{"45248", "13"}})));
+  EXPECT_EQ(fixture.generator.generateLogUsingState(second),
+            displayWith(PlistDictionary::make({{"16711681", "13"}})));
+}
+
+TEST(OrvaneLogGenerator2, WithoutDecodersItShowsNothingEvenWhereATemplateIsThere) {
+  struct Bare : OrvaneLogGenerator2 {
+    explicit Bare(const Platform& platform) : OrvaneLogGenerator2(platform) {}
+  };
+  test::TestPlatform surroundings;
+  Bare generator(surroundings.platform());
+  PlistDictionary state{{"Template", simpleTemplate()}};
+  generator.updateState(state, record(0xB0C0, ""));
+  EXPECT_TRUE(generator.generateLogUsingState(state).isAbsent());
+  EXPECT_EQ(state.find("Display"), nullptr);
+}
+
+}  // namespace
+}  // namespace kelvasi

@@ -1,0 +1,152 @@
+#include <gtest/gtest.h>
+
+#include <limits>
+
+#include "Platform/Plist/LibplistSerialiser.h"
+#include "Tests/Platform/Plist/BinaryDocument.h"
+#include "Tests/Platform/Plist/PlistSamples.h"
+
+namespace kelvasi {
+namespace {
+
+using testing::BinaryDocument;
+using testing::bytesOf;
+using testing::canonical;
+using testing::inArrays;
+using testing::xmlPlist;
+
+std::optional<PlistValue> parse(std::span<const std::uint8_t> bytes) {
+  return LibplistSerialiser().parse(bytes);
+}
+
+// The absent value when the document is refused.
+PlistValue xml(std::string_view body) {
+  const auto value = parse(bytesOf(xmlPlist(body)));
+  return value ? *value : PlistValue();
+}
+
+PlistValue binary(const Bytes& object) {
+  const auto value = parse(BinaryDocument().add(object).bytes());
+  return value ? *value : PlistValue();
+}
+
+TEST(Parse, XmlScalars) {
+  EXPECT_EQ(xml("<string>a &lt;&amp;&#233;&gt;</string>"), PlistValue("a <&é>"));
+  EXPECT_EQ(xml("<string/>"), PlistValue(""));
+  EXPECT_EQ(xml("<integer>-5</integer>"), PlistValue(-5));
+  EXPECT_EQ(xml("<integer>0x10</integer>"), PlistValue(16));
+  EXPECT_EQ(xml("<real>-95.25</real>"), PlistValue(-95.25));
+  EXPECT_EQ(xml("<true/>"), PlistValue(true));
+  EXPECT_EQ(xml("<false/>"), PlistValue(false));
+  EXPECT_EQ(xml("<data>\n\tAAH/\n</data>"), PlistValue(Bytes{0, 1, 255}));
+  EXPECT_EQ(xml("<data/>"), PlistValue(Bytes{}));
+  EXPECT_EQ(xml("<date>2024-03-05T14:07:09Z</date>"), PlistValue(PlistDate{1709647629}));
+}
+
+TEST(Parse, DatesFarFromNow) {
+  EXPECT_EQ(xml("<date>2100-01-01T00:00:00Z</date>"), PlistValue(PlistDate{4102444800}));
+  EXPECT_EQ(xml("<date>1601-01-01T00:00:00Z</date>"), PlistValue(PlistDate{-11644473600}));
+}
+
+TEST(Parse, TextIsTakenAsItStands) {
+  EXPECT_EQ(xml("<string>  a\n\tb  </string>"), PlistValue("  a\n\tb  "));
+  EXPECT_EQ(xml("<string>a<!-- no -->b<![CDATA[<&]]></string>"), PlistValue("ab<&"));
+  EXPECT_EQ(xml("<string>a\x01&#2;b</string>"), PlistValue("a\x01\x02"
+                                                           "b"));
+}
+
+TEST(Parse, XmlContainersInStoredOrder) {
+  EXPECT_EQ(canonical(xml("<dict><key>b</key><array><true/><string>x</string></array>"
+                          "<key>a</key><dict/><key></key><array/></dict>")),
+            "{s62=[true,s78,],s61={},s=[],}");
+}
+
+TEST(Parse, TheLastOfEqualKeysStandsAtThePlaceOfTheFirst) {
+  EXPECT_EQ(canonical(xml("<dict><key>a</key><integer>1</integer><key>b</key><integer>2</integer>"
+                          "<key>a</key><integer>3</integer></dict>")),
+            "{s61=i3,s62=i2,}");
+  const auto document = BinaryDocument().addDictionary({1, 2, 1, 3, 4, 5}).addText("a").addText("b");
+  EXPECT_EQ(canonical(*parse(BinaryDocument(document).add({0x10, 1}).add({0x10, 2}).add({0x10, 3}).bytes())),
+            "{s61=i3,s62=i2,}");
+}
+
+TEST(Parse, BinaryScalars) {
+  EXPECT_EQ(binary({0x08}), PlistValue(false));
+  EXPECT_EQ(binary({0x09}), PlistValue(true));
+  EXPECT_EQ(binary({0x10, 0xff}), PlistValue(255));
+  EXPECT_EQ(binary({0x11, 0x12, 0x34}), PlistValue(0x1234));
+  EXPECT_EQ(binary({0x12, 0xff, 0xff, 0xff, 0xff}), PlistValue(4294967295));
+  EXPECT_EQ(binary({0x13, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xfe}), PlistValue(-2));
+  EXPECT_EQ(binary({0x22, 0x3f, 0xc0, 0, 0}), PlistValue(1.5));
+  EXPECT_EQ(binary({0x23, 0xbf, 0xf8, 0, 0, 0, 0, 0, 0}), PlistValue(-1.5));
+  EXPECT_EQ(binary({0x43, 0, 1, 255}), PlistValue(Bytes{0, 1, 255}));
+  EXPECT_EQ(binary({0x40}), PlistValue(Bytes{}));
+  EXPECT_EQ(binary({0x50}), PlistValue(""));
+  EXPECT_EQ(binary({0x52, 'h', 'i'}), PlistValue("hi"));
+  EXPECT_EQ(binary({0x63, 0x00, 0xe9, 0xd8, 0x3d, 0xde, 0x00}), PlistValue("é\U0001F600"));
+}
+
+TEST(Parse, BinaryDatesKeepTheirFraction) {
+  EXPECT_EQ(binary({0x33, 0x3f, 0xf8, 0, 0, 0, 0, 0, 0}), PlistValue(PlistDate{978307201.5}));
+  EXPECT_EQ(binary({0x33, 0xbf, 0xf8, 0, 0, 0, 0, 0, 0}), PlistValue(PlistDate{978307198.5}));
+  EXPECT_EQ(binary({0x33, 0x42, 0x4d, 0x62, 0xd2, 0x3c, 0x7f, 0x80, 0}), PlistValue(PlistDate{253402300799}));
+}
+
+TEST(Parse, IntegersBeyondTheSignedOnesKeepTheirBits) {
+  EXPECT_EQ(xml("<integer>18446744073709551615</integer>"), PlistValue(-1));
+  EXPECT_EQ(binary({0x14, 0, 0, 0, 0, 0, 0, 0, 0, 0x80, 0, 0, 0, 0, 0, 0, 0}),
+            PlistValue(std::numeric_limits<std::int64_t>::min()));
+}
+
+TEST(Parse, BinaryContainersShareTheirObjects) {
+  EXPECT_EQ(
+      canonical(*parse(
+          BinaryDocument().addDictionary({1, 2, 3, 3}).addText("b").addText("a").addArray({1, 1}).bytes())),
+      "{s62=[s62,s62,],s61=[s62,s62,],}");
+}
+
+TEST(Parse, ADictionaryWithAReservedKeyIsADictionary) {
+  EXPECT_EQ(canonical(xml("<dict><key>CF$UID</key><integer>7</integer></dict>")), "{s434624554944=i7,}");
+  EXPECT_EQ(canonical(xml("<dict><key>CF$UID</key><integer>-7</integer></dict>")), "{s434624554944=i-7,}");
+  EXPECT_EQ(canonical(xml("<dict><key>CF$UID</key><string>7</string></dict>")), "{s434624554944=s37,}");
+}
+
+TEST(Parse, AByteOrderMarkIsSkipped) {
+  EXPECT_EQ(parse(bytesOf("\xef\xbb\xbf" + xmlPlist("<true/>"))), PlistValue(true));
+}
+
+TEST(Parse, RefusesEverythingElse) {
+  for (const std::string_view text : {"", "x", "<", "b", "\xef\xbb\xbf", "bplist00", "{\"a\":1}",
+                                      "{ a = 1; }", "[1]", "(a)", "<?xml version=\"1.0\"?>", "\"text\""}) {
+    EXPECT_EQ(parse(bytesOf(text)), std::nullopt) << text;
+  }
+}
+
+TEST(Parse, RefusesEveryCutOfADocument) {
+  const std::string document = xmlPlist("<dict><key>a</key><data>AAH/</data></dict>");
+  ASSERT_TRUE(parse(bytesOf(document)));
+  for (std::size_t size = 0; size + 1 < document.size(); ++size) {  // the last byte is a line feed
+    EXPECT_EQ(parse(bytesOf(document.substr(0, size))), std::nullopt) << size;
+  }
+}
+
+TEST(Parse, NestingIsBoundedInBothFormats) {
+  EXPECT_TRUE(parse(bytesOf(xmlPlist(inArrays(128)))));
+  EXPECT_FALSE(parse(bytesOf(xmlPlist(inArrays(129)))));
+  EXPECT_FALSE(parse(bytesOf(xmlPlist(inArrays(200'000)))));
+  EXPECT_FALSE(parse(BinaryDocument().addArray({0}).bytes()));
+}
+
+TEST(Parse, TakesManyEntriesAndElements) {
+  std::string body;
+  for (int number = 0; number < 10'000; ++number) {
+    body += "<key>" + std::to_string(number) + "</key><integer>" + std::to_string(number) + "</integer>";
+  }
+  const PlistValue value = xml("<dict>" + body + "</dict>");
+  ASSERT_EQ(value.dictionary()->size(), 10'000u);
+  EXPECT_EQ(value.dictionary()->get("9999"), PlistValue(9999));
+  EXPECT_EQ(std::next(value.dictionary()->begin(), 777)->first, "777");
+}
+
+}  // namespace
+}  // namespace kelvasi

@@ -1,0 +1,151 @@
+#include "Platform/Posix/Files.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+#include <pthread.h>
+#include <sys/resource.h>
+#include <sys/stat.h>
+
+#include <csignal>
+#include <fstream>
+#include <numeric>
+#include <thread>
+
+#include "Tests/Platform/Posix/Surroundings.h"
+
+namespace kelvasi {
+namespace {
+
+using ::testing::ElementsAre;
+using testing::TemporaryDirectory;
+
+Bytes manyBytes(std::size_t count) {
+  Bytes bytes(count);
+  std::iota(bytes.begin(), bytes.end(), std::uint8_t{1});
+  return bytes;
+}
+
+std::vector<std::string> namesIn(const TemporaryDirectory& directory) {
+  std::vector<std::string> names;
+  for (const auto& entry : std::filesystem::directory_iterator(directory.path())) {
+    names.push_back(entry.path().filename());
+  }
+  return names;
+}
+
+// Files of this process end at `bytes`; a write beyond is cut short, the next one fails.
+class FileSizeLimit {
+ public:
+  explicit FileSizeLimit(rlim_t bytes) : signal_(std::signal(SIGXFSZ, SIG_IGN)) {
+    ::getrlimit(RLIMIT_FSIZE, &before_);
+    const rlimit limit{bytes, before_.rlim_max};
+    ::setrlimit(RLIMIT_FSIZE, &limit);
+  }
+  ~FileSizeLimit() {
+    ::setrlimit(RLIMIT_FSIZE, &before_);
+    std::signal(SIGXFSZ, signal_);
+  }
+
+ private:
+  rlimit before_{};
+  void (*signal_)(int);
+};
+
+class FilesTest : public ::testing::Test {
+ protected:
+  const TemporaryDirectory directory;
+  const std::string path = directory.file("file");
+};
+
+TEST_F(FilesTest, WhatIsWrittenIsRead) {
+  const Bytes bytes = manyBytes(200'000);
+  EXPECT_EQ(writeFile(path, bytes), std::nullopt);
+  EXPECT_EQ(readFile(path).bytes, bytes);
+  EXPECT_EQ(writeFile(path, Bytes{7}), std::nullopt);
+  EXPECT_EQ(readFile(path).bytes, Bytes{7});
+  EXPECT_EQ(writeFile(path, {}), std::nullopt);
+  EXPECT_EQ(readFile(path).bytes, Bytes());
+}
+
+TEST_F(FilesTest, ErrorsNameTheFileAndTheReason) {
+  EXPECT_EQ(readFile(path).error, path + ": No such file or directory");
+  EXPECT_EQ(readFile(directory.path()).error, directory.path().native() + ": Is a directory");
+  EXPECT_EQ(writeFile(directory.file("none/file"), {}),
+            directory.file("none/file: No such file or directory"));
+  EXPECT_EQ(replaceFile(directory.file("none/file"), {}),
+            directory.file("none/file: No such file or directory"));
+  EXPECT_EQ(writeFile("/dev/full", Bytes{1}), "/dev/full: No space left on device");
+}
+
+TEST_F(FilesTest, ReadsUpToTheLimit) {
+  writeFile(path, manyBytes(100));
+  EXPECT_EQ(readFile(path, 100).bytes.size(), 100u);
+  EXPECT_EQ(readFile(path, 99).error, path + ": Larger than 99 bytes");
+  EXPECT_EQ(readFile(path, 99).bytes, Bytes());
+}
+
+TEST_F(FilesTest, AWriteCutShortIsAnError) {
+  const FileSizeLimit limit(1000);
+  EXPECT_EQ(writeFile(path, manyBytes(2000)), path + ": File too large");
+}
+
+TEST_F(FilesTest, SignalsNeitherCutAWriteShortNorFailIt) {
+  struct sigaction quiet {
+  }, before{};
+  quiet.sa_handler = [](int) {};
+  ::sigaction(SIGUSR1, &quiet, &before);  // without SA_RESTART
+  ASSERT_EQ(::mkfifo(path.c_str(), 0600), 0);
+  const Bytes bytes = manyBytes(4'000'000);
+  FileError error;
+  std::thread writer([&] { error = writeFile(path, bytes); });
+  std::ifstream pipe(path, std::ios::binary);
+  Bytes received;
+  for (char block[4096]; pipe.read(block, sizeof block) || pipe.gcount() > 0;) {
+    received.insert(received.end(), block, block + pipe.gcount());
+    ::pthread_kill(writer.native_handle(), SIGUSR1);
+  }
+  writer.join();
+  ::sigaction(SIGUSR1, &before, nullptr);
+  EXPECT_EQ(error, std::nullopt);
+  EXPECT_EQ(received.size(), bytes.size());
+  EXPECT_TRUE(received == bytes);
+}
+
+TEST_F(FilesTest, ReplacesAFileAndLeavesNothingElse) {
+  writeFile(path, manyBytes(10));
+  EXPECT_EQ(replaceFile(path, Bytes{1, 2}), std::nullopt);
+  EXPECT_EQ(readFile(path).bytes, (Bytes{1, 2}));
+  EXPECT_THAT(namesIn(directory), ElementsAre("file"));
+}
+
+TEST_F(FilesTest, AReplacementThatFailsLeavesTheOldFileAndNothingElse) {
+  writeFile(path, manyBytes(10));
+  const FileSizeLimit limit(1000);
+  EXPECT_EQ(replaceFile(path, manyBytes(2000)), path + ": File too large");
+  EXPECT_EQ(readFile(path).bytes, manyBytes(10));
+  EXPECT_THAT(namesIn(directory), ElementsAre("file"));
+}
+
+TEST_F(FilesTest, AReplacementKeepsThePermissions) {
+  writeFile(path, {});
+  std::filesystem::permissions(path, std::filesystem::perms(0640));
+  EXPECT_EQ(replaceFile(path, Bytes{1}), std::nullopt);
+  EXPECT_EQ(std::filesystem::status(path).permissions(), std::filesystem::perms(0640));
+}
+
+TEST_F(FilesTest, ANewFileHasThePermissionsTheUserGivesNewFiles) {
+  const mode_t before = ::umask(027);
+  EXPECT_EQ(replaceFile(path, Bytes{1}), std::nullopt);
+  ::umask(before);
+  EXPECT_EQ(std::filesystem::status(path).permissions(), std::filesystem::perms(0640));
+}
+
+TEST_F(FilesTest, AFileLeftOverUnderTheTemporaryNameIsNotTouched) {
+  const std::string leftOver = path + "." + std::to_string(::getpid()) + ".0";
+  writeFile(leftOver, Bytes{9});
+  EXPECT_EQ(replaceFile(path, Bytes{1}), std::nullopt);
+  EXPECT_EQ(readFile(leftOver).bytes, Bytes{9});
+}
+
+}  // namespace
+}  // namespace kelvasi

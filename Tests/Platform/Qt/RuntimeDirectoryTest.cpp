@@ -1,0 +1,125 @@
+#include "Platform/Qt/RuntimeDirectory.h"
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <fstream>
+
+#include "Tests/Platform/Qt/PortTest.h"
+
+namespace kelvasi::test {
+namespace {
+
+using testing::HasSubstr;
+
+class RuntimeDirectoryTest : public PortTest {
+ protected:
+  // The only error line when the directory is refused; "(opened)" otherwise.
+  std::string refusalOf(const std::string& path) {
+    ::setenv("TELVON_RUNTIME_DIR", path.c_str(), 1);
+    log.clear();
+    if (RuntimeDirectory::open(log)) return "(opened)";
+    return log.errors().size() == 1 ? log.errors().front() : "(not one line)";
+  }
+  std::string inside(const char* name) const { return directory + "/" + name; }
+
+  // Likewise of a port name.
+  std::string refusalOfName(const std::string& name) {
+    log.clear();
+    if (RuntimeDirectory::open(log)->addressOf(name, log)) return "(usable)";
+    return log.errors().size() == 1 ? log.errors().front() : "(not one line)";
+  }
+};
+
+TEST_F(RuntimeDirectoryTest, IsMadeForTheUserAlone) {
+  EXPECT_EQ(refusalOf(inside("new")), "(opened)");
+  struct stat made {};
+  ASSERT_EQ(::stat(inside("new").c_str(), &made), 0);
+  EXPECT_EQ(made.st_mode & 07777, 0700u);
+}
+
+TEST_F(RuntimeDirectoryTest, IsFoundAgain) {
+  EXPECT_EQ(refusalOf(directory), "(opened)");
+  EXPECT_EQ(refusalOf(directory + "/"), "(opened)");
+}
+
+TEST_F(RuntimeDirectoryTest, ComesFromTheUsersRuntimeDirectoryOtherwise) {
+  ::setenv("TELVON_RUNTIME_DIR", "", 1);
+  ::setenv("XDG_RUNTIME_DIR", directory.c_str(), 1);
+  const auto opened = RuntimeDirectory::open(log);
+  ::unsetenv("XDG_RUNTIME_DIR");
+  ASSERT_TRUE(opened);
+  EXPECT_EQ(opened->path(), inside("telvon"));
+}
+
+TEST_F(RuntimeDirectoryTest, IsRefusedWhenNobodySaysWhere) {
+  ::unsetenv("XDG_RUNTIME_DIR");
+  EXPECT_EQ(refusalOf(""),
+            "Runtime directory \"\" refused: neither TELVON_RUNTIME_DIR nor XDG_RUNTIME_DIR is set");
+}
+
+TEST_F(RuntimeDirectoryTest, IsRefusedWhenOthersCanEnter) {
+  for (const mode_t mode : {0755u, 0701u, 0710u, 0777u}) {
+    ::chmod(directory.c_str(), mode);
+    EXPECT_THAT(refusalOf(directory), HasSubstr("its mode is not 0700"));
+  }
+  ::chmod(directory.c_str(), 0700);
+}
+
+TEST_F(RuntimeDirectoryTest, IsRefusedWhenItIsASymbolicLink) {
+  std::filesystem::create_directory(inside("real"));
+  ::chmod(inside("real").c_str(), 0700);
+  std::filesystem::create_symlink("real", inside("link"));
+  EXPECT_THAT(refusalOf(inside("link")), HasSubstr("is a symbolic link"));
+  EXPECT_THAT(refusalOf(inside("link/")), HasSubstr("is a symbolic link"));
+}
+
+TEST_F(RuntimeDirectoryTest, IsRefusedWhenItIsNoDirectory) {
+  std::ofstream(inside("file")) << "text";
+  EXPECT_THAT(refusalOf(inside("file")), HasSubstr("is not a directory"));
+}
+
+TEST_F(RuntimeDirectoryTest, IsRefusedWhenItCannotBeMade) {
+  EXPECT_THAT(refusalOf(inside("absent/child")), HasSubstr("cannot be made: No such file or directory"));
+}
+
+TEST_F(RuntimeDirectoryTest, IsRefusedWhenItsPathIsRelative) {
+  EXPECT_THAT(refusalOf("telvon"), HasSubstr("not an absolute path"));
+}
+
+TEST_F(RuntimeDirectoryTest, IsRefusedWhenItBelongsToAnotherUser) {
+  if (::geteuid() != 0) GTEST_SKIP() << "only root can give a directory away";
+  std::filesystem::create_directory(inside("given"));
+  ::chmod(inside("given").c_str(), 0700);
+  ASSERT_EQ(::chown(inside("given").c_str(), 65534, 65534), 0);
+  EXPECT_THAT(refusalOf(inside("given")), HasSubstr("belongs to another user"));
+}
+
+TEST_F(RuntimeDirectoryTest, TakesNamesThatAreFileNames) {
+  EXPECT_EQ(refusalOfName("KelvasiApp.4b0f0c8e-0f5e-4a43-9d0c-1f6f7d0c2f11"), "(usable)");
+  EXPECT_EQ(refusalOfName("a b.c-d"), "(usable)");
+  EXPECT_THAT(refusalOfName(""), HasSubstr("is empty"));
+  EXPECT_THAT(refusalOfName(".lock"), HasSubstr("begins with a dot"));
+  EXPECT_THAT(refusalOfName("../telvon"), HasSubstr("begins with a dot"));
+  EXPECT_THAT(refusalOfName("a/b"), HasSubstr("holds a slash"));
+  EXPECT_THAT(refusalOfName(std::string("a\0b", 3)), HasSubstr("\"a?b\" refused: holds a control character"));
+}
+
+TEST_F(RuntimeDirectoryTest, TakesNamesAsLongAsASocketsPathMayBe) {
+  const std::size_t longest = sizeof(sockaddr_un::sun_path) - 1 - directory.size() - 1;
+  EXPECT_EQ(refusalOfName(std::string(longest, 'n')), "(usable)");
+  EXPECT_THAT(refusalOfName(std::string(longest + 1, 'n')), HasSubstr("makes too long a path"));
+}
+
+TEST_F(RuntimeDirectoryTest, IsLockedByOneAtATime) {
+  const auto opened = RuntimeDirectory::open(log);
+  FileDescriptor first = opened->lock(log);
+  EXPECT_TRUE(first);
+  EXPECT_FALSE(opened->lock(log));
+  EXPECT_EQ(log.errors().size(), 1u);
+  first.close();
+  EXPECT_TRUE(opened->lock(log));
+}
+
+}  // namespace
+}  // namespace kelvasi::test

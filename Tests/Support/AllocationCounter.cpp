@@ -1,0 +1,32 @@
+#include "Tests/Support/AllocationCounter.h"
+
+#include <atomic>
+#include <cstdlib>
+#include <new>
+
+namespace {
+std::atomic<std::size_t> allocations{0};
+}
+
+namespace kelvasi::test {
+
+std::size_t allocationsSoFar() {
+  return allocations;
+}
+
+}  // namespace kelvasi::test
+
+// The array forms and the ones that do not throw end here too.
+void* operator new(std::size_t size) {
+  ++allocations;
+  if (void* memory = std::malloc(size == 0 ? 1 : size)) return memory;
+  throw std::bad_alloc();
+}
+
+void operator delete(void* memory) noexcept {
+  std::free(memory);
+}
+
+void operator delete(void* memory, std::size_t) noexcept {
+  std::free(memory);
+}
