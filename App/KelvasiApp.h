@@ -1,0 +1,73 @@
+// The application object: builds the window and the stack of panes, runs the model and keeps every pane in
+// step with it.
+#pragma once
+
+#include <memory>
+#include <optional>
+#include <string>
+
+#include "App/AppPlatform.h"
+#include "App/KelvasiPaneController.h"
+#include "App/KelvasiSaveViewController.h"
+#include "App/SaveShell.h"
+#include "Model/KelvasiModel.h"
+#include "Platform/DateFormatter.h"
+#include "Platform/UserInterface/Application.h"
+#include "Platform/UserInterface/UserInterface.h"
+
+namespace kelvasi {
+
+class KelvasiApp : public Application,
+                   public ApplicationDelegate,
+                   public NavigationStackDelegate,
+                   public SaveShell {
+ public:
+  explicit KelvasiApp(const AppPlatform& platform) : platform_(platform) {}
+  ApplicationDelegate* asDelegate() override { return this; }
+
+  // Switches the home-screen shell's display of the signal strength.
+  void _setGSMRSSI(bool isOn);
+  void getSaveButtonPref();
+  void getRSSIPref();
+  void applicationDidFinishLaunching(Application& application) override;
+  // The clean-up. Nothing calls it; the framework's notice of termination is the other operation of this
+  // name.
+  void applicationWillTerminate();
+  using ApplicationDelegate::applicationWillTerminate;
+
+  void showSaveView() override;
+  void closeSaveView() override;
+  void updateStatusForViewController(KelvasiPaneController& pane);
+  // After a display tick that saw new data.
+  void updateViewControllerFromModel();
+  void navigationControllerWillShowViewControllerAnimated(NavigationStack& navigationController,
+                                                          ViewController& viewController,
+                                                          bool animated) override;
+
+  bool allowSaveButton() const override { return allowSaveButton_; }
+  void setAllowSaveButton(bool allow) { allowSaveButton_ = allow; }
+  Window* window() const { return window_.get(); }
+  void setWindow(std::unique_ptr<Window> window) { window_ = std::move(window); }
+  KelvasiSaveViewController* saveViewController() const { return saveViewController_.get(); }
+  void setSaveViewController(std::unique_ptr<KelvasiSaveViewController> controller);
+  const std::optional<std::string>& updateMessage() const { return updateMessage_; }
+  void setUpdateMessage(std::optional<std::string> message) { updateMessage_ = std::move(message); }
+
+  NavigationStack* navController() const { return navController_.get(); }
+  bool unsetRSSI() const { return unsetRSSI_; }
+
+ private:
+  void reloadPanes();
+
+  AppPlatform platform_;
+  std::unique_ptr<Window> window_;
+  std::unique_ptr<NavigationStack> navController_;
+  std::unique_ptr<KelvasiSaveViewController> saveViewController_;  // while it is presented
+  std::unique_ptr<KelvasiModel> model_;
+  bool unsetRSSI_ = false;  // this run switched the shell's display on
+  bool allowSaveButton_ = false;
+  std::unique_ptr<DateFormatter> dateFormatter_;
+  std::optional<std::string> updateMessage_;  // the status while connected
+};
+
+}  // namespace kelvasi

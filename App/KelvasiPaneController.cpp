@@ -1,0 +1,119 @@
+#include "App/KelvasiPaneController.h"
+
+#include <utility>
+
+#include "App/KelvasiCell.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr const char* cellIdentifier = "KelvasiPaneControllerCell";
+constexpr double statusFontSize = 14.0;
+
+void showBranch(KelvasiCell& cell, const KelvasiModelNode& child) {
+  cell.setKey(child.displayName());
+  cell.body().setAccessory(CellAccessory::disclosureIndicator);
+  cell.setValue("");
+  cell.setLayoutKey();
+}
+
+void showLeaf(KelvasiCell& cell, const KelvasiModelNode& child) {
+  cell.setKey(child.displayName());
+  cell.body().setAccessory(CellAccessory::none);
+  cell.setValue(*child.value());
+  cell.setLayout();
+}
+
+}  // namespace
+
+KelvasiPaneController::KelvasiPaneController(UserInterface& ui, SaveShell& shell, NodeRef node,
+                                             std::string path)
+    : TableViewController(ui.makeTableControllerBody()),
+      ui_(ui),
+      shell_(shell),
+      nodes_(std::move(node)),
+      keyPath_(std::move(path)) {}
+
+void KelvasiPaneController::createToolbarItems() {
+  const Font font = Font::system(statusFontSize);
+  ToolbarItems items{
+      ActivitySpinner{.isAnimating = isLoading_, .hidesWhenStopped = true},
+      ToolbarLabel{.text = status_, .font = font, .size = ui_.sizeOfText(status_, font)},
+      FlexibleSpace{},
+  };
+  if (shell_.allowSaveButton()) items.push_back(SaveButton{[&shell = shell_] { shell.showSaveView(); }});
+  setToolbarItems(std::move(items), true);
+}
+
+void KelvasiPaneController::viewWillAppear(bool animated) {
+  TableViewController::viewWillAppear(animated);
+  showTitle();
+  if (navigationController()) navigationController()->setToolbarHidden(false, animated);
+  createToolbarItems();
+}
+
+void KelvasiPaneController::viewWillDisappear(bool) {
+  resignFirstResponder();
+}
+
+void KelvasiPaneController::setStatus(std::optional<std::string_view> status, bool isLoading) {
+  status_ = status.value_or("");
+  isLoading_ = isLoading;
+  createToolbarItems();
+}
+
+void KelvasiPaneController::reloadWithNode(NodeRef node) {
+  nodes_ = std::move(node);
+  showTitle();
+  tableView().reloadData();
+  createToolbarItems();
+}
+
+void KelvasiPaneController::showTitle() {
+  setTitle(nodes_ ? nodes_->displayName() : "Kelvasi");
+}
+
+std::size_t KelvasiPaneController::tableViewNumberOfRowsInSection(TableView&, std::size_t) {
+  return nodes_ && nodes_->childNodes() ? nodes_->childNodes()->size() : 0;
+}
+
+const KelvasiModelNode& KelvasiPaneController::childAt(const IndexPath& indexPath) const {
+  return *nodes_->childNodes()->at(indexPath.row);
+}
+
+// Both kinds of cell share one identifier; a cell that is used again keeps its kind.
+std::unique_ptr<TableViewCell> KelvasiPaneController::tableViewCellForRowAtIndexPath(
+    TableView& tableView, const IndexPath& indexPath) {
+  const KelvasiModelNode& child = childAt(indexPath);
+  auto reused = tableView.dequeueReusableCellWithIdentifier(cellIdentifier);
+  // The table holds no other cells than those made here.
+  std::unique_ptr<KelvasiCell> cell(static_cast<KelvasiCell*>(reused.release()));
+  constexpr CellStyle style = CellStyle::twoLabelValue;
+  if (child.childNodes()) {
+    if (!cell)
+      cell = std::make_unique<KelvasiCell>(ui_, tableView, KelvasiCell::StyleKey{style}, cellIdentifier);
+    showBranch(*cell, child);
+  } else {
+    if (!cell) cell = std::make_unique<KelvasiCell>(ui_, tableView, style, cellIdentifier);
+    showLeaf(*cell, child);
+  }
+  return cell;
+}
+
+void KelvasiPaneController::tableViewDidSelectRowAtIndexPath(TableView& tableView,
+                                                             const std::optional<IndexPath>& indexPath) {
+  if (!indexPath) return;
+  if (!childAt(*indexPath).childNodes()) return tableView.deselectRowAtIndexPath(*indexPath, false);
+  openBranch(*indexPath);
+}
+
+void KelvasiPaneController::openBranch(const IndexPath& indexPath) {
+  const NodeRef& child = nodes_->childNodes()->at(indexPath.row);
+  auto pane = std::make_unique<KelvasiPaneController>(ui_, shell_, child,
+                                                      pathByAppending(keyPath_, child->displayName()));
+  pane->setStatus(status_, isLoading_);
+  navigationController()->pushViewController(std::move(pane), true);
+}
+
+}  // namespace kelvasi

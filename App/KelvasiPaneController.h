@@ -1,0 +1,49 @@
+// One screen of the viewer: the children of a branch of the display tree, a row each.
+#pragma once
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "App/SaveShell.h"
+#include "Model/KelvasiModelNode.h"
+#include "Platform/UserInterface/UserInterface.h"
+
+namespace kelvasi {
+
+class KelvasiPaneController : public TableViewController {
+ public:
+  // `node` may be null. Loading, with an empty status.
+  KelvasiPaneController(UserInterface& ui, SaveShell& shell, NodeRef node, std::string path);
+
+  // Makes the toolbar anew: spinner, status and, where the shell allows it, the Save button.
+  void createToolbarItems();
+  void viewWillAppear(bool animated) override;
+  // Nothing stands for no status.
+  void setStatus(std::optional<std::string_view> status, bool isLoading);
+  // Shows another state of the branch; null when there is none.
+  void reloadWithNode(NodeRef node);
+  const std::string& path() const { return keyPath_; }
+  void viewWillDisappear(bool animated) override;
+
+  // For the table.
+  std::size_t tableViewNumberOfRowsInSection(TableView& tableView, std::size_t section) override;
+  std::unique_ptr<TableViewCell> tableViewCellForRowAtIndexPath(TableView& tableView,
+                                                                const IndexPath& indexPath) override;
+  void tableViewDidSelectRowAtIndexPath(TableView& tableView,
+                                        const std::optional<IndexPath>& indexPath) override;
+
+ private:
+  void showTitle();
+  const KelvasiModelNode& childAt(const IndexPath& indexPath) const;
+  void openBranch(const IndexPath& indexPath);
+
+  UserInterface& ui_;
+  SaveShell& shell_;
+  NodeRef nodes_;  // the one branch that is shown
+  std::string keyPath_;
+  std::string status_;
+  bool isLoading_ = true;
+};
+
+}  // namespace kelvasi
