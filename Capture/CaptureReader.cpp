@@ -1,0 +1,34 @@
+#include "Capture/CaptureReader.h"
+
+#include <algorithm>
+#include <array>
+#include <utility>
+
+#include "Capture/DlfReader.h"
+#include "Capture/InputBytes.h"
+#include "Capture/PcapReader.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr std::array<std::uint8_t, 4> versionReportStart{0xA1, 0x00, 0xFD, 0x1F};
+
+bool isDlf(const std::string& path, const InputBytes& input) {
+  return path.ends_with(".dlf") || std::ranges::equal(input.firstBytes(), versionReportStart);
+}
+
+}  // namespace
+
+std::string CaptureFault::text() const {
+  const std::string place = offset ? ": byte " + std::to_string(*offset) : "";
+  return file + place + ": " + reason;
+}
+
+std::unique_ptr<CaptureReader> openCapture(const std::string& path) {
+  auto input = std::make_unique<InputBytes>(path);
+  if (isDlf(path, *input)) return std::make_unique<DlfReader>(*input);
+  return std::make_unique<PcapReader>(std::move(input));
+}
+
+}  // namespace kelvasi

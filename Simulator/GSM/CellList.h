@@ -1,0 +1,27 @@
+// The telephony daemon's cell list: the serving cell and its neighbours as the handset measured them last.
+#pragma once
+
+#include <optional>
+#include <vector>
+
+#include "Platform/PlistSerialiser.h"
+#include "Simulator/GSM/Cell.h"
+
+namespace kelvasi::sim::gsm {
+
+struct MeasuredCell {
+  Cell cell;
+  // Whole dBm: received level of a GSM cell, RSCP of a UMTS cell; nothing when it has not been measured.
+  std::optional<int> level;
+  std::optional<int> ecNo;  // whole dB, of a UMTS cell
+};
+
+struct CellList {
+  std::optional<MeasuredCell> serving;
+  std::vector<MeasuredCell> neighbours;
+};
+
+// Record 0xFF0001; nothing when the list cannot be serialised.
+std::optional<Bytes> cellInfoRecord(const CellList& cells, const PlistSerialiser& plists);
+
+}  // namespace kelvasi::sim::gsm

@@ -1,0 +1,106 @@
+#include "Simulator/GSM/CellSetRecords.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include "LogGenerator/GSM/CellSets.h"
+#include "LogGenerator/GSM/NeighbourSets.h"
+#include "Simulator/EntryWriter.h"
+#include "Simulator/GSM/CellSelection.h"
+
+namespace kelvasi::sim::gsm {
+
+namespace {
+
+using Places = std::vector<std::size_t>;
+
+constexpr std::int64_t monitored = 1;           // set membership
+constexpr double energyAtZeroDecibel = 524288;  // linear Ec/No
+constexpr int rscpOffset = 21;                  // dB between the record's RSCP and the true one
+
+int whole(double value) {
+  return static_cast<int>(std::lround(value));
+}
+
+int byteSized(int value) {
+  return std::clamp(value, -128, 127);
+}
+
+// Tenths of a dB over -106 dBm, less 512.
+int receiveAgc(double dBm) {
+  return whole((dBm + 106) * 10) - 512;
+}
+
+Places followedCells(const World& world) {
+  Places places = world.activeSet().cells();
+  for (const std::size_t place : world.umtsNeighbours()) {
+    if (!world.activeSet().contains(place)) places.push_back(place);
+  }
+  return places;
+}
+
+Places withServing(const World& world, const Places& neighbours) {
+  Places places{*world.serving()};
+  places.insert(places.end(), neighbours.begin(), neighbours.end());
+  return places;
+}
+
+MeasuredCell measured(const World& world, std::size_t place) {
+  MeasuredCell result{.cell = world.cell(place), .level = whole(world.reception(place).level), .ecNo = {}};
+  if (result.cell.technology == Technology::umts) result.ecNo = whole(world.reception(place).ecNo);
+  return result;
+}
+
+}  // namespace
+
+std::optional<Bytes> cellSetsRecord(const World& world) {
+  RecordWriter record(cellSets::logCode, cellSets::layout, cellSets::minimumLength);
+  record.set("receive AGC", receiveAgc(world.carrierPower()));
+  const Places places = world.isOn(Technology::umts) ? followedCells(world) : Places();
+  writeEntries(record, cellSets::identities, places, [&](std::size_t place, RecordWriter& entry) {
+    entry.set("scrambling code", world.cell(place).code)
+        .set("set membership", world.activeSet().contains(place) ? cellSets::activeSetMember : monitored);
+  });
+  writeEntries(record, cellSets::energies, places, [&](std::size_t place, RecordWriter& entry) {
+    const double energy = energyAtZeroDecibel * std::pow(10, world.reception(place).ecNo / 10);
+    entry.set("energy 1", std::llround(energy));
+  });
+  return record.bytes();
+}
+
+std::optional<Bytes> neighbourSetsRecord(const World& world) {
+  RecordWriter record(neighbourSets::logCode, neighbourSets::layout, neighbourSets::minimumLength);
+  if (world.isOn(Technology::umts)) {
+    writeEntries(record, neighbourSets::umtsCells, withServing(world, world.umtsNeighbours()),
+                 [&](std::size_t place, RecordWriter& entry) {
+                   const Reception& heard = world.reception(place);
+                   entry.set("downlink UARFCN", world.cell(place).frequency)
+                       .set("scrambling code", world.cell(place).code)
+                       .set("RSCP", byteSized(whole(heard.level) + rscpOffset))
+                       .set("rank-cell RSCP", whole(heard.level))
+                       .set("Ec/No in half dB", byteSized(whole(heard.ecNo * 2)))
+                       .set("ranking value", whole(heard.ecNo));
+                 });
+  } else if (world.isOn(Technology::gsm)) {
+    writeEntries(record, neighbourSets::gsmCells, withServing(world, world.gsmNeighbours()),
+                 [&](std::size_t place, RecordWriter& entry) {
+                   const Reception& heard = world.reception(place);
+                   entry.set("ARFCN", world.cell(place).frequency)
+                       .set("BSIC", world.cell(place).code)
+                       .set("RSSI", byteSized(whole(heard.level)))
+                       .set("ranking value", whole(criterionC2(heard)));
+                 });
+  }
+  return record.bytes();
+}
+
+CellList cellListOf(const World& world) {
+  CellList list;
+  if (!world.serving()) return list;
+  list.serving = measured(world, *world.serving());
+  for (const std::size_t place : world.umtsNeighbours()) list.neighbours.push_back(measured(world, place));
+  for (const std::size_t place : world.gsmNeighbours()) list.neighbours.push_back(measured(world, place));
+  return list;
+}
+
+}  // namespace kelvasi::sim::gsm

@@ -1,0 +1,59 @@
+// The handset's radio connection: RRC state in UMTS, RR state in GSM, as registration and user need it.
+#pragma once
+
+#include <cstdint>
+#include <optional>
+
+#include "Simulator/GSM/Cell.h"
+#include "Simulator/GSM/Phase.h"
+
+namespace kelvasi::sim::gsm {
+
+class RadioConnection {
+ public:
+  // The numbers of the RRC-state record.
+  enum class Rrc : std::uint8_t { disconnected, connecting, fach, dch, cellPch, uraPch };
+
+  explicit RadioConnection(Random random) : random_(random) {}
+
+  // With what the two domains need, on the serving cell or on none, for so many seconds.
+  void pass(const Cell* serving, Need circuitSwitched, Need packetSwitched, double seconds);
+
+  Rrc rrc() const;
+  bool isConnecting() const { return stage_ == Stage::connecting; }
+  // Data or signalling can be exchanged.
+  bool isConnected() const { return stage_ == Stage::connected; }
+  bool isReleasing() const { return stage_ == Stage::releasing; }
+  bool isCiphered() const { return isConnected() && connectedFor_ >= securityModeSeconds; }
+  bool hasSpeech() const { return isConnected() && circuitSwitched_ == Need::speech; }
+  // A burst of packet data is under way.
+  bool isTransferring() const { return isConnected() && packetSwitched_ == Need::data && isBurst_; }
+  // A circuit-switched channel.
+  bool isDedicated() const { return isConnected() && circuitSwitched_ > Need::connecting; }
+  // Since the last pass: into another technology; whether as a handover.
+  bool hasChangedTechnology() const { return hasChangedTechnology_; }
+
+ private:
+  enum class Stage { none, connecting, connected, releasing };
+
+  static constexpr double securityModeSeconds = 0.6;
+
+  void follow(Need circuitSwitched, double seconds);
+  void release(double seconds);
+  void passBursts(double seconds);
+  void enter(Stage stage);
+
+  Random random_;
+  std::optional<Technology> technology_;
+  Need circuitSwitched_ = Need::none;
+  Need packetSwitched_ = Need::none;
+  Stage stage_ = Stage::none;
+  double inStage_ = 0;       // seconds
+  double connectedFor_ = 0;  // seconds
+  double standby_ = 0;       // seconds of packet standby that are left after a data session
+  bool isBurst_ = false;
+  double untilBurstTurns_ = 0;
+  bool hasChangedTechnology_ = false;
+};
+
+}  // namespace kelvasi::sim::gsm

@@ -1,0 +1,82 @@
+// The world of the drive: a town's cells, what the radio does to them, and one handset that drives through.
+// All records are encoded from it, so that what they tell of one moment agrees.
+#pragma once
+
+#include <vector>
+
+#include "Simulator/GSM/ActiveSet.h"
+#include "Simulator/GSM/CellSelection.h"
+#include "Simulator/GSM/RadioConnection.h"
+#include "Simulator/GSM/RadioModel.h"
+#include "Simulator/GSM/Registration.h"
+#include "Simulator/GSM/Route.h"
+#include "Simulator/GSM/Traffic.h"
+
+namespace kelvasi::sim::gsm {
+
+class World {
+ public:
+  static constexpr std::size_t mostNeighbours = 6;
+
+  // What several records tell of, in short.
+  struct Situation {
+    Registration::Situation registration;
+    RadioConnection::Rrc rrc;
+    bool isConnected;
+    bool isDedicated;
+    bool hasChangedCell;
+    std::vector<std::size_t> activeSet;
+    bool operator==(const Situation&) const = default;
+  };
+
+  explicit World(Random random);
+  World(const World&) = delete;
+  World& operator=(const World&) = delete;
+
+  void pass(double seconds);
+
+  // Of the cell that the handset camps on or is connected to; nothing while it has none.
+  std::optional<std::size_t> serving() const {
+    return registration_.isCamped() ? selection_.serving() : std::nullopt;
+  }
+  bool isOn(Technology technology) const { return serving() && cell(*serving()).technology == technology; }
+  // Whether the handset has just come to its serving cell; from the other technology.
+  bool hasChangedCell() const { return hasChangedCell_; }
+
+  const Cell& cell(std::size_t place) const { return cells_[place]; }
+  const Reception& reception(std::size_t place) const { return radio_.receptions()[place]; }
+  // Places of the strongest other cells that can be told apart, the strongest first. Empty without service,
+  // and of the other technology while the serving cell is too good to look for it.
+  const std::vector<std::size_t>& gsmNeighbours() const { return gsmNeighbours_; }
+  const std::vector<std::size_t>& umtsNeighbours() const { return umtsNeighbours_; }
+
+  const ActiveSet& activeSet() const { return activeSet_; }
+  const RadioConnection& connection() const { return connection_; }
+  const Registration& registration() const { return registration_; }
+  const Traffic& traffic() const { return traffic_; }
+  double carrierPower() const { return radio_.carrierPower(); }
+  // dBm, in UMTS.
+  double transmitPower() const;
+  Point position() const { return route_.position(); }
+  Situation situation() const;
+
+ private:
+  void findNeighbours();
+  std::vector<std::size_t> strongest(Technology technology) const;
+  Use use() const;
+
+  Random random_;
+  std::vector<Cell> cells_;
+  Route route_;
+  RadioModel radio_;
+  CellSelection selection_;
+  ActiveSet activeSet_;
+  Registration registration_;
+  RadioConnection connection_;
+  Traffic traffic_;
+  std::vector<std::size_t> gsmNeighbours_;
+  std::vector<std::size_t> umtsNeighbours_;
+  bool hasChangedCell_ = false;
+};
+
+}  // namespace kelvasi::sim::gsm

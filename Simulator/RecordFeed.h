@@ -1,0 +1,66 @@
+// Sends the records of a world when they have news, and now and then when they have none.
+#pragma once
+
+#include <optional>
+#include <span>
+#include <vector>
+
+#include "Platform/PlistSerialiser.h"
+#include "Simulator/Message.h"
+#include "Simulator/RecordStamp.h"
+
+namespace kelvasi::sim {
+
+template <typename World>
+struct RecordRule {
+  // The record of the world as it is; nothing while there is none to send.
+  std::optional<Bytes> (*encode)(const World& world, const PlistSerialiser& plists);
+  std::chrono::milliseconds atMostEvery{0};       // a measurement that always changes
+  std::chrono::milliseconds atLeastEvery{10000};  // repeated although nothing changed
+};
+
+template <typename World>
+class RecordFeed {
+ public:
+  // `rules` outlive the feed. Records of one moment are sent in their order.
+  RecordFeed(std::span<const RecordRule<World>> rules, const PlistSerialiser& plists)
+      : rules_(rules), plists_(plists), sent_(rules.size()) {}
+
+  // `isTurningPoint`: something has changed that several records tell of, so none may be late. A record is
+  // due at once when there was none before.
+  void advance(WorldTime now, const World& world, bool isTurningPoint, Messages& messages) {
+    for (std::size_t place = 0; place < rules_.size(); ++place) {
+      const auto since = now - sent_[place].at;
+      if (!isTurningPoint && sent_[place].record && since < rules_[place].atMostEvery) continue;
+      auto record = rules_[place].encode(world, plists_);
+      if (record == sent_[place].record && since < rules_[place].atLeastEvery) continue;
+      sent_[place] = {record, now};
+      if (!record) continue;
+      append(std::move(*record), now, messages);
+    }
+  }
+
+  // Every record that there is to send.
+  void all(WorldTime now, const World& world, Messages& messages) const {
+    for (const auto& rule : rules_) {
+      if (auto record = rule.encode(world, plists_)) append(std::move(*record), now, messages);
+    }
+  }
+
+ private:
+  static void append(Bytes record, WorldTime now, Messages& messages) {
+    stampRecord(record, now);
+    messages.push_back(logMessage(std::move(record)));
+  }
+
+  struct Sent {
+    std::optional<Bytes> record;
+    WorldTime at{0};
+  };
+
+  std::span<const RecordRule<World>> rules_;
+  const PlistSerialiser& plists_;
+  std::vector<Sent> sent_;
+};
+
+}  // namespace kelvasi::sim

@@ -1,0 +1,40 @@
+#include "Simulator/ScenarioList.h"
+
+#include <algorithm>
+#include <array>
+
+#include "Simulator/GSM/DriveScenario.h"
+#include "Simulator/GSM/MobilityScenario.h"
+#include "Telvon/Technology.h"
+
+namespace kelvasi::sim {
+
+namespace {
+
+template <typename Kind>
+std::unique_ptr<Scenario> make(std::uint64_t seed, const PlistSerialiser& plists) {
+  return std::make_unique<Kind>(seed, plists);
+}
+
+constexpr std::array kinds{
+    ScenarioKind{kTelvonLogChannelTechnology_Orvane_GSM, "drive",
+                 "a drive through a town of GSM and UMTS cells; all records", make<gsm::DriveScenario>},
+    ScenarioKind{kTelvonLogChannelTechnology_Orvane_GSM, "mobility",
+                 "registration, calls, data and loss of service; mobility management only",
+                 make<gsm::MobilityScenario>},
+};
+
+}  // namespace
+
+std::span<const ScenarioKind> scenarioKinds() {
+  return kinds;
+}
+
+const ScenarioKind* findScenario(std::string_view technology, std::string_view name) {
+  const auto kind = std::ranges::find_if(kinds, [&](const ScenarioKind& candidate) {
+    return candidate.technology == technology && (name.empty() || candidate.name == name);
+  });
+  return kind == kinds.end() ? nullptr : &*kind;
+}
+
+}  // namespace kelvasi::sim

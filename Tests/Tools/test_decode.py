@@ -1,0 +1,134 @@
+"""kelvasictl decode: what it prints."""
+
+import json
+import plistlib
+import signal
+import unittest
+
+from support import CAPTURES, GMM_DEREGISTERED, GMM_REGISTERED, MM_IDLE, START, TEMPLATES, KelvasictlTest, pcap, pcapng
+from support import record
+
+
+class Decode(KelvasictlTest):
+    def shown(self, *arguments, **options):
+        result = self.decode(*arguments, **options)
+        self.assertEqual(result.returncode, 0, result.stderr)
+        return json.loads(result.stdout)
+
+    def test_the_last_display_is_printed_as_indented_json(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE, GMM_REGISTERED))
+        result = self.decode(capture)
+        self.assertEqual(result.stderr, b"")
+        self.assertIn(b'\n "Process CS": {\n  "MM State": "MM_IDLE",\n', result.stdout)
+        self.assertEqual(json.loads(result.stdout)["Process PS"]["MM State"], "GMM_REGISTERED")
+
+    def test_the_full_name_of_a_technology_will_do(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        display = self.shown(capture, technology="kTelvonLogChannelTechnology_Orvane_GSM")
+        self.assertEqual(display["Process CS"]["MM State"], "MM_IDLE")
+
+    def test_captures_follow_one_another(self):
+        first = self.write("a.pcap", pcap(MM_IDLE, GMM_REGISTERED))
+        second = self.write("b.pcap", pcap(GMM_DEREGISTERED))
+        later = self.shown(first, second)
+        self.assertEqual(later["Process CS"]["MM State"], "MM_IDLE")
+        self.assertNotEqual(later["Process PS"]["MM State"], "GMM_REGISTERED")
+        self.assertEqual(self.shown(second, first)["Process PS"]["MM State"], "GMM_REGISTERED")
+
+    def test_pcapng_nanoseconds_and_the_standard_input_are_read_alike(self):
+        expected = self.shown(self.write("a.pcap", pcap(MM_IDLE)))
+        self.assertEqual(self.shown(self.write("b.pcapng", pcapng(MM_IDLE))), expected)
+        self.assertEqual(self.shown(self.write("c.pcap", pcap(MM_IDLE, magic=0xA1B23C4D))), expected)
+        self.assertEqual(self.shown("-", input=pcap(MM_IDLE)), expected)
+
+    def test_a_capture_without_messages_has_no_display(self):
+        capture = self.write("a.pcap", pcap())
+        self.assertEqual(self.decode(capture).stdout, b"null\n")
+        self.assertEqual(self.decode(capture, "--every-tick").stdout, b"")
+        self.assertEqual(self.decode(capture, "--format", "tree").stdout, b"/\t(unknown)\n")
+        self.assert_fault(self.decode(capture, "--format", "plist"), "no display")
+
+    def test_without_templates_there_is_no_display(self):
+        empty = self.write("a.pcap", pcap(MM_IDLE))
+        result = self.run_program("decode", "--technology", "Orvane_GSM", "--resources", self.directory.name, empty)
+        self.assertEqual((result.returncode, result.stdout), (0, b"null\n"))
+
+    def test_the_environment_names_the_templates_and_the_option_goes_first(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        self.environment["KELVASI_RESOURCES"] = str(TEMPLATES)
+        with_variable = self.run_program("decode", "--technology", "Orvane_GSM", capture)
+        self.assertIn("Static Text", json.loads(with_variable.stdout))
+        self.environment["KELVASI_RESOURCES"] = self.directory.name
+        self.assertIn("Static Text", self.shown(capture))
+
+    def test_tree(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        lines = self.decode(capture, "--format", "tree").stdout.decode().splitlines()
+        self.assertEqual(lines[0], "/\t")
+        self.assertIn("/Process CS\t", lines)
+        self.assertIn("/Process CS/MM State\tMM_IDLE", lines)
+        self.assertTrue(all(line.count("\t") == 1 for line in lines))
+
+    def test_plist(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        result = self.decode(capture, "--format", "plist")
+        self.assertTrue(result.stdout.startswith(b"<?xml"))
+        self.assertEqual(plistlib.loads(result.stdout), self.shown(capture))
+
+    def test_start_command_needs_no_capture(self):
+        result = self.decode("--start-command")
+        self.assertEqual((result.returncode, result.stderr), (0, b""))
+        command = plistlib.loads(result.stdout)
+        self.assertEqual(list(command), ["SetState", "SetOrvaneLogCodes", "SetTelvonExtraCodes"])
+        self.assertEqual(command["SetState"], "Streaming")
+        self.assertIn(0x7130, command["SetOrvaneLogCodes"])
+
+    def test_log_lines_go_to_the_standard_error_on_request(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE, record(0x7130, b"", log_type=7)))
+        result = self.decode(capture, "--log-stderr")
+        lines = result.stderr.decode().splitlines()
+        self.assertIn("<3>Creating Orvane_GSMLogGenerator object", lines)
+        self.assertIn("<3>Invalid log type: 7. Dropping.", lines)
+        self.assertIn("Deallocing ClassIndex", lines)
+        self.assertEqual(result.stdout, self.decode(capture).stdout)
+
+    def test_a_decoders_exception_is_the_end(self):
+        crash = CAPTURES / "Orvane_GSM" / "sim_crash_garbage.pcap"
+        result = self.decode("--log-stderr", crash)
+        if b"<3>SIM File" not in result.stderr:
+            self.skipTest("the SIM decoder does not exist yet")
+        self.assertEqual((result.returncode, result.stdout), (-signal.SIGABRT, b""))
+        self.assertIn(b"<2>Terminating: uncaught kelvasi::LogCode_0xFF000020::UnknownDataException\n", result.stderr)
+
+
+class EveryTick(KelvasictlTest):
+    def ticks(self, *messages):
+        capture = self.write("a.pcap", pcap(*messages))
+        result = self.decode("--every-tick", capture)
+        self.assertEqual(result.returncode, 0, result.stderr)
+        lines = [json.loads(line) for line in result.stdout.splitlines()]
+        self.assertTrue(all(list(line) == ["time", "display"] for line in lines))
+        return [(line["time"] - START, (line["display"] or {}).get("Process PS", {}).get("MM State")) for line in lines]
+
+    def test_ticks_fall_every_two_seconds_in_which_messages_arrived_and_after_the_last(self):
+        registered, other = (0.0, GMM_REGISTERED), (2.5, GMM_DEREGISTERED)
+        first, second, last = self.ticks(registered, (0.5, MM_IDLE), other, (9.0, GMM_REGISTERED))
+        self.assertEqual(first, (2.0, "GMM_REGISTERED"))
+        self.assertEqual(second[0], 4.0)
+        self.assertNotEqual(second[1], "GMM_REGISTERED")
+        self.assertEqual(last, (9.0, "GMM_REGISTERED"))
+
+    def test_json_may_be_asked_for_and_nothing_else(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        self.assertEqual(self.decode("--every-tick", "--format", "json", capture).returncode, 0)
+        self.assert_fault(self.decode("--every-tick", "--format", "tree", capture), status=2)
+
+    def test_what_was_ticked_before_a_fault_is_printed(self):
+        contents = pcap((0.0, MM_IDLE), (3.0, MM_IDLE))
+        result = self.decode("--every-tick", self.write("a.pcap", contents[:-1]))
+        self.assertEqual(len(result.stdout.splitlines()), 1)
+        self.assert_fault(result, "a.pcap: byte 56: ")
+
+
+if __name__ == "__main__":
+    unittest.main()

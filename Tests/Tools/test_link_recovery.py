@@ -1,0 +1,225 @@
+"""The daemon and the viewer's model as two processes that find, lose and find each other again."""
+
+import os
+import pathlib
+import queue
+import re
+import shutil
+import signal
+import subprocess
+import tempfile
+import threading
+import unittest
+
+KELVASICTL = os.environ["KELVASICTL"]
+TELVON_SIM = os.environ["TELVON_SIM"]
+RESTARTS = int(os.environ.get("LINK_RESTARTS", "5"))
+RESOURCES = pathlib.Path(__file__).resolve().parent.parent.parent / "Resources"
+PATIENCE = 60  # seconds until a line that never comes fails the test
+
+RUNNING = "Starting the display update timer"
+INVALIDATED = re.compile(r"<3> \*\*\*\*\* INVALIDATED 0x[0-9a-f]+ \*\*\*\*\*$")
+
+
+class Process:
+    """A program whose lines of standard error can be waited for."""
+
+    def __init__(self, *arguments, environment):
+        self.lines = []
+        self._arriving = queue.Queue()
+        self._process = subprocess.Popen(
+            arguments, stdout=subprocess.DEVNULL, stderr=subprocess.PIPE, text=True, env=environment
+        )
+        self.pid = self._process.pid
+        self._reader = threading.Thread(target=self._read, daemon=True)
+        self._reader.start()
+
+    def _read(self):
+        for line in self._process.stderr:
+            self._arriving.put(line.rstrip("\n"))
+        self._arriving.put(None)
+
+    def wait_for(self, part):
+        """Lines up to the first that contains `part`."""
+        seen = []
+        while True:
+            line = self._arriving.get(timeout=PATIENCE)
+            if line is None:
+                raise AssertionError(f"ended before it wrote {part!r}: {seen}")
+            self.lines.append(line)
+            seen.append(line)
+            if part in line:
+                return seen
+
+    def end(self, how=signal.SIGTERM):
+        self._process.send_signal(how)
+        return self.status()
+
+    def status(self):
+        """Waits for the program to end."""
+        status = self._process.wait(timeout=PATIENCE)
+        self._reader.join(timeout=PATIENCE)
+        self._process.stderr.close()
+        return status
+
+    def is_running(self):
+        return self._process.poll() is None
+
+    def descriptors(self):
+        return len(os.listdir(f"/proc/{self.pid}/fd"))
+
+    def resident_kilobytes(self):
+        status = pathlib.Path(f"/proc/{self.pid}/status").read_text()
+        return int(re.search(r"VmRSS:\s+(\d+) kB", status).group(1))
+
+    def socket_inodes(self):
+        links = pathlib.Path(f"/proc/{self.pid}/fd").iterdir()
+        targets = [os.readlink(link) for link in links]
+        return {target[8:-1] for target in targets if target.startswith("socket:[")}
+
+
+class LinkTest(unittest.TestCase):
+    def setUp(self):
+        self.directory = tempfile.mkdtemp()
+        self.addCleanup(shutil.rmtree, self.directory)
+        self.environment = os.environ | {"TELVON_RUNTIME_DIR": self.directory}
+        self.environment.pop("KELVASI_LOG_LEVEL", None)
+
+    def start(self, *arguments):
+        process = Process(*arguments, environment=self.environment)
+        self.addCleanup(lambda: process.is_running() and process.end(signal.SIGKILL))
+        return process
+
+    def daemon(self, *options):
+        return self.start(TELVON_SIM, "--technology", "Orvane_GSM", *options)
+
+    def serving_daemon(self, *options):
+        daemon = self.daemon(*options)
+        daemon.wait_for("telvon-sim: serving")
+        return daemon
+
+    def monitor(self, *options):
+        return self.start(
+            KELVASICTL, "monitor", "--format", "json", "--log-stderr", "--resources", str(RESOURCES), *options
+        )
+
+
+class Order(LinkTest):
+    def test_the_daemon_first(self):
+        self.serving_daemon()
+        monitor = self.monitor()
+        monitor.wait_for(RUNNING)
+        self.assertEqual(monitor.end(), 0)
+
+    def test_the_viewer_first(self):
+        monitor = self.monitor()
+        monitor.wait_for("Could not create the ports necessary")
+        self.serving_daemon()
+        monitor.wait_for(RUNNING)
+        self.assertEqual(monitor.end(), 0)
+
+
+class Recovery(LinkTest):
+    def test_every_death_of_the_daemon_is_noticed_and_costs_nothing(self):
+        daemon = self.serving_daemon()
+        monitor = self.monitor()
+        monitor.wait_for(RUNNING)
+        settled = None
+        for number in range(RESTARTS):
+            daemon.end(signal.SIGKILL)
+            daemon = self.serving_daemon()
+            seen = monitor.wait_for(RUNNING)
+            self.assertRegex(next(line for line in seen if "INVALIDATED" in line), INVALIDATED)
+            if number == RESTARTS // 10:
+                settled = (monitor.descriptors(), monitor.resident_kilobytes())
+        self.assertEqual(sum("INVALIDATED" in line for line in monitor.lines), RESTARTS)
+        self.assertEqual(monitor.descriptors(), settled[0])
+        if RESTARTS >= 100:  # a short run has settled nothing
+            self.assertLess(monitor.resident_kilobytes(), settled[1] + 1024)
+        self.assertEqual(monitor.end(), 0)
+
+    def test_a_daemon_that_stops_is_given_up_and_found_again(self):
+        daemon = self.serving_daemon()
+        os.kill(daemon.pid, signal.SIGSTOP)
+        monitor = self.monitor()
+        monitor.wait_for("Could not create the ports necessary")
+        os.kill(daemon.pid, signal.SIGCONT)
+        monitor.wait_for(RUNNING)
+        self.assertEqual(monitor.end(), 0)
+
+    def test_a_second_daemon_is_refused_while_one_lives(self):
+        self.serving_daemon()
+        second = self.daemon()
+        self.assertEqual(second.status(), 1)
+
+
+class Faults(LinkTest):
+    def expect(self, fault, line):
+        self.serving_daemon("--fault", fault)
+        monitor = self.monitor()
+        monitor.wait_for(line)
+        self.assertEqual(monitor.end(), 0)
+
+    def test_an_answer_without_the_key(self):
+        self.expect("answer-without-key", "<3> ***** Reply to GetTechnology had no answer; cannot configure")
+
+    def test_no_answer(self):
+        self.expect("no-answer", "<3> ***** No response to GetTechnology; cannot configure")
+
+    def test_an_answer_that_is_no_property_list(self):
+        self.expect("answer-garbage", "<3> ***** Could not parse reply to GetTechnology; cannot configure")
+
+    def test_an_unknown_technology(self):
+        self.expect("unknown-technology", "<3>No log generator technology works")
+
+    def test_an_error_pair(self):
+        self.expect(
+            "error-pair=49", "<3>_TelvonServerConnectionNetworkMonitorCreateLogChannel returns error: 49!"
+        )
+
+    def test_an_empty_port(self):
+        self.expect("empty-port", "<3>Could not create a log channel (Telvon returned null port)!")
+
+    def test_a_port_where_nobody_listens(self):
+        self.expect("dead-port", "<3>Could not create the remote port!")
+
+
+class Privacy(LinkTest):
+    def network_inodes(self):
+        inodes = set()
+        for table in ("tcp", "tcp6", "udp", "udp6", "raw", "raw6", "udplite", "udplite6"):
+            path = pathlib.Path("/proc/net") / table
+            if path.exists():
+                inodes |= {line.split()[9] for line in path.read_text().splitlines()[1:]}
+        return inodes
+
+    def test_neither_side_has_a_network_socket(self):
+        daemon = self.serving_daemon()
+        monitor = self.monitor()
+        monitor.wait_for(RUNNING)
+        for process in (daemon, monitor):
+            self.assertTrue(process.socket_inodes())
+            self.assertFalse(process.socket_inodes() & self.network_inodes())
+
+    @unittest.skipUnless(shutil.which("strace"), "strace is not installed")
+    def test_the_viewer_asks_the_system_for_unix_sockets_only(self):
+        self.serving_daemon()
+        trace = os.path.join(self.directory, "trace")
+        command = [KELVASICTL, "monitor", "--once", "--resources", str(RESOURCES)]
+        run = subprocess.run(
+            ["strace", "-f", "-e", "trace=socket", "-o", trace, *command],
+            env=self.environment | {"ASAN_OPTIONS": "detect_leaks=0"},
+            capture_output=True,
+            timeout=PATIENCE,
+            check=False,
+        )
+        if b"ptrace" in run.stderr:
+            self.skipTest("this machine does not let strace trace")
+        self.assertEqual(run.returncode, 0, run.stderr)
+        calls = [line for line in pathlib.Path(trace).read_text().splitlines() if "socket(" in line]
+        self.assertTrue(calls)
+        self.assertEqual([line for line in calls if "AF_UNIX" not in line], [])
+
+
+if __name__ == "__main__":
+    unittest.main()

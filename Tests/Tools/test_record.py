@@ -1,0 +1,88 @@
+"""kelvasictl record beside a simulated daemon, both as processes."""
+
+import os
+import signal
+import time
+import unittest
+
+from live_support import PATIENCE, LiveTest, packets
+from support import MM_IDLE, pcap, record
+
+MANY = [record(0x7131, count.to_bytes(4, "little")) for count in range(5000)]
+
+
+class Record(LiveTest):
+    def recorded(self):
+        return [message for _, message in packets(self.read("a.pcap"))]
+
+    def replay(self, *messages, speed="max"):
+        world = self.write("world.pcap", pcap(*messages))
+        return self.start_daemon("--replay", world, "--speed", speed, "--leave")
+
+    def start_record(self, *arguments):
+        return self.start_live("record", self.path("a.pcap"), *arguments)
+
+    def file_reaches(self, size):
+        return os.path.exists(self.path("a.pcap")) and os.path.getsize(self.path("a.pcap")) >= size
+
+    def test_what_the_daemon_sent_before_the_signal_is_in_the_file(self):
+        for number in (signal.SIGINT, signal.SIGTERM):
+            with self.subTest(number):
+                daemon = self.replay(*MANY)
+                recorder = self.start_record()
+                self.assertEqual(daemon.wait(PATIENCE), 0)
+                status, out, error = self.end(recorder, number)
+                self.assertEqual((status, out), (0, b""))
+                self.assertEqual(error, f"kelvasictl: 5000 messages recorded in {self.path('a.pcap')}\n")
+                self.assertEqual(self.recorded(), MANY)
+
+    def test_stamps_are_those_of_arrival(self):
+        before = time.time()
+        self.replay((0.0, MM_IDLE), (0.5, MM_IDLE), speed="1")
+        recorder = self.start_record()
+        self.wait_until(lambda: self.file_reaches(24 + 2 * (16 + len(MM_IDLE))))
+        self.assertEqual(self.end(recorder)[0], 0)
+        (first, _), (second, _) = packets(self.read("a.pcap"))
+        self.assertTrue(before - 0.001 <= first < second <= time.time(), (before, first, second))
+
+    def test_a_killed_recorder_leaves_whole_messages(self):
+        self.start_daemon("--replay", self.write("world.pcap", pcap(*MANY)), "--speed", "max", "--loop")
+        recorder = self.start_record()
+        self.wait_until(lambda: self.file_reaches(100_000))
+        recorder.kill()
+        recorder.wait(PATIENCE)
+        messages = self.recorded()
+        self.assertGreater(len(messages), 2000)
+        self.assertEqual(messages[:5000], MANY[:len(messages)])
+
+    def test_it_goes_on_with_the_next_daemon(self):
+        first = self.replay(*MANY[:10])
+        recorder = self.start_record()
+        self.assertEqual(first.wait(PATIENCE), 0)
+        second = self.replay(*MANY[10:20])
+        self.assertEqual(second.wait(PATIENCE), 0)
+        self.assertEqual(self.end(recorder)[0], 0)
+        self.assertEqual(self.recorded(), MANY[:20])
+
+    def test_a_message_that_a_decoder_dies_of_is_kept(self):
+        deadly = record(0x0000, b"no property list", log_type=0xFF)
+        daemon = self.start_daemon("--replay", self.write("world.pcap", pcap(deadly, MM_IDLE)), "--leave")
+        recorder = self.start_record()
+        self.assertEqual(daemon.wait(PATIENCE), 0)
+        self.assertEqual(self.end(recorder)[0], 0)
+        # The daemon sends what is subscribed to, and the SIM files are once they are decoded.
+        self.assertEqual(self.recorded()[-1], MM_IDLE)
+
+    def test_the_file_is_a_capture_from_the_start(self):
+        recorder = self.start_record("--seconds", "0.2")
+        _, error = recorder.communicate(timeout=PATIENCE)
+        self.assertEqual(error.decode(), f"kelvasictl: 0 messages recorded in {self.path('a.pcap')}\n")
+        self.assertEqual(self.decode(self.path("a.pcap")).stdout, b"null\n")
+
+    def test_a_place_that_cannot_be_written_is_named(self):
+        self.assert_fault(self.run_program("record", self.path("missing/a.pcap")), "missing/a.pcap: No such file")
+        self.assert_fault(self.run_program("record", "/dev/full"), "/dev/full: No space left on device")
+
+
+if __name__ == "__main__":
+    unittest.main()

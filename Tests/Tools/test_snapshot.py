@@ -1,0 +1,81 @@
+"""kelvasictl decode --dlf and --snapshot: what Save would write."""
+
+import datetime
+import os
+import plistlib
+import struct
+import unittest
+
+from support import GMM_REGISTERED, MM_IDLE, KelvasictlTest, pcap, record
+
+
+class Dlf(KelvasictlTest):
+    def test_holds_a_version_report_and_the_intervals_without_their_first_bytes(self):
+        capture = self.write("a.pcap", pcap((0.0, MM_IDLE), (0.5, GMM_REGISTERED), (3.0, MM_IDLE)))
+        result = self.decode("--dlf", self.path("a.dlf"), capture)
+        self.assertEqual((result.returncode, result.stderr), (0, b""))
+        dlf = self.read("a.dlf")
+        self.assertEqual(struct.unpack_from("<HH", dlf), (161, 0x1FFD))
+        self.assertEqual(dlf[161:], MM_IDLE[1:] + GMM_REGISTERED + MM_IDLE[1:])
+
+    def test_is_decoded_to_the_same_display(self):
+        cells = record(0x0001, b"bplist00", log_type=0xFF)
+        capture = self.write("a.pcap", pcap((0.0, MM_IDLE), (0.5, cells), (3.0, GMM_REGISTERED), (5.5, MM_IDLE)))
+        shown = self.decode("--dlf", self.path("a.dlf"), capture)
+        again = self.decode(self.path("a.dlf"))
+        self.assertEqual((again.returncode, again.stderr), (0, b""))
+        self.assertEqual(again.stdout, shown.stdout)
+
+    def test_replaces_an_older_file_and_leaves_nothing_else(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        self.write("a.dlf", bytes(10000))
+        self.decode("--dlf", self.path("a.dlf"), capture)
+        self.assertEqual(len(self.read("a.dlf")), 161 + len(MM_IDLE) - 1)
+        self.assertEqual(sorted(os.listdir(self.directory.name)), ["a.dlf", "a.pcap"])
+
+    def test_a_place_that_cannot_be_written_is_named_after_the_display(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        for option in ("--dlf", "--snapshot"):
+            with self.subTest(option):
+                result = self.decode(option, self.path("missing/file"), capture)
+                self.assert_fault(result, "missing/file: No such file or directory")
+                self.assertIn(b"MM_IDLE", result.stdout)
+
+
+class Snapshot(KelvasictlTest):
+    def snapshot(self, *arguments):
+        result = self.decode("--snapshot", self.path("a.kelvasi"), *arguments)
+        self.assertEqual((result.returncode, result.stderr), (0, b""))
+        return plistlib.loads(self.read("a.kelvasi"))
+
+    def test_holds_a_time_the_save_contents_and_a_description(self):
+        capture = self.write("a.pcap", pcap((0.0, MM_IDLE), (3.0, GMM_REGISTERED)))
+        snapshot = self.snapshot("--description", "at the bench", capture)
+        self.assertEqual(sorted(snapshot), ["Data", "Description", "Timestamp"])
+        self.assertEqual(snapshot["Description"], "at the bench")
+        datetime.datetime.strptime(snapshot["Timestamp"], "%Y-%m-%d %H:%M:%S +0000")
+        first, second, dlf = snapshot["Data"]
+        self.assertEqual(sorted(first), ["Date", "Description", "Display", "DisplayState", "ExtraInfo"])
+        self.assertEqual(second["DisplayState"], GMM_REGISTERED)
+        self.assertEqual(dlf["Description"], f"DLF binary ({len(dlf['DLF'])} bytes)")
+
+    def test_keeps_the_last_five_ticks(self):
+        messages = [(3.0 * count, MM_IDLE) for count in range(8)]
+        self.assertEqual(len(self.snapshot(self.write("a.pcap", pcap(*messages)))["Data"]), 6)
+
+    def test_the_description_is_empty_unless_it_is_given(self):
+        self.assertEqual(self.snapshot(self.write("a.pcap", pcap(MM_IDLE)))["Description"], "")
+
+    def test_of_nothing_holds_an_empty_history(self):
+        (dlf,) = self.snapshot(self.write("a.pcap", pcap()))["Data"]
+        self.assertEqual(len(dlf["DLF"]), 161)
+
+    def test_is_written_of_what_precedes_a_fault(self):
+        contents = pcap(MM_IDLE, GMM_REGISTERED)
+        result = self.decode("--snapshot", self.path("a.kelvasi"), self.write("a.pcap", contents[:-1]))
+        self.assert_fault(result, "a.pcap: byte 56: ")
+        self.assertEqual(plistlib.loads(self.read("a.kelvasi"))["Data"][0]["DisplayState"], MM_IDLE)
+
+
+if __name__ == "__main__":
+    unittest.main()

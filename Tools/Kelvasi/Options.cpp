@@ -1,0 +1,66 @@
+#include "Tools/Kelvasi/Options.h"
+
+#include <CLI/CLI.hpp>
+#include <cstdlib>
+#include <filesystem>
+#include <map>
+
+namespace kelvasi {
+
+namespace {
+
+constexpr int wrongUsage = 2;
+constexpr const char* developers = "";  // a group without a name is left out of the help
+
+std::string environment(const char* name) {
+  const char* const value = std::getenv(name);
+  return value ? value : "";
+}
+
+void addOptions(CLI::App& app, Options& options) {
+  app.add_flag("--fullscreen", options.fullScreen,
+               "fill the screen; a window of 390 by 844 points otherwise");
+  const std::map<std::string, ColourScheme> schemes{{"light", ColourScheme::light},
+                                                    {"dark", ColourScheme::dark}};
+  app.add_option_function<ColourScheme>(
+         "--appearance", [&options](ColourScheme scheme) { options.colourScheme = scheme; },
+         "light or dark; the desktop's otherwise")
+      ->transform(CLI::CheckedTransformer(schemes, CLI::ignore_case));
+  app.add_option("--screenshots", options.screenshots)->group(developers)->check(CLI::ExistingDirectory);
+}
+
+}  // namespace
+
+CommandLine parseCommandLine(int argumentCount, const char* const* arguments) {
+  Options options;
+  CLI::App app("Shows what the cellular modem is doing right now.", "kelvasi");
+  addOptions(app, options);
+  try {
+    app.parse(argumentCount, arguments);
+  } catch (const CLI::Success& success) {
+    return {.options = std::nullopt, .exitStatus = app.exit(success)};
+  } catch (const CLI::ParseError& error) {
+    std::cerr << "kelvasi: " << error.what() << " (try --help)\n";
+    return {.options = std::nullopt, .exitStatus = wrongUsage};
+  }
+  return {.options = std::move(options)};
+}
+
+bool hasDisplay() {
+  const auto isSet = [](const char* name) { return !environment(name).empty(); };
+  return isSet("QT_QPA_PLATFORM") || isSet("WAYLAND_DISPLAY") || isSet("DISPLAY");
+}
+
+std::string logDirectory() {
+  const std::string configured = environment("KELVASI_LOG_DIRECTORY");
+  if (!configured.empty()) return configured;
+  const std::string state = environment("XDG_STATE_HOME");
+  const std::filesystem::path directory =
+      state.empty() ? std::filesystem::path(environment("HOME")) / ".local/state/kelvasi"
+                    : std::filesystem::path(state) / "kelvasi";
+  std::error_code fault;  // told when a snapshot is saved
+  std::filesystem::create_directories(directory, fault);
+  return directory;
+}
+
+}  // namespace kelvasi

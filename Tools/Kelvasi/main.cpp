@@ -1,0 +1,65 @@
+// kelvasi: wires the viewer to its surroundings.
+#include <cstdio>
+
+#include "App/KelvasiApp.h"
+#include "Platform/Plist/LibplistSerialiser.h"
+#include "Platform/Posix/PackageResources.h"
+#include "Platform/Posix/PosixClock.h"
+#include "Platform/Posix/PosixFiles.h"
+#include "Platform/Posix/SystemLogs.h"
+#include "Platform/Posix/TerminateHandler.h"
+#include "Platform/Posix/TraceOutputs.h"
+#include "Platform/Qt/QtMainQueue.h"
+#include "Platform/Qt/QtMessagePorts.h"
+#include "Platform/Qt/QtTelephonyDaemon.h"
+#include "Platform/QtDesktop/QtDateFormatters.h"
+#include "Platform/QtDesktop/QtPreferences.h"
+#include "Platform/QtWidgets/QtApplicationFramework.h"
+#include "Platform/QtWidgets/QtUserInterface.h"
+#include "Tools/Kelvasi/Options.h"
+#include "Tools/Kelvasi/ScreenshotTour.h"
+
+namespace kelvasi {
+
+namespace {
+
+void run(QtApplicationFramework& framework, const Options& options) {
+  SyslogSystemLog log;
+  installTerminateHandler(log);
+  StandardOutputTrace trace;
+  const LibplistSerialiser plists;
+  const PackageResources resources;
+  const PosixClock clock;
+  QtMainQueue queue;
+  QtMessagePorts ports(log);
+  QtTelephonyDaemon daemon(log);
+  QtUserInterface ui({.fullScreen = options.fullScreen, .colourScheme = options.colourScheme});
+  QtPreferences preferences;
+  const QtDateFormatters dateFormatters;
+  PosixFiles files;
+  const AppPlatform platform{
+      .core = {log, trace, plists, resources, clock},
+      .link = {queue, ports, daemon},
+      .shell = {ui, preferences, dateFormatters, files},
+      .paths = {.logDirectory = logDirectory(), .internalInstallMarker = KELVASI_INTERNAL_INSTALL_MARKER}};
+  const ApplicationClasses classes{{"KelvasiApp", [&] { return std::make_unique<KelvasiApp>(platform); }}};
+  const ScreenshotTour tour(options.screenshots);
+  framework.run(classes, "KelvasiApp", "KelvasiApp");
+}
+
+}  // namespace
+
+}  // namespace kelvasi
+
+int main(int argumentCount, char** arguments) {
+  const kelvasi::CommandLine commandLine = kelvasi::parseCommandLine(argumentCount, arguments);
+  if (!commandLine.options) return commandLine.exitStatus;
+  if (!kelvasi::hasDisplay()) {
+    std::fprintf(stderr, "kelvasi: there is no display (neither WAYLAND_DISPLAY nor DISPLAY is set)\n");
+    return 1;
+  }
+  int own = 1;  // the options are all this program's; Qt's has its variables
+  kelvasi::QtApplicationFramework framework(own, arguments);
+  kelvasi::run(framework, *commandLine.options);
+  return 0;
+}

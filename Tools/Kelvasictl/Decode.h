@@ -1,0 +1,42 @@
+// Captures through a generator, with the display ticks that the viewer would have had.
+#pragma once
+
+#include <functional>
+#include <memory>
+
+#include "Capture/CaptureReader.h"
+#include "LogGenerator/LogGenerator.h"
+#include "Tools/Kelvasictl/TickSchedule.h"
+
+namespace kelvasi {
+
+class Decode {
+ public:
+  // Called after each tick with its time, since 1970, and its display, which lasts for the call.
+  using TickHandler = std::function<void(TickSchedule::Time time, const PlistValue& display)>;
+
+  Decode(std::unique_ptr<LogGenerator> generator, TickHandler onTick)
+      : generator_(std::move(generator)), onTick_(std::move(onTick)) {}
+
+  // All messages of a capture, up to its end or fault. An exception of the generator ends the process.
+  void take(CaptureReader& capture);
+  // The tick after the last message; none when there was no message.
+  void finish();
+
+  // The display of the last tick; absent before.
+  const PlistValue& display() const { return display_; }
+  PlistValue saveContents() const { return generator_->getSaveContentsFromState(*state_); }
+
+ private:
+  void update(std::span<const std::uint8_t> message) noexcept { generator_->updateState(*state_, message); }
+  PlistValue generate() noexcept { return generator_->generateLogUsingState(*state_); }
+  void tick(TickSchedule::Time time);
+
+  std::unique_ptr<LogGenerator> generator_;
+  TickHandler onTick_;
+  PlistValue::Dictionary state_ = PlistDictionary::make();
+  TickSchedule schedule_;
+  PlistValue display_;
+};
+
+}  // namespace kelvasi

@@ -1,0 +1,171 @@
+// kelvasictl decode: captures in, the display out.
+#include <CLI/CLI.hpp>
+#include <array>
+#include <vector>
+
+#include "Model/SnapshotFile.h"
+#include "Platform/Posix/Files.h"
+#include "Telvon/TechnologyName.h"
+#include "Tools/Kelvasictl/Decode.h"
+#include "Tools/Kelvasictl/DisplayJson.h"
+#include "Tools/Kelvasictl/StandardStreams.h"
+#include "Tools/Kelvasictl/Surroundings.h"
+#include "Tools/Kelvasictl/ToolError.h"
+#include "Tools/Kelvasictl/TreeText.h"
+#include "Tools/Kelvasictl/Verb.h"
+
+namespace kelvasi {
+
+namespace {
+
+struct DecodeOptions {
+  std::string technology;
+  std::string format = "json";
+  bool everyTick = false;
+  bool startCommand = false;
+  std::string dlf;
+  std::string snapshot;
+  std::string description;
+  std::vector<std::string> captures;
+  SurroundingsOptions surroundings;
+};
+
+std::string inXml(const PlistValue& value, const PlistSerialiser& plists) {
+  if (value.isAbsent()) throw ToolError("there is no display to write as a property list");
+  const auto xml = plists.serialiseXml(value);
+  if (!xml) throw ToolError("the display cannot be written as a property list");
+  return std::string(xml->begin(), xml->end());
+}
+
+struct Format {
+  const char* name;
+  std::string (*text)(const PlistValue& display, const PlistSerialiser& plists);
+};
+constexpr std::array formats{
+    Format{"json", [](const PlistValue& display, const PlistSerialiser&) { return displayJson(display); }},
+    Format{"tree", [](const PlistValue& display, const PlistSerialiser&) { return treeText(display); }},
+    Format{"plist", inXml},
+};
+
+class DecodeVerb {
+ public:
+  explicit DecodeVerb(const DecodeOptions& options)
+      : options_(options), surroundings_(options.surroundings) {}
+
+  int run() {
+    auto generator = LogGenerator::generatorFromTechnology(options_.technology, surroundings_.platform());
+    if (!generator)
+      throw ToolError("there is no generator for " + std::string(shortTechnologyName(options_.technology)));
+    if (options_.startCommand) {
+      printOut(inXml(generator->getStartCommand(), surroundings_.plists));
+      return exitSuccess;
+    }
+    Decode decode(std::move(generator), tickHandler());
+    const auto fault = decodeCaptures(decode);
+    decode.finish();
+    try {
+      if (!options_.everyTick) printDisplay(decode.display());
+      save(decode.saveContents());
+    } catch (const ToolError& error) {
+      if (!fault) throw;
+      throw ToolError(fault->text() + "; " + error.what());  // the capture's fault came first
+    }
+    if (fault) throw ToolError(fault->text());
+    return exitSuccess;
+  }
+
+ private:
+  Decode::TickHandler tickHandler() const {
+    if (!options_.everyTick) return {};
+    return [](TickSchedule::Time time, const PlistValue& display) {
+      printOut(tickJson(std::chrono::duration<double>(time).count(), display));
+    };
+  }
+
+  // Up to the first that has a fault.
+  std::optional<CaptureFault> decodeCaptures(Decode& decode) const {
+    for (const std::string& path : options_.captures) {
+      const auto capture = openCapture(path);
+      decode.take(*capture);
+      if (capture->cutMessages() > 0)
+        complain(path + ": " + std::to_string(capture->cutMessages()) +
+                 " messages are not in the capture as a whole");
+      if (capture->fault()) return capture->fault();
+    }
+    return std::nullopt;
+  }
+
+  void printDisplay(const PlistValue& display) const {
+    for (const Format& format : formats) {
+      if (options_.format == format.name) printOut(format.text(display, surroundings_.plists));
+    }
+  }
+
+  void save(const PlistValue& saveContents) const {
+    if (!options_.dlf.empty()) replace(options_.dlf, dlfIn(saveContents));
+    if (options_.snapshot.empty()) return;
+    const auto snapshot = snapshotDictionary(surroundings_.clock.now(), saveContents, options_.description);
+    const auto xml = surroundings_.plists.serialiseXml(snapshot);
+    if (!xml) throw ToolError(options_.snapshot + ": what is to be saved is no property list");
+    replace(options_.snapshot, *xml);
+  }
+
+  const Bytes& dlfIn(const PlistValue& saveContents) const {
+    const PlistArray* entries = saveContents.array();
+    const PlistValue last = entries && !entries->empty() ? entries->at(entries->size() - 1) : PlistValue();
+    const PlistValue* dlf = last.dictionary() ? last.dictionary()->find("DLF") : nullptr;
+    if (!dlf || !dlf->data()) throw ToolError(options_.dlf + ": there is no DLF file to write");
+    return *dlf->data();
+  }
+
+  static void replace(const std::string& path, const Bytes& bytes) {
+    if (const FileError error = replaceFile(path, bytes)) throw ToolError(*error);
+  }
+
+  const DecodeOptions& options_;
+  Surroundings surroundings_;
+};
+
+std::string readTechnology(std::string& text) {
+  const auto id = technologyId(text);
+  if (!id) return "there is no technology \"" + text + "\"";
+  text = *id;
+  return {};
+}
+
+void addOptions(CLI::App& verb, DecodeOptions& options) {
+  verb.add_option("--technology", options.technology,
+                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
+      ->type_name("TECH")
+      ->transform(CLI::Validator(readTechnology, ""))
+      ->required();
+  verb.add_option("--format", options.format, "json (the default), tree (path TAB value), or plist")
+      ->type_name("FORMAT")
+      ->check(CLI::IsMember({"json", "tree", "plist"}));
+  verb.add_flag("--every-tick", options.everyTick,
+                "a JSON line {\"time\": ..., \"display\": ...} for each display tick");
+  verb.add_option("--dlf", options.dlf, "also write the DLF file that a snapshot would hold")
+      ->type_name("FILE");
+  verb.add_option("--snapshot", options.snapshot, "also write a snapshot")->type_name("FILE");
+  verb.add_option("--description", options.description, "the snapshot's description")->type_name("TEXT");
+  verb.add_flag("--start-command", options.startCommand,
+                "print the command that starts the stream, as a property list, and end");
+  verb.add_option("CAPTURE", options.captures,
+                  "pcap, pcapng or DLF files, in order; - is the standard input");
+  options.surroundings.addTo(verb);
+}
+
+}  // namespace
+
+Action declareDecode(CLI::App& verb) {
+  const auto options = std::make_shared<DecodeOptions>();
+  addOptions(verb, *options);
+  verb.callback([options] {
+    if (!options->startCommand && options->captures.empty()) throw CLI::RequiredError("CAPTURE");
+    if (options->everyTick && options->format != "json")
+      throw CLI::ValidationError("--every-tick", "gives JSON only");
+  });
+  return [options] { return DecodeVerb(*options).run(); };
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,50 @@
+// The model on a live link, inside the event loop of a verb.
+#pragma once
+
+#include <chrono>
+#include <optional>
+#include <string>
+
+#include "Model/KelvasiModel.h"
+#include "Platform/Qt/QtEventLoop.h"
+#include "Platform/Qt/QtMainQueue.h"
+#include "Platform/Qt/QtMessagePorts.h"
+#include "Platform/Qt/QtTelephonyDaemon.h"
+#include "Tools/Kelvasictl/Surroundings.h"
+
+namespace kelvasi {
+
+struct LiveOptions {
+  std::optional<double> seconds;  // nothing: until a signal
+  SurroundingsOptions surroundings;
+
+  void addTo(CLI::App& verb);
+};
+
+class LiveSession {
+ public:
+  // `onUpdate` is called after each display tick that saw new data.
+  LiveSession(const LiveOptions& options, KelvasiModel::ViewControllerUpdate onUpdate);
+
+  KelvasiModel& model() { return model_; }
+  MainQueue& queue() { return queue_; }
+  const Clock& clock() const { return surroundings_.clock; }
+
+  // Connects and runs until SIGINT, SIGTERM, the stated time or end(). What had arrived by a signal is still
+  // taken in. Throws ToolError with what end() was given.
+  void run();
+  // From within run() only.
+  void end(std::optional<std::string> error = std::nullopt);
+
+ private:
+  QtEventLoop loop_;  // first: it wants to be made before all else
+  std::optional<double> seconds_;
+  Surroundings surroundings_;
+  QtMainQueue queue_;
+  QtMessagePorts ports_;
+  QtTelephonyDaemon daemon_;
+  KelvasiModel model_;
+  std::optional<std::string> error_;
+};
+
+}  // namespace kelvasi

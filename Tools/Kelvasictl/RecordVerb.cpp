@@ -1,0 +1,71 @@
+// kelvasictl record: a live link to a capture.
+#include <CLI/CLI.hpp>
+
+#include "Capture/PcapWriter.h"
+#include "Platform/Clock.h"
+#include "Tools/Kelvasictl/LiveSession.h"
+#include "Tools/Kelvasictl/StandardStreams.h"
+#include "Tools/Kelvasictl/ToolError.h"
+#include "Tools/Kelvasictl/Verb.h"
+
+namespace kelvasi {
+
+namespace {
+
+struct RecordOptions {
+  std::string file;
+  LiveOptions live;
+};
+
+std::chrono::nanoseconds sinceEpoch(PlistDate date) {
+  return std::chrono::round<std::chrono::microseconds>(std::chrono::duration<double>(date.secondsSince1970));
+}
+
+// Messages are written as they come and are not decoded, so one that a decoder dies of is kept too.
+class RecordVerb {
+ public:
+  explicit RecordVerb(const RecordOptions& options)
+      : options_(options), writer_(options.file), session_(options.live, [] {}) {
+    if (writer_.error()) throw ToolError(*writer_.error());
+    session_.model().divertMessages([this](std::span<const std::uint8_t> message) { take(message); });
+  }
+
+  int run() {
+    try {
+      session_.run();
+    } catch (const ToolError&) {
+      tellCount();
+      throw;
+    }
+    tellCount();
+    return exitSuccess;
+  }
+
+ private:
+  void take(std::span<const std::uint8_t> message) {
+    if (writer_.write(message, sinceEpoch(session_.clock().now()))) {
+      ++count_;
+    } else {
+      session_.end(writer_.error());
+    }
+  }
+
+  void tellCount() const { complain(std::to_string(count_) + " messages recorded in " + options_.file); }
+
+  const RecordOptions& options_;
+  PcapWriter writer_;
+  LiveSession session_;
+  std::uint64_t count_ = 0;
+};
+
+}  // namespace
+
+Action declareRecord(CLI::App& verb) {
+  const auto options = std::make_shared<RecordOptions>();
+  verb.add_option("FILE", options->file, "the pcap file, created or overwritten; - is the standard output")
+      ->required();
+  options->live.addTo(verb);
+  return [options] { return RecordVerb(*options).run(); };
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,56 @@
+#include "Tools/Kelvasictl/Surroundings.h"
+
+#include <CLI/CLI.hpp>
+#include <filesystem>
+#include <system_error>
+
+#include "Platform/Posix/SystemLogs.h"
+#include "Platform/Posix/TerminateHandler.h"
+#include "Platform/Posix/TraceOutputs.h"
+#include "Tools/Kelvasictl/ToolError.h"
+
+namespace kelvasi {
+
+namespace {
+
+class NoTrace : public TraceOutput {
+ public:
+  void writeLine(std::string_view) override {}
+};
+
+std::unique_ptr<SystemLog> makeLog(bool isStderr) {
+  if (isStderr) return std::make_unique<StderrSystemLog>();
+  return std::make_unique<SyslogSystemLog>("kelvasictl");
+}
+
+std::unique_ptr<TraceOutput> makeTrace(bool isStderr) {
+  if (isStderr) return std::make_unique<StandardErrorTrace>();
+  return std::make_unique<NoTrace>();
+}
+
+std::filesystem::path resourcesDirectory(const SurroundingsOptions& options) {
+  const std::filesystem::path directory =
+      options.resources ? std::filesystem::path(*options.resources) : PackageResources::standardDirectory();
+  std::error_code error;
+  if (std::filesystem::is_directory(directory, error)) return directory;
+  if (!error) error = std::make_error_code(std::errc::not_a_directory);
+  throw ToolError(directory.native() + ": " + error.message());
+}
+
+}  // namespace
+
+void SurroundingsOptions::addTo(CLI::App& verb) {
+  verb.add_option("--resources", resources, "where the display templates are (also KELVASI_RESOURCES)")
+      ->type_name("DIR");
+  verb.add_flag("--log-stderr", logsToStderr,
+                "system-log lines go to the standard error, as \"<N>text\", instead of to syslog");
+}
+
+Surroundings::Surroundings(const SurroundingsOptions& options)
+    : log(makeLog(options.logsToStderr)),
+      trace(makeTrace(options.logsToStderr)),
+      resources(resourcesDirectory(options)) {
+  installTerminateHandler(*log);
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,53 @@
+// kelvasictl: wires the verbs to the command line.
+#include <CLI/CLI.hpp>
+#include <array>
+#include <vector>
+
+#include "Platform/Posix/PackageResources.h"
+#include "Tools/Kelvasictl/StandardStreams.h"
+#include "Tools/Kelvasictl/ToolError.h"
+#include "Tools/Kelvasictl/Verb.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr std::array verbs{
+    Verb{"decode", "decode captures and print the display", declareDecode},
+    Verb{"monitor", "print the display of a live link at every update", declareMonitor},
+    Verb{"record", "record a live link to a capture", declareRecord},
+};
+
+int run(int argumentCount, char** arguments) {
+  CLI::App app("Decodes, watches and records the diagnostic stream of a cellular modem.", "kelvasictl");
+  app.require_subcommand(1);
+  app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
+  std::vector<Action> actions;
+  for (const Verb& verb : verbs) actions.push_back(verb.declare(*app.add_subcommand(verb.name, verb.help)));
+  try {
+    app.parse(argumentCount, arguments);
+  } catch (const CLI::Success& help) {
+    return app.exit(help);
+  } catch (const CLI::ParseError& error) {
+    complain(std::string(error.what()) + " (try --help)");
+    return exitWrongUsage;
+  }
+  for (std::size_t place = 0; place < verbs.size(); ++place) {
+    if (app.got_subcommand(verbs[place].name)) return actions[place]();
+  }
+  return exitWrongUsage;
+}
+
+}  // namespace
+
+}  // namespace kelvasi
+
+int main(int argumentCount, char** arguments) {
+  kelvasi::secureStandardStreams();
+  try {
+    return kelvasi::run(argumentCount, arguments);
+  } catch (const kelvasi::ToolError& error) {
+    kelvasi::complain(error.what());
+    return kelvasi::exitFault;
+  }
+}

@@ -1,0 +1,112 @@
+#include "Tools/TelvonSim/Options.h"
+
+#include <CLI/CLI.hpp>
+
+#include "Simulator/Commands.h"
+#include "Simulator/ScenarioList.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr int wrongUsage = 2;
+
+std::string shortName(std::string_view technology) {
+  return std::string(technology.substr(technology.find('_') + 1));
+}
+
+std::string listOfFaults() {
+  std::string text = "Faults (several at once, each with its own --fault):\n";
+  for (const sim::FaultKind& kind : sim::faultKinds()) {
+    std::string name(kind.name);
+    if (kind.value == sim::FaultKind::Value::required) name += "=" + std::string(kind.valueName);
+    if (kind.value == sim::FaultKind::Value::optional) name += "[=" + std::string(kind.valueName) + "]";
+    name.resize(std::max<std::size_t>(name.size() + 1, 22), ' ');
+    text += "  " + name + std::string(kind.help) + "\n";
+  }
+  return text;
+}
+
+std::string listOfScenarios() {
+  std::string text;
+  for (const sim::ScenarioKind& kind : sim::scenarioKinds()) {
+    std::string name = shortName(kind.technology) + " " + std::string(kind.name);
+    name.resize(std::max<std::size_t>(name.size() + 1, 24), ' ');
+    text += name + std::string(kind.help) + "\n";
+  }
+  return text;
+}
+
+// Both take a text apart for CLI11, whose convention is to return what is wrong with it.
+std::string readTechnology(std::string& text) {
+  const auto id = sim::technologyId(text);
+  if (!id) return "there is no technology \"" + text + "\"";
+  text = *id;
+  return {};
+}
+
+std::string readSpeed(std::string& text) {
+  if (text == "max") text = "0";
+  return {};
+}
+
+void addOptions(CLI::App& app, Options& options) {
+  app.add_option("--technology", options.technology,
+                 "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
+      ->transform(CLI::Validator(readTechnology, "TECH"))
+      ->required();
+  const auto scenario = app.add_option("--scenario", options.scenario, "what to play; see --list-scenarios");
+  app.add_option("--replay", options.replay, "play the messages of a capture, with its timing")
+      ->type_name("CAPTURE")
+      ->excludes(scenario);
+  app.add_flag("--loop", options.isLooping, "begin the capture again when it has ended")->needs("--replay");
+  app.add_flag("--leave", options.leavesAtEnd, "end when the capture has been played")->needs("--replay");
+  app.add_option("--speed", options.speed.factor,
+                 "world seconds per second; \"max\" or 0 is as fast as the applications take it")
+      ->transform(CLI::Validator(readSpeed, "X"))
+      ->check(CLI::Range(0.0, 1e6));
+  app.add_option("--rate", options.rate, "synthetic load: repeat the scenario's messages, N a second")
+      ->type_name("N")
+      ->check(CLI::Range(1e-3, 1e9))
+      ->excludes("--replay");
+  app.add_option("--seed", options.seed, "the same seed gives the same messages")->capture_default_str();
+  app.add_option("--seconds", options.seconds, "end after so many seconds")->check(CLI::Range(0.0, 1e9));
+  app.add_option_function<std::vector<std::string>>(
+         "--fault",
+         [&options](const std::vector<std::string>& requests) {
+           for (const std::string& request : requests) {
+             const std::string wrong = options.faults.add(request);
+             if (!wrong.empty()) throw CLI::ValidationError("--fault", wrong);
+           }
+         },
+         "misbehave; see below")
+      ->type_name("FAULT");
+  app.add_flag_callback(
+      "--list-scenarios",
+      [] {
+        std::cout << listOfScenarios();
+        throw CLI::Success();
+      },
+      "list the scenarios and end");
+}
+
+}  // namespace
+
+CommandLine parseCommandLine(int argumentCount, const char* const* arguments) {
+  Options options;
+  CLI::App app("Plays the telephony daemon: serves log channels and streams what a simulated handset gives.",
+               "telvon-sim");
+  app.footer(listOfFaults());
+  addOptions(app, options);
+  try {
+    app.parse(argumentCount, arguments);
+  } catch (const CLI::Success& success) {
+    return {.options = std::nullopt, .exitStatus = app.exit(success)};
+  } catch (const CLI::ParseError& error) {
+    std::cerr << "telvon-sim: " << error.what() << " (try --help)\n";
+    return {.options = std::nullopt, .exitStatus = wrongUsage};
+  }
+  return {.options = std::move(options)};
+}
+
+}  // namespace kelvasi

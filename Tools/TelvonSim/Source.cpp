@@ -1,0 +1,47 @@
+#include "Tools/TelvonSim/Source.h"
+
+#include <cstdio>
+
+#include "Simulator/LoadSource.h"
+#include "Simulator/ReplaySource.h"
+#include "Simulator/ScenarioList.h"
+
+namespace kelvasi {
+
+namespace {
+
+constexpr int wrongUsage = 2;
+
+SourceResult scenarioSource(const Options& options, const PlistSerialiser& plists) {
+  const sim::ScenarioKind* kind = sim::findScenario(options.technology, options.scenario);
+  if (!kind) {
+    const std::string wanted =
+        options.scenario.empty() ? "scenario" : "scenario \"" + options.scenario + "\"";
+    return {.source = nullptr,
+            .failure = "there is no " + wanted + " for " + options.technology + " (try --list-scenarios)",
+            .exitStatus = wrongUsage};
+  }
+  if (options.rate > 0)
+    return {.source = std::make_unique<sim::LoadSource>(kind->make(options.seed, plists), options.rate)};
+  return {.source = std::make_unique<sim::ScenarioSource>(
+              [kind, seed = options.seed, &plists] { return kind->make(seed, plists); })};
+}
+
+SourceResult replaySource(const Options& options) {
+  SourceResult result;
+  result.source = std::make_unique<sim::ReplaySource>(
+      [path = options.replay] { return openCapture(path); }, options.isLooping,
+      [](const CaptureFault& fault) { std::fprintf(stderr, "telvon-sim: %s\n", fault.text().c_str()); });
+  if (!result.source->nextAt())
+    return {.source = nullptr, .failure = options.replay + ": no messages to play", .exitStatus = 1};
+  return result;
+}
+
+}  // namespace
+
+SourceResult makeSource(const Options& options, const PlistSerialiser& plists) {
+  if (!options.replay.empty()) return replaySource(options);
+  return scenarioSource(options, plists);
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,22 @@
+// What telvon-sim plays, as its command line says.
+#pragma once
+
+#include <memory>
+#include <string>
+
+#include "Platform/PlistSerialiser.h"
+#include "Simulator/MessageSource.h"
+#include "Tools/TelvonSim/Options.h"
+
+namespace kelvasi {
+
+struct SourceResult {
+  std::unique_ptr<sim::MessageSource> source;  // null on failure
+  std::string failure = {};                    // one line
+  int exitStatus = 0;
+};
+
+// `plists` outlives the source.
+SourceResult makeSource(const Options& options, const PlistSerialiser& plists);
+
+}  // namespace kelvasi

@@ -1,0 +1,81 @@
+// telvon-sim: wires the simulated telephony daemon to sockets, the event loop and the command line.
+#include <csignal>
+#include <cstdio>
+
+#include "Platform/Plist/LibplistSerialiser.h"
+#include "Platform/Posix/PosixClock.h"
+#include "Platform/Posix/SystemLogs.h"
+#include "Platform/Posix/TerminateHandler.h"
+#include "Platform/Qt/QtDaemonServerHost.h"
+#include "Platform/Qt/QtEventLoop.h"
+#include "Platform/Qt/QtMainQueue.h"
+#include "Platform/Qt/QtMessagePorts.h"
+#include "Platform/Qt/RuntimeDirectory.h"
+#include "Simulator/Simulation.h"
+#include "Tools/TelvonSim/Options.h"
+#include "Tools/TelvonSim/Source.h"
+
+namespace kelvasi {
+
+namespace {
+
+void complain(const std::string& text) {
+  std::fprintf(stderr, "telvon-sim: %s\n", text.c_str());
+}
+
+std::string shortName(std::string_view technology) {
+  return std::string(technology.substr(technology.find('_') + 1));
+}
+
+int runLoop(QtEventLoop& loop, const std::optional<double>& seconds) {
+  if (!seconds) return loop.run();
+  return loop.runFor(std::chrono::milliseconds(static_cast<std::int64_t>(*seconds * 1000)));
+}
+
+sim::SimulationHandlers handlersFor(QtEventLoop& loop, const Options& options) {
+  return {.die = [] { std::raise(SIGKILL); },
+          .stall = [] { std::raise(SIGSTOP); },
+          .sourceEnded =
+              [&loop, leaves = options.leavesAtEnd] {
+                complain("the capture has been played");
+                if (leaves) loop.quit();
+              }};
+}
+
+int serve(const Options& options) {
+  QtEventLoop loop;
+  StderrSystemLog log;
+  installTerminateHandler(log);
+  const LibplistSerialiser plists;
+  const PosixClock clock;
+  QtMainQueue queue;
+  QtMessagePorts ports(log);
+  QtDaemonServerHost host(log);
+
+  SourceResult made = makeSource(options, plists);
+  if (!made.source) {
+    complain(made.failure);
+    return made.exitStatus;
+  }
+  const auto directory = RuntimeDirectory::open(log);
+  if (!directory) return 1;
+  sim::Simulation simulation({.daemon = {log, ports, plists}, .queue = queue, .clock = clock},
+                             options.technology, options.faults, std::move(made.source), options.speed,
+                             handlersFor(loop, options));
+  if (!simulation.serve(host)) {
+    complain("cannot serve in " + directory->path());
+    return 1;
+  }
+  complain("serving " + shortName(options.technology) + " in " + directory->path());
+  runLoop(loop, options.seconds);
+  return 0;
+}
+
+}  // namespace
+
+}  // namespace kelvasi
+
+int main(int argumentCount, char** arguments) {
+  const kelvasi::CommandLine commandLine = kelvasi::parseCommandLine(argumentCount, arguments);
+  return commandLine.options ? kelvasi::serve(*commandLine.options) : commandLine.exitStatus;
+}
