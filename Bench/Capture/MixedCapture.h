@@ -1,0 +1,14 @@
+// Captures for the benchmarks, made in the build directory.
+#pragma once
+
+#include <string>
+
+#include "Bench/LogGenerator/Samples.h"
+
+namespace kelvasi::bench {
+
+// The path of a pcap file with this many messages of the technology's mixture, 2000 for each second of its
+// time. Throws std::runtime_error when it cannot be written.
+std::string writeMixedCapture(const Technology& technology, std::size_t count);
+
+}  // namespace kelvasi::bench

@@ -1,0 +1,46 @@
+#include "Bench/LogGenerator/C2K/C2KSamples.h"
+
+#include "LogGenerator/C2K/EvdoActiveSet.h"
+#include "LogGenerator/C2K/EvdoRates.h"
+#include "LogGenerator/C2K/EvdoStatus.h"
+#include "LogGenerator/C2K/Fingers.h"
+
+namespace kelvasi::bench {
+
+namespace {
+
+constexpr EntryList pilots{.count = fieldIn(evdoActiveSet::layout, "count"),
+                           .start = evdoActiveSet::firstPilot,
+                           .stride = evdoActiveSet::pilotSize,
+                           .layout = evdoActiveSet::pilotLayout};
+constexpr EntryList allFingers{.count = fieldIn(fingers::layout, "count"),
+                               .start = fingers::firstFinger,
+                               .stride = fingers::fingerSize,
+                               .layout = fingers::fingerLayout};
+
+}  // namespace
+
+std::span<const Sample> c2kSamples() {
+  static constexpr std::array samples{
+      Sample{"0x1183 EV-DO status", 10, evdoStatus::logCode, evdoStatus::length, evdoStatus::layout, 6},
+      Sample{"0x1192 EV-DO forward rate", 5, evdoForwardRate::logCode, evdoForwardRate::minimumLength,
+             evdoForwardRate::layout},
+      Sample{"0x127E EV-DO reverse rate", 5, evdoReverseRate::logCode, evdoReverseRate::minimumLength,
+             evdoReverseRate::layout},
+      Sample{.name = "0x12B6 6 EV-DO pilots",
+             .share = 10,
+             .logCode = evdoActiveSet::logCode,
+             .length = evdoActiveSet::minimumLength,
+             .layout = evdoActiveSet::layout,
+             .lists = {{{pilots, 6}}}},
+      Sample{.name = "0x108A 6 fingers",
+             .share = 10,
+             .logCode = fingers::logCode,
+             .length = fingers::minimumLength,
+             .layout = fingers::layout,
+             .lists = {{{allFingers, 6}}}},
+  };
+  return samples;
+}
+
+}  // namespace kelvasi::bench

@@ -1,0 +1,9 @@
+#pragma once
+
+#include "Bench/LogGenerator/Samples.h"
+
+namespace kelvasi::bench {
+
+std::span<const Sample> c2kSamples();
+
+}  // namespace kelvasi::bench

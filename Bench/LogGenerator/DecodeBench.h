@@ -1,0 +1,15 @@
+// Decoding, record type by record type and in mixtures.
+#pragma once
+
+#include "Bench/LogGenerator/Samples.h"
+#include "Bench/Support/Baselines.h"
+
+namespace kelvasi::bench {
+
+// What each message alone makes a display show, for the comparison with a plain program.
+std::vector<PlainRows> rowsOfEach(std::string_view technology, const Messages& messages);
+
+void addRecordDecoding(Table& table);
+void addMixtureDecoding(Table& table);
+
+}  // namespace kelvasi::bench

@@ -1,0 +1,9 @@
+#pragma once
+
+#include "Bench/LogGenerator/Samples.h"
+
+namespace kelvasi::bench {
+
+std::span<const Sample> gsmSamples();
+
+}  // namespace kelvasi::bench

@@ -1,0 +1,9 @@
+#pragma once
+
+#include "Bench/LogGenerator/Samples.h"
+
+namespace kelvasi::bench {
+
+std::span<const Sample> utranSamples();
+
+}  // namespace kelvasi::bench
