@@ -252,12 +252,31 @@ TEST_F(Session, ATickThatFindsTheDeathStillConsumesTheDataThatHadCome) {
   EXPECT_EQ(updates, 1);
 }
 
-TEST_F(Session, ARestartKeepsTheState) {
+TEST_F(Session, ARestartKeepsTheStateAndItsRowsGoOnMoving) {
   model.startMonitor();
   link.receive(0, test::record(0x7131, "13", 16));
+  const LogGenerator* const before = model.logGenerator();
   *link.remoteValid = false;
   queue.advance(2s);
+  ASSERT_NE(model.logGenerator(), before);
   EXPECT_EQ(*model.nodeAtPath("/Process CO/MM State")->value(), "MM_IDLE");
+  link.receive(0, test::record(0x7131, "06", 16));
+  queue.advance(2s);
+  EXPECT_EQ(*model.nodeAtPath("/Process CO/MM State")->value(), "MM_CONNECTION_ACTIVE");
+}
+
+TEST_F(Session, AfterAChangeOfTechnologyTheOldDisplayStays) {
+  model.startMonitor();
+  link.receive(0, test::record(0x7131, "13", 16));
+  answerTechnology(kTelvonLogChannelTechnology_Orvane_LTE);
+  resources.files["LTE.plist"] =
+      plists.standFor(PlistDictionary::make({{"Serving Cell Info", PlistDictionary::make()}}));
+  *link.remoteValid = false;
+  queue.advance(2s);
+  link.receive(0, test::record(0xB0C0, "", 40));
+  queue.advance(2s);
+  EXPECT_EQ(*model.nodeAtPath("/Process CO/MM State")->value(), "MM_IDLE");
+  EXPECT_EQ(model.topLevelNodes()->childNodes()->size(), 2u);
 }
 
 TEST_F(Session, RestartsWhenTheReceivePortIsInvalidatedFromOutside) {
