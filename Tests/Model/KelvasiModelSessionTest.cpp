@@ -63,6 +63,24 @@ TEST_F(Session, SendsItsCommandsWithTheStatedTimeouts) {
   EXPECT_EQ(link.sent[1].reply, RemotePort::Reply::none);
 }
 
+TEST_F(Session, ConfiguringWithoutAPortFailsAsWithADeadOne) {
+  model.configureGenerator();
+  EXPECT_THAT(errors(), ElementsAre(" ***** Could not send the GetTechnology command (got error=-3)"));
+  EXPECT_EQ(model.logGenerator(), nullptr);
+}
+
+TEST_F(Session, PortsThatAreMadeAgainReplaceThoseThatAreThere) {
+  ASSERT_TRUE(model.createPorts());
+  const auto firstLocal = link.localValid;
+  const auto firstRemote = link.remoteValid;
+  surroundings.log.clear();
+  ASSERT_TRUE(model.createPorts());
+  EXPECT_FALSE(*firstLocal);
+  EXPECT_FALSE(*firstRemote);
+  EXPECT_THAT(errors(), ElementsAre(createdPorts));
+  EXPECT_TRUE(model.isConnected());
+}
+
 TEST_F(Session, ASecondStartWhileTheTimerRunsDoesNothing) {
   model.startMonitor();
   model.startMonitor();
