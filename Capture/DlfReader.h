@@ -2,13 +2,11 @@
 //
 // - A version report at the beginning is no message.
 // - A message keeps the log type and prefix that stand before its record. A record without one becomes a
-// message
-//   of log type 1, or 0xFF, one of the daemon's own, when its payload is a property list.
+//   message of log type 1, or 0xFF, one of the daemon's own, when its payload is a property list.
 // - The time stamp is taken for CDMA system time as 3GPP2 C.S0002 has it: since 6 January 1980, the upper 48
-// bits
-//   in units of 1.25 ms, the lower 16 a fraction of that; leap seconds are not taken off. A record without a
-//   stamp has the time of the one before; at the beginning of the file, that of the first stamp, or 1970
-//   where there is no stamp at all.
+//   bits in units of 1.25 ms, the lower 16 a fraction of that; leap seconds are not taken off. A record
+//   without a stamp has the time of the one before; at the beginning of the file, that of the first stamp, or
+//   1970 where there is no stamp at all.
 // - Records are found by their lengths, so a message whose length field is wrong ends what can be read of a
 //   snapshot's DLF file.
 #pragma once

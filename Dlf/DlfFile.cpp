@@ -26,16 +26,20 @@ DlfCreationTime creationTime(const Clock& clock) {
 
 }  // namespace
 
-std::optional<Bytes> beginDlf(const Platform& platform) {
-  Bytes dlf(dlfVersionReportSize);
+bool writeDlfHeader(const Platform& platform, std::span<std::uint8_t> header) {
   std::uint32_t written = 0;
   const int result =
-      QuarnDLFAddVersionReport(dlf, written, 1, 1, versionText(platform.resources), "EXECUTABLE_NAME",
+      QuarnDLFAddVersionReport(header, written, 1, 1, versionText(platform.resources), "EXECUTABLE_NAME",
                                platform.resources.buildTime(), creationTime(platform.clock));
   if (result != dlfSuccess) {
     platform.log.print(LogPriority::dlf, "Could not write DLF header (result=%d)", result);
-    return std::nullopt;
   }
+  return result == dlfSuccess;
+}
+
+std::optional<Bytes> beginDlf(const Platform& platform) {
+  Bytes dlf(dlfVersionReportSize);
+  if (!writeDlfHeader(platform, dlf)) return std::nullopt;
   return dlf;
 }
 

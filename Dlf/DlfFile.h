@@ -9,6 +9,10 @@
 
 namespace kelvasi {
 
+// Writes the version report to the beginning of `header`. False, with a line in the system log, where it
+// finds no room.
+bool writeDlfHeader(const Platform& platform, std::span<std::uint8_t> header);
+
 // A file that holds the version report only. Nothing, with a line in the system log, when the report failed.
 std::optional<Bytes> beginDlf(const Platform& platform);
 

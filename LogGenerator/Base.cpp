@@ -18,7 +18,7 @@ void Base::updateLogCodeDict(CodeDictionary& codeDict) {
 }
 
 void Base::updateSectionRef(PlistValue container) {
-  sectionRef_ = std::move(container);
+  moveToSection(std::move(container));
   trace(getSectionName());
 }
 

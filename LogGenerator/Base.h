@@ -35,6 +35,8 @@ class Base {
   // The container that the decoder writes into from now on: a dictionary or an array, shared with the
   // display.
   void updateSectionRef(PlistValue container);
+  // The same without a line in the system log: for a display that is shown already.
+  void moveToSection(PlistValue container) { sectionRef_ = std::move(container); }
 
   // Abstract: on Base itself each throws UnimplementedMethodError.
   virtual void updateWithData(RecordView record, LogCode logCode);

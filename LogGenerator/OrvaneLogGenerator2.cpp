@@ -1,5 +1,6 @@
 #include "LogGenerator/OrvaneLogGenerator2.h"
 
+#include <algorithm>
 #include <charconv>
 #include <stdexcept>
 #include <utility>
@@ -19,6 +20,10 @@ PlistValue storable(PlistValue value) {
   if (value.isAbsent())
     throw std::invalid_argument("a display template may hold strings, dictionaries and arrays only");
   return value;
+}
+
+bool isSameContainer(const PlistValue& one, const PlistValue& other) {
+  return one.dictionary() == other.dictionary() && one.array() == other.array();
 }
 
 // Logs ahead of what the base's construction logs.
@@ -90,7 +95,14 @@ PlistValue OrvaneLogGenerator2::getStartCommand() const {
 }
 
 PlistValue OrvaneLogGenerator2::getDisplayFromState(PlistDictionary& state) {
-  if (const PlistValue* display = state.find("Display")) return *display;
+  if (const PlistValue* display = state.find("Display")) {
+    if (!isSameContainer(*display, bound_)) {
+      const PlistValue* shape = state.find("Template");
+      bindSections(shape ? *shape : *display, *display);
+      bound_ = *display;
+    }
+    return *display;
+  }
   if (!cIndex_ || !state.find("Template")) {
     const PlistValue loaded = loadTemplate();
     if (loaded.isAbsent()) {
@@ -104,6 +116,7 @@ PlistValue OrvaneLogGenerator2::getDisplayFromState(PlistDictionary& state) {
   cIndex_->status();
   const PlistValue display = processTemplate(state.get("Template"));
   printDict(display);
+  bound_ = display;
   state.set("Display", display);
   state.set("ExtraInfo", PlistDictionary::make());
   return {};
@@ -135,6 +148,25 @@ PlistValue OrvaneLogGenerator2::processTemplate(const PlistValue& object) {
   platform().log.print(LogPriority::error, "%s", unknownObject);
   platform().log.print(LogPriority::warning, "Processing the template");
   return {};
+}
+
+// In the order of processTemplate, so that the same occurrence of a section wins.
+void OrvaneLogGenerator2::bindSections(const PlistValue& displayTemplate, const PlistValue& display) {
+  const PlistDictionary* entries = displayTemplate.dictionary();
+  if (entries && display.dictionary()) {
+    for (const auto& [key, value] : *entries) {
+      const PlistValue section = display.dictionary()->get(key);
+      if (section.isAbsent()) continue;
+      bindSections(value, section);
+      if (Base* decoder = cIndex_ ? cIndex_->getClass(key) : nullptr) decoder->moveToSection(section);
+    }
+  }
+  const PlistArray* elements = displayTemplate.array();
+  if (elements && display.array()) {
+    const std::size_t count = std::min(elements->size(), display.array()->size());
+    for (std::size_t place = 0; place < count; ++place)
+      bindSections(elements->at(place), display.array()->at(place));
+  }
 }
 
 void OrvaneLogGenerator2::printDict(const PlistValue& object) const {

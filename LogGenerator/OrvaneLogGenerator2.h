@@ -32,14 +32,20 @@ class OrvaneLogGenerator2 : public OrvaneLogGenerator {
   PlistValue processTemplate(const PlistValue& object);
   // Complains in the system log about every element of a processed template that does not belong into one.
   void printDict(const PlistValue& object) const;
-  // The state's display. The call that builds it returns nothing; every later one returns it.
+  // The state's display. The call that builds it returns nothing; every later one returns it. A display that
+  // the state already held, left there by another generator, stays as it is: the decoders are bound to those
+  // of its sections that are theirs, and the others have nowhere to write.
   PlistValue getDisplayFromState(PlistDictionary& state);
 
  private:
   PlistValue loadTemplate() const;
+  // Binds the decoders to the sections of a display that stands, as far as it has the template's shape. What
+  // decoders added to it is not looked into.
+  void bindSections(const PlistValue& displayTemplate, const PlistValue& display);
 
   std::string pListName_;
   std::unique_ptr<ClassIndex> cIndex_;  // null without template
+  PlistValue bound_;                    // the display that the decoders write into
 };
 
 }  // namespace kelvasi

@@ -131,8 +131,10 @@ std::optional<Bytes> KelvasiModel::askForTechnology() {
     platform_.log.print(LogPriority::error, " Could not generate GetTechnology command; cannot configure");
     return std::nullopt;
   }
-  const SendResult result = sendPort_->sendRequest(logMessageId, *command, sendTimeout, technologyTimeout,
-                                                   RemotePort::Reply::awaited);
+  // Without a port the outcome is that of a port that is no longer valid.
+  const SendResult result = sendPort_ ? sendPort_->sendRequest(logMessageId, *command, sendTimeout,
+                                                               technologyTimeout, RemotePort::Reply::awaited)
+                                      : SendResult{};
   if (result.status != SendStatus::success) {
     platform_.log.print(LogPriority::error, " ***** Could not send the GetTechnology command (got error=%d)",
                         static_cast<int>(result.status));

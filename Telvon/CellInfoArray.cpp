@@ -1,5 +1,7 @@
 #include "Telvon/CellInfoArray.h"
 
+#include <cmath>
+#include <limits>
 #include <utility>
 
 #include "Platform/PlistSerialiser.h"
@@ -13,6 +15,13 @@ namespace {
 bool holds(const PlistDictionary& cell, std::string_view key, std::string_view text) {
   const PlistValue* value = cell.find(key);
   return value && value->string() && *value->string() == text;
+}
+
+std::optional<std::int32_t> wholeNumber(double real) {
+  using Limits = std::numeric_limits<std::int32_t>;
+  const bool isInRange = real >= Limits::min() && real <= Limits::max();  // false for what is no number
+  if (!isInRange || real != std::trunc(real)) return std::nullopt;
+  return static_cast<std::int32_t>(real);
 }
 
 }  // namespace
@@ -35,7 +44,7 @@ std::optional<std::int32_t> cellNumber(const PlistDictionary& cell, std::string_
   if (value && value->integer() && std::in_range<std::int32_t>(*value->integer())) {
     return static_cast<std::int32_t>(*value->integer());
   }
-  return std::nullopt;
+  return value && value->real() ? wholeNumber(*value->real()) : std::nullopt;
 }
 
 }  // namespace kelvasi

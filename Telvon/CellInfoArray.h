@@ -28,7 +28,8 @@ class CellInfoArray {
 // Whether a cell has both a technology and a type entry, equal to these.
 bool isCell(const PlistDictionary& cell, std::string_view technology, std::string_view type);
 
-// A number of a cell; nothing when it is missing or not an integer of 32 bits with sign.
+// A number of a cell, an integer or a whole real; nothing when it is missing, no number, or does not fit into
+// 32 bits with sign.
 std::optional<std::int32_t> cellNumber(const PlistDictionary& cell, std::string_view key);
 
 }  // namespace kelvasi

@@ -9,8 +9,7 @@
 namespace kelvasi {
 
 // Walks a template into `display`, a dictionary, with empty leaves, and into a lookup table: a name to the
-// entries
-// ("key" and "dict") of the leaves that it fills, in the order of the walk.
+// entries ("key" and "dict") of the leaves that it fills, in the order of the walk.
 void fillFromTemplate(const PlistDictionary& displayTemplate, const PlistValue& display,
                       PlistDictionary& lookup, SystemLog& log);
 

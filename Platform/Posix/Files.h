@@ -12,7 +12,7 @@
 
 namespace kelvasi {
 
-// What went wrong, for people: "/tmp/a.pcap: No such file or directory". Nothing when all went well.
+// What went wrong, for people: "drive.pcap: No such file or directory". Nothing when all went well.
 using FileError = std::optional<std::string>;
 
 struct FileContents {

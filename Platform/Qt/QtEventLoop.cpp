@@ -4,6 +4,8 @@
 #include <sys/signalfd.h>
 
 #include <QCoreApplication>
+#include <QDeadlineTimer>
+#include <QEventLoop>
 #include <QSocketNotifier>
 #include <QTimer>
 #include <csignal>
@@ -70,6 +72,14 @@ int QtEventLoop::runFor(std::chrono::milliseconds duration) {
   QObject::connect(&limit, &QTimer::timeout, &QCoreApplication::quit);
   limit.start(duration);
   return run();
+}
+
+// NOLINTNEXTLINE(readability-convert-member-functions-to-static): of this loop, for the caller
+void QtEventLoop::drain(std::chrono::milliseconds limit) {
+  const QDeadlineTimer deadline(limit);
+  QEventLoop turn;
+  while (turn.processEvents() && !deadline.hasExpired()) {
+  }
 }
 
 // NOLINTNEXTLINE(readability-convert-member-functions-to-static): of this loop, for the caller

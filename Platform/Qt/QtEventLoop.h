@@ -23,6 +23,9 @@ class QtEventLoop {
   int run();
   // The same, `duration` long at most; 0 when it has passed.
   int runFor(std::chrono::milliseconds duration);
+  // Handles what is there without waiting for anything, until a turn finds nothing; where things keep coming,
+  // until `limit` has passed.
+  void drain(std::chrono::milliseconds limit);
   // Ends run() in the present turn; without effect outside of run().
   void quit();
 

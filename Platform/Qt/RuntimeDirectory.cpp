@@ -22,7 +22,7 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr mode_t privateMode = 0700;
-constexpr mode_t accessBits = 0777;
+constexpr mode_t modeBits = 07777;
 constexpr auto lockPatience = 1000ms;
 constexpr auto lockInterval = 5ms;
 
@@ -37,18 +37,27 @@ std::string pathFromEnvironment() {
   return shared.empty() ? shared : shared + "/telvon";
 }
 
+// One that is made where directories hand their group on has a bit more than was asked for.
+void dropInheritedBits(const std::string& path) {
+  const FileDescriptor made(::open(path.c_str(), O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC));
+  if (made) ::fchmod(made.get(), privateMode);
+}
+
 // Why the directory cannot be trusted; empty when it can.
 std::string faultOf(const std::string& path) {
   if (path.empty()) return "neither TELVON_RUNTIME_DIR nor XDG_RUNTIME_DIR is set";
   if (path.front() != '/') return "not an absolute path";
-  if (::mkdir(path.c_str(), privateMode) != 0 && errno != EEXIST)
+  if (::mkdir(path.c_str(), privateMode) == 0) {
+    dropInheritedBits(path);
+  } else if (errno != EEXIST) {
     return std::string("cannot be made: ") + std::strerror(errno);
+  }
   struct stat found {};
   if (::lstat(path.c_str(), &found) != 0) return std::strerror(errno);
   if (S_ISLNK(found.st_mode)) return "is a symbolic link";
   if (!S_ISDIR(found.st_mode)) return "is not a directory";
   if (found.st_uid != ::geteuid()) return "belongs to another user";
-  if ((found.st_mode & accessBits) != privateMode) return "its mode is not 0700";
+  if ((found.st_mode & modeBits) != privateMode) return "its mode is not 0700";
   return {};
 }
 

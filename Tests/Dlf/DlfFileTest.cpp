@@ -56,6 +56,15 @@ TEST(DlfFile, HoldsTheZoneInMinutesTruncatedTowardZero) {
   }
 }
 
+TEST(DlfFile, SaysWhenTheHeaderFindsNoRoom) {
+  test::TestPlatform surroundings;
+  Bytes tooShort(160, 0xAA);
+  EXPECT_FALSE(writeDlfHeader(surroundings.platform(), tooShort));
+  EXPECT_EQ(surroundings.log.lines(LogPriority::dlf),
+            std::vector<std::string>{"Could not write DLF header (result=3)"});
+  EXPECT_EQ(tooShort, Bytes(160, 0xAA));
+}
+
 TEST(DlfFile, FlagsDaylightSaving) {
   test::TestPlatform surroundings;
   EXPECT_EQ(part(*beginDlf(surroundings.platform()), 87, 2), hex("0000"));

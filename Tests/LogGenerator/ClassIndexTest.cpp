@@ -3,6 +3,10 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <functional>
+#include <future>
+
+#include "LogGenerator/ArrayLock.h"
 #include "LogGenerator/Exceptions.h"
 #include "LogGenerator/RowList.h"
 #include "Tests/Support/HexBytes.h"
@@ -72,6 +76,30 @@ TEST(ClassIndex, StatusSaysWhatTheClassDictionaryIs) {
   EXPECT_THAT(surroundings.log.warnings(), ElementsAre("Dictionary = 1", "String = 0"));
 }
 
+// Notes in the trace that it goes.
+template <int number>
+class Going : public First {
+ public:
+  using First::First;
+  ~Going() override { platform().trace.writeLine("decoder " + std::to_string(number)); }
+};
+
+class ThreeDecoders : public ClassIndex {
+ public:
+  using ClassIndex::ClassIndex;
+  ~ThreeDecoders() override { deallocWith("Deallocing ThreeDecoders"); }
+  Going<1>& first = create<Going<1>>();
+  Going<2>& second = create<Going<2>>();
+  Going<3>& third = create<Going<3>>();
+};
+
+TEST(ClassIndex, ReleasesItsDecodersInTheOrderOfCreationAfterItsLine) {
+  test::TestPlatform surroundings;
+  { const ThreeDecoders index(surroundings.platform()); }
+  EXPECT_THAT(surroundings.trace.lines, ElementsAre("Deallocing ThreeDecoders", "decoder 1", "decoder 2",
+                                                    "decoder 3", "Deallocing ClassIndex"));
+}
+
 TEST(ClassIndex, SaysToTheStandardOutputThatItGoes) {
   test::TestPlatform surroundings;
   { const TwoDecoders index(surroundings.platform()); }
@@ -100,6 +128,52 @@ TEST(Base, ReplacesAndClearsAnArrayInPlace) {
   EXPECT_EQ(shown, PlistValue(PlistArray::make({"a", "b"})));
   Base::clearElementsInArray(*section);
   EXPECT_EQ(shown, PlistValue(PlistArray::make()));
+}
+
+// What another thread does under the array lock.
+std::future<std::size_t> sizeSeenUnderTheLock(const PlistArray& array) {
+  return std::async(std::launch::async, [&array] {
+    const ArrayGuard guard;
+    return array.size();
+  });
+}
+
+bool hasToWait(const std::future<std::size_t>& other) {
+  return other.wait_for(std::chrono::milliseconds(100)) == std::future_status::timeout;
+}
+
+// An element that calls back while the array that held it alone lets go of it.
+PlistValue elementThatTells(std::function<void()> onRelease) {
+  return PlistValue::Data(new Bytes, [onRelease](const Bytes* bytes) {
+    onRelease();
+    delete bytes;  // NOLINT(cppcoreguidelines-owning-memory): as every deleter does
+  });
+}
+
+TEST(Base, AReaderOfAnArrayThatIsBeingReplacedWaitsAndSeesAllOfTheNewOne) {
+  std::future<std::size_t> reader;
+  bool waited = false;
+  const auto section = PlistArray::make();
+  section->append(elementThatTells([&] {
+    reader = sizeSeenUnderTheLock(*section);
+    waited = hasToWait(reader);
+  }));
+  Base::replaceArrayWith(*section, PlistArray{"a", "b", "c"});
+  EXPECT_TRUE(waited);
+  EXPECT_EQ(reader.get(), 3u);
+}
+
+TEST(Base, AReaderOfAnArrayThatIsBeingClearedWaitsAndSeesItEmpty) {
+  std::future<std::size_t> reader;
+  bool waited = false;
+  const auto section = PlistArray::make({"first"});
+  section->append(elementThatTells([&] {
+    reader = sizeSeenUnderTheLock(*section);
+    waited = hasToWait(reader);
+  }));
+  Base::clearElementsInArray(*section);
+  EXPECT_TRUE(waited);
+  EXPECT_EQ(reader.get(), 0u);
 }
 
 TEST(RowList, UsesTheDictionariesOfTheLastRoundAgain) {

@@ -211,6 +211,105 @@ TEST(OrvaneLogGenerator2, ANewStateBuildsANewDisplayAndBindsTheDecodersToIt) {
             displayWith(PlistDictionary::make({{"16711681", "13"}})));
 }
 
+// Another generator for a state that has been filled before, as after a reconnection.
+struct Successor {
+  explicit Successor(Fixture& before) : state(before.state) { surroundings.log.clear(); }
+  void take(const Bytes& message) { generator.updateState(state, message); }
+  PlistValue tick() { return generator.generateLogUsingState(state); }
+
+  test::TestPlatform surroundings;
+  OrvaneLogGenerator2 generator{surroundings.platform(), "T",
+                                std::make_unique<RecorderIndex>(surroundings.platform())};
+  PlistDictionary& state;
+};
+
+TEST(OrvaneLogGenerator2, ANewGeneratorFillsTheDisplayThatTheStateHolds) {
+  Fixture before(simpleTemplate());
+  before.take(record(0xB0C0, "", 20));
+  const PlistDictionary* const display = before.tick().dictionary();
+  Successor after(before);
+  after.take(record(0xB0C0, "", 21));
+  EXPECT_EQ(after.tick(), displayWith(PlistDictionary::make({{"45248", "21"}})));
+  after.take(record(0xFF0001, "", 22));
+  EXPECT_EQ(after.tick(), displayWith(PlistDictionary::make({{"45248", "21"}, {"16711681", "22"}})));
+  EXPECT_EQ(after.tick().dictionary(), display);
+  EXPECT_THAT(after.surroundings.log.errors(), IsEmpty());
+  EXPECT_THAT(after.surroundings.log.warnings(), IsEmpty());
+}
+
+TEST(OrvaneLogGenerator2, ANewGeneratorBindsOnATickToo) {
+  Fixture before(simpleTemplate());
+  before.take(record(0xB0C0, "", 20));
+  Successor after(before);
+  EXPECT_EQ(after.tick(), displayWith(PlistDictionary::make({{"45248", "20"}})));
+  after.take(record(0xB0C0, "", 21));
+  EXPECT_EQ(after.tick(), displayWith(PlistDictionary::make({{"45248", "21"}})));
+}
+
+TEST(OrvaneLogGenerator2, ANewGeneratorBindsTheSameOccurrenceOfASection) {
+  Fixture before(PlistDictionary::make(
+      {{"A", PlistDictionary::make({{"Recorded", PlistDictionary::make()}})},
+       {"L", PlistArray::make(
+                 {PlistDictionary::make({{"Recorded", PlistDictionary::make({{"45248", "none yet"}})}})})}}));
+  before.tick();
+  Successor after(before);
+  after.take(record(0xB0C0, "", 20));
+  const PlistValue display = after.tick();
+  EXPECT_TRUE(display.dictionary()->get("A").dictionary()->get("Recorded").dictionary()->empty());
+  const PlistValue inList = display.dictionary()->get("L").array()->at(0).dictionary()->get("Recorded");
+  EXPECT_EQ(inList, PlistValue(PlistDictionary::make({{"45248", "20"}})));
+}
+
+TEST(OrvaneLogGenerator2, RowsThatADecoderAddedAreNotTakenForSections) {
+  Fixture before(
+      PlistDictionary::make({{"Recorded", PlistDictionary::make()}, {"List", PlistArray::make()}}));
+  before.tick();
+  const PlistValue entry = PlistDictionary::make({{"Recorded", PlistDictionary::make()}});
+  before.tick().dictionary()->get("List").array()->append(entry);
+  Successor after(before);
+  after.take(record(0xB0C0, "", 20));
+  EXPECT_EQ(after.tick().dictionary()->get("Recorded"), PlistValue(PlistDictionary::make({{"45248", "20"}})));
+  EXPECT_TRUE(entry.dictionary()->get("Recorded").dictionary()->empty());
+}
+
+TEST(OrvaneLogGenerator2, ADisplayOfAnotherTechnologyStaysAndTheSectionsThatItLacksAreUnbound) {
+  Fixture before(PlistDictionary::make({{"Other", PlistDictionary::make({{"row", "text"}})}}));
+  before.tick();
+  Successor after(before);
+  after.surroundings.resources.files["T.plist"] = after.surroundings.plists.standFor(simpleTemplate());
+  after.take(record(0xB0C0, "", 20));
+  EXPECT_EQ(after.tick(),
+            PlistValue(PlistDictionary::make({{"Other", PlistDictionary::make({{"row", "text"}})}})));
+  EXPECT_THAT(after.surroundings.log.errors(), IsEmpty());
+}
+
+TEST(OrvaneLogGenerator2, ADisplayWithoutATemplateIsWalkedItself) {
+  Fixture fixture{PlistValue()};
+  const auto rows = PlistDictionary::make();
+  fixture.state.set("Display",
+                    PlistDictionary::make({{"A", PlistArray::make({"text"})}, {"Recorded", rows}}));
+  fixture.take(record(0xB0C0, "", 20));
+  EXPECT_EQ(PlistValue(rows), PlistValue(PlistDictionary::make({{"45248", "20"}})));
+}
+
+TEST(OrvaneLogGenerator2, ADisplayThatIsATextStays) {
+  Fixture fixture(simpleTemplate());
+  fixture.state.set("Display", "text");
+  fixture.take(record(0xB0C0, "", 20));
+  EXPECT_EQ(fixture.tick(), PlistValue("text"));
+}
+
+TEST(OrvaneLogGenerator2, BuildingTheDisplayNamesIndexAndGeneratorThenTheIndexsStatus) {
+  Fixture fixture(simpleTemplate());
+  fixture.surroundings.log.clear();
+  fixture.tick();
+  EXPECT_THAT(fixture.surroundings.log.warnings(), ElementsAre("Initialized class index: <ptr>, Self: <ptr>",
+                                                               "Dictionary = 1", "String = 0", "Recorded"));
+  fixture.surroundings.log.clear();
+  fixture.tick();
+  EXPECT_THAT(fixture.surroundings.log.warnings(), IsEmpty());
+}
+
 TEST(OrvaneLogGenerator2, WithoutDecodersItShowsNothingEvenWhereATemplateIsThere) {
   struct Bare : OrvaneLogGenerator2 {
     explicit Bare(const Platform& platform) : OrvaneLogGenerator2(platform) {}

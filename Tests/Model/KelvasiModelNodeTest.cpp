@@ -3,6 +3,11 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cstdlib>
+#include <future>
+
+#include "LogGenerator/ArrayLock.h"
+
 namespace kelvasi {
 namespace {
 
@@ -35,6 +40,50 @@ TEST(KelvasiModelNode, ASingleStringIsALeafAtTheRoot) {
 TEST(KelvasiModelNode, AnAbsentDisplayIsALeafOfUnknownKind) {
   const Tree tree{PlistValue()};
   EXPECT_EQ(*tree.root->value(), "(unknown)");
+}
+
+// Builds a tree on a thread of its own.
+std::future<void> treeBuiltElsewhere(const PlistValue& display) {
+  return std::async(std::launch::async, [&display] { const Tree tree(display); });
+}
+
+TEST(KelvasiModelNode, AnArrayIsWalkedUnderTheArrayLock) {
+  const PlistValue display = PlistDictionary::make({{"List", PlistArray::make({"a"})}});
+  std::future<void> builder;
+  {
+    const ArrayGuard guard;
+    builder = treeBuiltElsewhere(display);
+    EXPECT_EQ(builder.wait_for(std::chrono::milliseconds(100)), std::future_status::timeout);
+  }
+  builder.get();
+}
+
+TEST(KelvasiModelNode, DictionariesAreWalkedWithoutTheArrayLock) {
+  const PlistValue display = PlistDictionary::make({{"Section", PlistDictionary::make({{"Row", "a"}})}});
+  const ArrayGuard guard;
+  treeBuiltElsewhere(display).get();
+}
+
+// A lock that is taken again inside stays held once more than it is released; so whether it is free
+// afterwards tells whether it was held while what is nested in an array was built.
+bool isFreeAfterTheWalkOf(const PlistValue& display) {
+  { const Tree tree(display); }
+  auto other = std::async(std::launch::async, [] { const ArrayGuard guard; });
+  const bool isFree = other.wait_for(std::chrono::milliseconds(200)) == std::future_status::ready;
+  if (!isFree) std::_Exit(1);  // the future would wait for ever
+  return true;
+}
+
+TEST(KelvasiModelNode, TheArrayLockIsFreeAfterArraysSideBySide) {
+  const PlistValue list = PlistArray::make({"a"});
+  EXPECT_EXIT(std::_Exit(isFreeAfterTheWalkOf(PlistDictionary::make({{"A", list}, {"B", list}})) ? 0 : 1),
+              testing::ExitedWithCode(0), "");
+}
+
+TEST(KelvasiModelNode, TheArrayLockIsHeldWhileWhatIsNestedInAnArrayIsBuilt) {
+  const PlistValue list = PlistArray::make({"a"});
+  const PlistValue nested = PlistArray::make({PlistDictionary::make({{"List", list}})});
+  EXPECT_EXIT(std::_Exit(isFreeAfterTheWalkOf(nested) ? 0 : 1), testing::ExitedWithCode(1), "");
 }
 
 TEST(KelvasiModelNode, ASortedDictionaryIsOrderedByPrefixAndShowsTheNames) {

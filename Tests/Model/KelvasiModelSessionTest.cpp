@@ -63,6 +63,24 @@ TEST_F(Session, SendsItsCommandsWithTheStatedTimeouts) {
   EXPECT_EQ(link.sent[1].reply, RemotePort::Reply::none);
 }
 
+TEST_F(Session, ConfiguringWithoutAPortFailsAsWithADeadOne) {
+  model.configureGenerator();
+  EXPECT_THAT(errors(), ElementsAre(" ***** Could not send the GetTechnology command (got error=-3)"));
+  EXPECT_EQ(model.logGenerator(), nullptr);
+}
+
+TEST_F(Session, PortsThatAreMadeAgainReplaceThoseThatAreThere) {
+  ASSERT_TRUE(model.createPorts());
+  const auto firstLocal = link.localValid;
+  const auto firstRemote = link.remoteValid;
+  surroundings.log.clear();
+  ASSERT_TRUE(model.createPorts());
+  EXPECT_FALSE(*firstLocal);
+  EXPECT_FALSE(*firstRemote);
+  EXPECT_THAT(errors(), ElementsAre(createdPorts));
+  EXPECT_TRUE(model.isConnected());
+}
+
 TEST_F(Session, ASecondStartWhileTheTimerRunsDoesNothing) {
   model.startMonitor();
   model.startMonitor();
@@ -252,12 +270,31 @@ TEST_F(Session, ATickThatFindsTheDeathStillConsumesTheDataThatHadCome) {
   EXPECT_EQ(updates, 1);
 }
 
-TEST_F(Session, ARestartKeepsTheState) {
+TEST_F(Session, ARestartKeepsTheStateAndItsRowsGoOnMoving) {
   model.startMonitor();
   link.receive(0, test::record(0x7131, "13", 16));
+  const LogGenerator* const before = model.logGenerator();
   *link.remoteValid = false;
   queue.advance(2s);
+  ASSERT_NE(model.logGenerator(), before);
   EXPECT_EQ(*model.nodeAtPath("/Process CO/MM State")->value(), "MM_IDLE");
+  link.receive(0, test::record(0x7131, "06", 16));
+  queue.advance(2s);
+  EXPECT_EQ(*model.nodeAtPath("/Process CO/MM State")->value(), "MM_CONNECTION_ACTIVE");
+}
+
+TEST_F(Session, AfterAChangeOfTechnologyTheOldDisplayStays) {
+  model.startMonitor();
+  link.receive(0, test::record(0x7131, "13", 16));
+  answerTechnology(kTelvonLogChannelTechnology_Orvane_LTE);
+  resources.files["LTE.plist"] =
+      plists.standFor(PlistDictionary::make({{"Serving Cell Info", PlistDictionary::make()}}));
+  *link.remoteValid = false;
+  queue.advance(2s);
+  link.receive(0, test::record(0xB0C0, "", 40));
+  queue.advance(2s);
+  EXPECT_EQ(*model.nodeAtPath("/Process CO/MM State")->value(), "MM_IDLE");
+  EXPECT_EQ(model.topLevelNodes()->childNodes()->size(), 2u);
 }
 
 TEST_F(Session, RestartsWhenTheReceivePortIsInvalidatedFromOutside) {

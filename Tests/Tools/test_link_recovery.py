@@ -11,6 +11,9 @@ import tempfile
 import threading
 import unittest
 
+from support import pcap, record
+from wire_daemon import WireDaemon, wire
+
 KELVASICTL = os.environ["KELVASICTL"]
 TELVON_SIM = os.environ["TELVON_SIM"]
 RESTARTS = int(os.environ.get("LINK_RESTARTS", "5"))
@@ -22,15 +25,18 @@ INVALIDATED = re.compile(r"<3> \*\*\*\*\* INVALIDATED 0x[0-9a-f]+ \*\*\*\*\*$")
 
 
 class Process:
-    """A program whose lines of standard error can be waited for."""
+    """A program whose lines can be waited for: those of standard error, and of `stdout` if that is a pipe."""
 
-    def __init__(self, *arguments, environment):
+    def __init__(self, *arguments, environment, stdout=subprocess.DEVNULL):
         self.lines = []
         self._arriving = queue.Queue()
         self._process = subprocess.Popen(
-            arguments, stdout=subprocess.DEVNULL, stderr=subprocess.PIPE, text=True, env=environment
+            arguments, stdout=stdout, stderr=subprocess.PIPE, text=True, env=environment
         )
         self.pid = self._process.pid
+        self._rows = queue.Queue()
+        if stdout == subprocess.PIPE:
+            threading.Thread(target=self._read_rows, daemon=True).start()
         self._reader = threading.Thread(target=self._read, daemon=True)
         self._reader.start()
 
@@ -38,6 +44,16 @@ class Process:
         for line in self._process.stderr:
             self._arriving.put(line.rstrip("\n"))
         self._arriving.put(None)
+
+    def _read_rows(self):
+        with self._process.stdout:
+            for line in self._process.stdout:
+                self._rows.put(line)
+
+    def wait_for_row(self, row):
+        """Until a line of standard output holds `row`."""
+        while row not in self._rows.get(timeout=PATIENCE):
+            pass
 
     def wait_for(self, part):
         """Lines up to the first that contains `part`."""
@@ -85,8 +101,8 @@ class LinkTest(unittest.TestCase):
         self.environment = os.environ | {"TELVON_RUNTIME_DIR": self.directory}
         self.environment.pop("KELVASI_LOG_LEVEL", None)
 
-    def start(self, *arguments):
-        process = Process(*arguments, environment=self.environment)
+    def start(self, *arguments, **options):
+        process = Process(*arguments, environment=self.environment, **options)
         self.addCleanup(lambda: process.is_running() and process.end(signal.SIGKILL))
         return process
 
@@ -98,10 +114,9 @@ class LinkTest(unittest.TestCase):
         daemon.wait_for("telvon-sim: serving")
         return daemon
 
-    def monitor(self, *options):
-        return self.start(
-            KELVASICTL, "monitor", "--format", "json", "--log-stderr", "--resources", str(RESOURCES), *options
-        )
+    def monitor(self, **options):
+        command = (KELVASICTL, "monitor", "--format", "json", "--log-stderr", "--resources", str(RESOURCES))
+        return self.start(*command, **options)
 
 
 class Order(LinkTest):
@@ -120,18 +135,31 @@ class Order(LinkTest):
 
 
 class Recovery(LinkTest):
+    def daemon_with_area(self, area):
+        """One that shows this location area code."""
+        registered = bytes([0, 3, 0x13, 0xF0, 0x10]) + area.to_bytes(2, "big") + bytes(12)
+        world = pathlib.Path(self.directory) / "world.pcap"
+        world.write_bytes(pcap(record(0x7135, registered)))
+        return self.serving_daemon("--replay", str(world))
+
+    def area_row(self, area):
+        return f'"Location Area Code":"{area}"'
+
     def test_every_death_of_the_daemon_is_noticed_and_costs_nothing(self):
-        daemon = self.serving_daemon()
-        monitor = self.monitor()
+        daemon = self.daemon_with_area(1000)
+        monitor = self.monitor(stdout=subprocess.PIPE)
         monitor.wait_for(RUNNING)
+        monitor.wait_for_row(self.area_row(1000))
         settled = None
         for number in range(RESTARTS):
             daemon.end(signal.SIGKILL)
-            daemon = self.serving_daemon()
+            daemon = self.daemon_with_area(number)
             seen = monitor.wait_for(RUNNING)
             self.assertRegex(next(line for line in seen if "INVALIDATED" in line), INVALIDATED)
             if number == RESTARTS // 10:
+                monitor.wait_for_row(self.area_row(number))
                 settled = (monitor.descriptors(), monitor.resident_kilobytes())
+        monitor.wait_for_row(self.area_row(RESTARTS - 1))
         self.assertEqual(sum("INVALIDATED" in line for line in monitor.lines), RESTARTS)
         self.assertEqual(monitor.descriptors(), settled[0])
         if RESTARTS >= 100:  # a short run has settled nothing
@@ -184,6 +212,40 @@ class Faults(LinkTest):
         self.expect("dead-port", "<3>Could not create the remote port!")
 
 
+class Stalled(LinkTest):
+    """A daemon that stops while the viewer waits for its answer to "GetTechnology"."""
+
+    def setUp(self):
+        super().setUp()
+        self.stalling = WireDaemon(self.directory)
+        self.addCleanup(self.stalling.close)
+
+    def expect_recovery(self, monitor):
+        # Nothing but the viewer's own patience ends its wait: the daemon says nothing more on this channel.
+        seen = monitor.wait_for("No log generator technology works")
+        self.assertIn("<3> ***** Could not send the GetTechnology command (got error=-2)", seen)
+        self.stalling.serve(self.stalling.open_channel())
+        monitor.wait_for(RUNNING)
+        self.assertEqual(monitor.end(), 0)
+
+    def test_a_daemon_that_never_reads_the_technology_request(self):
+        monitor = self.monitor()
+        self.stalling.open_channel()
+        self.expect_recovery(monitor)
+
+    def test_a_daemon_that_stops_before_it_replies(self):
+        monitor = self.monitor()
+        self.assertEqual(self.stalling.open_channel().read_frame()[0], wire.REQUEST)
+        self.expect_recovery(monitor)
+
+    def test_a_daemon_that_stops_inside_its_reply(self):
+        monitor = self.monitor()
+        commands = self.stalling.open_channel()
+        token = commands.read_frame()[2]
+        commands.send(wire.frame(wire.REPLY, b"<plist>", token=token)[:-1])
+        self.expect_recovery(monitor)
+
+
 class Privacy(LinkTest):
     def network_inodes(self):
         inodes = set()
@@ -201,24 +263,42 @@ class Privacy(LinkTest):
             self.assertTrue(process.socket_inodes())
             self.assertFalse(process.socket_inodes() & self.network_inodes())
 
-    @unittest.skipUnless(shutil.which("strace"), "strace is not installed")
-    def test_the_viewer_asks_the_system_for_unix_sockets_only(self):
-        self.serving_daemon()
-        trace = os.path.join(self.directory, "trace")
-        command = [KELVASICTL, "monitor", "--once", "--resources", str(RESOURCES)]
-        run = subprocess.run(
-            ["strace", "-f", "-e", "trace=socket", "-o", trace, *command],
-            env=self.environment | {"ASAN_OPTIONS": "detect_leaks=0"},
-            capture_output=True,
-            timeout=PATIENCE,
-            check=False,
-        )
-        if b"ptrace" in run.stderr:
+    def traced(self, trace, *command):
+        """A command that writes its socket calls to the file `trace`; skips the test where that is not allowed."""
+        if not shutil.which("strace"):
+            self.skipTest("strace is not installed")
+        probe = subprocess.run(["strace", "-o", os.devnull, "true"], capture_output=True, check=False)
+        if probe.returncode != 0:
             self.skipTest("this machine does not let strace trace")
-        self.assertEqual(run.returncode, 0, run.stderr)
+        return ["strace", "-f", "-e", "trace=socket", "-o", trace, *command]
+
+    def assert_unix_sockets_only(self, trace):
         calls = [line for line in pathlib.Path(trace).read_text().splitlines() if "socket(" in line]
         self.assertTrue(calls)
         self.assertEqual([line for line in calls if "AF_UNIX" not in line], [])
+
+    def test_the_viewer_asks_the_system_for_unix_sockets_only(self):
+        self.environment["ASAN_OPTIONS"] = "detect_leaks=0"
+        trace = os.path.join(self.directory, "trace")
+        command = self.traced(trace, KELVASICTL, "monitor", "--once", "--resources", str(RESOURCES))
+        self.serving_daemon()
+        run = subprocess.run(command, env=self.environment, capture_output=True, timeout=PATIENCE, check=False)
+        self.assertEqual(run.returncode, 0, run.stderr)
+        self.assert_unix_sockets_only(trace)
+
+    def test_the_daemon_asks_the_system_for_unix_sockets_only(self):
+        self.environment["ASAN_OPTIONS"] = "detect_leaks=0"
+        trace = os.path.join(self.directory, "trace")
+        world = pathlib.Path(self.directory) / "world.pcap"
+        world.write_bytes(pcap(record(0x7131, bytes([0x13, 0x08, 0x02]))))
+        command = self.traced(trace, TELVON_SIM, "--technology", "Orvane_GSM", "--replay", str(world), "--leave")
+        daemon = self.start(*command)
+        daemon.wait_for("telvon-sim: serving")
+        monitor = self.monitor(stdout=subprocess.PIPE)
+        monitor.wait_for_row('"MM State":"MM_IDLE"')
+        self.assertEqual(daemon.status(), 0)
+        self.assertEqual(monitor.end(), 0)
+        self.assert_unix_sockets_only(trace)
 
 
 if __name__ == "__main__":

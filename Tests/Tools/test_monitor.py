@@ -44,9 +44,10 @@ class Monitor(LiveTest):
         daemon.kill()
         daemon.wait()
         self.replay(GMM_REGISTERED)
-        # A new generator was made for the same state, whose display stays as it is.
+        # A new generator was made for the same state: what was shown stays, and goes on moving.
         display = json.loads(monitor.stdout.readline())["display"]
         self.assertEqual(display["Process CS"]["MM State"], "MM_IDLE")
+        self.assertEqual(display["Process PS"]["MM State"], "GMM_REGISTERED")
 
     def test_a_signal_ends_it_well(self):
         for number in (signal.SIGINT, signal.SIGTERM):

@@ -7,6 +7,7 @@ import unittest
 
 from live_support import PATIENCE, LiveTest, packets
 from support import MM_IDLE, pcap, record
+from wire_daemon import WireDaemon, wire
 
 MANY = [record(0x7131, count.to_bytes(4, "little")) for count in range(5000)]
 
@@ -82,6 +83,89 @@ class Record(LiveTest):
     def test_a_place_that_cannot_be_written_is_named(self):
         self.assert_fault(self.run_program("record", self.path("missing/a.pcap")), "missing/a.pcap: No such file")
         self.assert_fault(self.run_program("record", "/dev/full"), "/dev/full: No space left on device")
+
+
+class RecordFromTheWire(LiveTest):
+    """What the socket holds when the recording ends."""
+
+    def setUp(self):
+        super().setUp()
+        os.mkdir(self.path("run"), 0o700)
+        self.daemon = WireDaemon(self.path("run"))
+        self.addCleanup(self.daemon.close)
+
+    def start_record(self, *arguments):
+        """A recorder that has written a first message, and the connection for more."""
+        recorder = self.start_live("record", self.path("a.pcap"), *arguments)
+        messages = self.daemon.serve(self.daemon.open_channel())
+        messages.send(wire.frame(wire.MESSAGE, MM_IDLE))
+        self.wait_for_size(24 + 16 + len(MM_IDLE))
+        return recorder, messages
+
+    def wait_for_size(self, size):
+        self.wait_until(lambda: os.path.exists(self.path("a.pcap")) and os.path.getsize(self.path("a.pcap")) >= size)
+
+    def fill(self, connection, sent):
+        connection.socket.setblocking(False)
+        try:
+            while True:
+                message = record(0x7131, len(sent).to_bytes(8000, "little"))
+                frame = wire.frame(wire.MESSAGE, message)
+                self.assertEqual(connection.socket.send(frame), len(frame))
+                sent.append(message)
+        except BlockingIOError:
+            pass
+
+    def stop_and_fill(self, recorder, messages):
+        """Stops the recorder and sends it what its sockets take, on a connection that it has yet to accept too."""
+        os.kill(recorder.pid, signal.SIGSTOP)
+        os.waitpid(recorder.pid, os.WUNTRACED)
+        sent = []
+        self.fill(messages, sent)
+        self.fill(self.daemon.connect(), sent)
+        return sent
+
+    def check(self, recorder, sent):
+        error = recorder.communicate(timeout=PATIENCE)[1].decode()
+        self.assertEqual(recorder.returncode, 0, error)
+        first, *others = [message for _, message in packets(self.read("a.pcap"))]
+        self.assertEqual(first, MM_IDLE)
+        self.assertEqual(sorted(message[13] for message in others), list(range(len(sent))))
+        self.assertTrue(all(message in sent for message in others))
+        self.assertEqual(error, f"kelvasictl: {1 + len(sent)} messages recorded in {self.path('a.pcap')}\n")
+
+    def test_all_of_it_is_in_the_file_after_a_signal(self):
+        for number in (signal.SIGINT, signal.SIGTERM):
+            with self.subTest(number):
+                recorder, messages = self.start_record()
+                sent = self.stop_and_fill(recorder, messages)
+                recorder.send_signal(number)
+                recorder.send_signal(signal.SIGCONT)
+                self.check(recorder, sent)
+
+    def test_all_of_it_is_in_the_file_after_the_stated_time(self):
+        started = time.monotonic()
+        recorder, messages = self.start_record("--seconds", "10")
+        sent = self.stop_and_fill(recorder, messages)
+        time.sleep(max(0.0, started + 11 - time.monotonic()))
+        recorder.send_signal(signal.SIGCONT)
+        self.check(recorder, sent)
+
+    def test_a_message_that_no_capture_takes_is_cut_and_reported(self):
+        recorder, messages = self.start_record()
+        large = bytes(300_000)
+        for message in (large, bytes(262_144), large + b"!", MM_IDLE):
+            messages.send(wire.frame(wire.MESSAGE, message))
+        self.wait_for_size(24 + 5 * 16 + 2 * len(MM_IDLE) + 3 * 262_144)
+        status, _, error = self.end(recorder)
+        self.assertEqual(status, 0)
+        file = self.path("a.pcap")
+        self.assertEqual(error.splitlines(), [
+            "kelvasictl: message 2 has 300000 bytes; a capture takes 262144, the rest is lost",
+            f"kelvasictl: 5 messages recorded in {file}, 2 of them cut",
+        ])
+        sizes = [len(message) for _, message in packets(self.read("a.pcap"))]
+        self.assertEqual(sizes, [len(MM_IDLE), 262_144, 262_144, 262_144, len(MM_IDLE)])
 
 
 if __name__ == "__main__":

@@ -10,8 +10,8 @@ namespace {
 
 using namespace std::chrono_literals;
 
-// Enough to read what the sockets hold; a daemon that goes on sending is not waited for.
-constexpr auto lastLook = 100ms;
+// A daemon that goes on sending is not waited for longer.
+constexpr auto drainLimit = 1000ms;
 
 }  // namespace
 
@@ -31,15 +31,18 @@ LiveSession::LiveSession(const LiveOptions& options, KelvasiModel::ViewControlle
 
 void LiveSession::run() {
   queue_.post([this] { model_.restartMonitor(); });
-  const int signal =
-      seconds_ ? loop_.runFor(std::chrono::milliseconds(static_cast<std::int64_t>(*seconds_ * 1000)))
-               : loop_.run();
-  if (signal != 0 && !error_) loop_.runFor(lastLook);
+  if (seconds_) {
+    loop_.runFor(std::chrono::milliseconds(static_cast<std::int64_t>(*seconds_ * 1000)));
+  } else {
+    loop_.run();
+  }
+  if (!hasEnded_) loop_.drain(drainLimit);
   if (error_) throw ToolError(*error_);
 }
 
 void LiveSession::end(std::optional<std::string> error) {
-  error_ = std::move(error);
+  hasEnded_ = true;
+  if (!error_) error_ = std::move(error);
   loop_.quit();
 }
 

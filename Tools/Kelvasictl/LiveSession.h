@@ -30,8 +30,8 @@ class LiveSession {
   MainQueue& queue() { return queue_; }
   const Clock& clock() const { return surroundings_.clock; }
 
-  // Connects and runs until SIGINT, SIGTERM, the stated time or end(). What had arrived by a signal is still
-  // taken in. Throws ToolError with what end() was given.
+  // Connects and runs until SIGINT, SIGTERM, the stated time or end(). What the sockets hold by a signal or
+  // by the end of that time is still taken in. Throws ToolError with what end() was given.
   void run();
   // From within run() only.
   void end(std::optional<std::string> error = std::nullopt);
@@ -44,6 +44,7 @@ class LiveSession {
   QtMessagePorts ports_;
   QtTelephonyDaemon daemon_;
   KelvasiModel model_;
+  bool hasEnded_ = false;  // by end()
   std::optional<std::string> error_;
 };
 

@@ -43,19 +43,28 @@ class RecordVerb {
 
  private:
   void take(std::span<const std::uint8_t> message) {
-    if (writer_.write(message, sinceEpoch(session_.clock().now()))) {
-      ++count_;
-    } else {
-      session_.end(writer_.error());
-    }
+    if (!writer_.write(message, sinceEpoch(session_.clock().now()))) return session_.end(writer_.error());
+    ++count_;
+    if (message.size() > PcapWriter::largestPacket) tellCut(message.size());
   }
 
-  void tellCount() const { complain(std::to_string(count_) + " messages recorded in " + options_.file); }
+  // Only the first is worth a line of its own.
+  void tellCut(std::size_t size) {
+    if (++cutCount_ > 1) return;
+    complain("message " + std::to_string(count_) + " has " + std::to_string(size) +
+             " bytes; a capture takes " + std::to_string(PcapWriter::largestPacket) + ", the rest is lost");
+  }
+
+  void tellCount() const {
+    const std::string cut = cutCount_ == 0 ? "" : ", " + std::to_string(cutCount_) + " of them cut";
+    complain(std::to_string(count_) + " messages recorded in " + options_.file + cut);
+  }
 
   const RecordOptions& options_;
   PcapWriter writer_;
   LiveSession session_;
   std::uint64_t count_ = 0;
+  std::uint64_t cutCount_ = 0;
 };
 
 }  // namespace

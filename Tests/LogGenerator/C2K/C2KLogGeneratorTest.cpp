@@ -139,6 +139,27 @@ TEST(C2KLogGenerator, ANameThatTheTemplateDoesNotUseIsDropped) {
   EXPECT_EQ(fixture.display(), "kChannel=\n");
 }
 
+TEST(C2KLogGenerator, ANewGeneratorFillsTheDisplayThatTheStateHolds) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  fixture.generator.generateLogUsingState(fixture.state);
+  ASSERT_EQ(fixture.text("kActiveSetPilots"), "");
+  C2KLogGenerator next(fixture.surroundings.platform());
+  next.updateState(fixture.state, emptyActiveSet());
+  EXPECT_EQ(fixture.text("kActiveSetPilots"), "(none)");
+  EXPECT_EQ(next.generateLogUsingState(fixture.state).dictionary(),
+            fixture.state.find("Display")->dictionary());
+}
+
+TEST(C2KLogGenerator, ADisplayOfAnotherTechnologyStaysAsItIs) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  const PlistValue other = PlistDictionary::make({{"kActiveSetPilots", "not a leaf of the lookup"}});
+  fixture.state.set("Display", other);
+  fixture.take(emptyActiveSet());
+  EXPECT_EQ(fixture.text("kActiveSetPilots"), "not a leaf of the lookup");
+  EXPECT_EQ(fixture.state.find("Lookup"), nullptr);
+  EXPECT_THAT(fixture.errors(), IsEmpty());
+}
+
 TEST(C2KLogGenerator, WithoutATemplateRecordsAreKeptAndNothingIsShown) {
   C2KFixture fixture({});
   fixture.surroundings.resources.files.clear();

@@ -17,6 +17,14 @@ TEST(EquivalentPLMNList, ReadsInterleavedDigits) {
   EXPECT_EQ(section.text(), "[Mobile Country Code=262\nMobile Network Code=315\n]");
 }
 
+TEST(EquivalentPLMNList, WritesItsTraceAtEveryUpdate) {
+  auto section = Section::list();
+  section.surroundings.log.clear();
+  section.take(record(0x7150, "000000 01"));
+  section.take(record(0x7150, "000000"));
+  EXPECT_EQ(section.surroundings.log.warnings(), std::vector<std::string>(2, "Equivalent PLMN List"));
+}
+
 TEST(EquivalentPLMNList, EntriesOverlapTheirSuccessor) {
   auto section = Section::list();
   section.take(record(0x7150, "000000 02 03 00 01 00 00 01 05 02 07"));

@@ -3,6 +3,9 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <array>
+
+#include "LogGenerator/GSM/Orvane_GSMLogGenerator.h"
 #include "Tests/Support/CellList.h"
 #include "Tests/Support/SectionTest.h"
 
@@ -21,7 +24,7 @@ struct Expected {
 };
 
 // In the order of creation.
-const std::vector<Expected> decoders{
+const std::array<Expected, 26> decoders{{
     {"Active Set", "ActiveSet", {0x417A}},
     {"Coding Scheme", "CellChangeCounters", {}, true},
     {"GPRS Information", "GPRSInformation", {0x51F5, 0x7135, 0x51F6, 0x51FB, 0x51FD, 0x51F4, 0x5137}},
@@ -48,7 +51,13 @@ const std::vector<Expected> decoders{
     {"Virtual Active Set", "VirtualActiveSet", {0x417A}},
     {"SIM Info", "SimInfo", {0xFF0000}, true},
     {"HSDPA Info", "HSDPA Info", {0x4221}, true},
-};
+}};
+
+// Every code that a decoder asks for, in the order in which it is first asked for.
+const std::vector<int> startCodes{0x417A, 0x51F5, 0x7135, 0x51F6, 0x51FB, 0x51FD, 0x51F4, 0x5137, 0x5134,
+                                  0x5076, 0x51F8, 0x51FF, 0x7130, 0x7132, 0x4005, 0x7131, 0x7150, 0x512C,
+                                  0x5072, 0x4125, 0x4031, 0x4127, 0x4157, 0x4116, 0x4221};
+const std::vector<int> extraStartCodes{1, 2, 0};
 
 std::vector<std::string_view> subscribers(const ClassIndex& index, LogCode logCode) {
   std::vector<std::string_view> names;
@@ -88,6 +97,22 @@ TEST(Orvane_GSMClassIndex, TheSubscribersOfACodeReceiveARecordInTheOrderOfCreati
   }
   EXPECT_THAT(subscribers(index, 0x5137),
               ElementsAre("GPRS Information", "GSM Serving Cell", "Neighboring Cells", "GSM RR Info"));
+}
+
+std::vector<int> numbers(const PlistValue& list) {
+  std::vector<int> found;
+  for (const PlistValue& element : *list.array()) found.push_back(static_cast<int>(*element.integer()));
+  return found;
+}
+
+TEST(Orvane_GSMClassIndex, TheStartCommandNamesEveryCodeOnce) {
+  test::TestPlatform surroundings;
+  const Orvane_GSMLogGenerator generator(surroundings.platform());
+  const PlistValue command = generator.getStartCommand();
+  EXPECT_EQ(command.dictionary()->size(), 3u);
+  EXPECT_EQ(command.dictionary()->get("SetState"), PlistValue("Streaming"));
+  EXPECT_EQ(numbers(command.dictionary()->get("SetOrvaneLogCodes")), startCodes);
+  EXPECT_EQ(numbers(command.dictionary()->get("SetTelvonExtraCodes")), extraStartCodes);
 }
 
 TEST(Orvane_GSMClassIndex, EveryDecoderWritesItsTraceAndNamesACodeThatItDidNotAskFor) {

@@ -18,6 +18,14 @@ TEST(PDPContextList, ShowsTheContextsAsTheyStand) {
   EXPECT_EQ(section.section, contexts);
 }
 
+TEST(PDPContextList, WritesItsTraceAtEveryUpdate) {
+  auto section = Section::list();
+  section.surroundings.log.clear();
+  section.takeList(0xFF0002, PlistArray::make());
+  section.take(test::textRecord(0xFF0002, "nothing that parses"));
+  EXPECT_THAT(section.surroundings.log.warnings(), testing::ElementsAre("PDPContextList", "PDPContextList"));
+}
+
 TEST(PDPContextList, AnEmptyArrayEmptiesTheList) {
   auto section = Section::list();
   section.takeList(0xFF0002, PlistArray::make({"one"}));

@@ -20,6 +20,15 @@ TEST(ProcessCS, ShowsStateSubStateAndRejectCauseInThisOrder) {
             "LU Reject Cause=ROAMING_NOT_ALLOWED\n");
 }
 
+TEST(ProcessCS, WritesItsTraceAtEveryUpdate) {
+  auto section = SectionFixture<ProcessCS>::rows();
+  section.surroundings.log.clear();
+  section.take(record(0x7131, "13 08 02"));
+  section.take(record(0x7132, "01", 16));
+  section.take(record(0x7131, "13 08"));
+  EXPECT_EQ(section.surroundings.log.warnings(), std::vector<std::string>(3, "ProcessCS"));
+}
+
 TEST(ProcessCS, IgnoresAStateRecordOf15Bytes) {
   auto section = SectionFixture<ProcessCS>::rows();
   section.take(record(0x7131, "13 08"));

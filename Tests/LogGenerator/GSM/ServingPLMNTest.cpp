@@ -28,6 +28,16 @@ PlistValue servingGsmCell() {
   return cell(kTelvonCellMonitorRadioAccessTechnologyGSM, kTelvonCellMonitorCellTypeServing, 310, 1, 4660);
 }
 
+TEST(ServingPLMN, WritesItsTraceAtEveryUpdate) {
+  auto section = Section::rows();
+  section.surroundings.log.clear();
+  section.take(record(0x7135, "", 32));
+  section.take(record(0x7132, "", 16));
+  section.takeList(0xFF0001, PlistArray::make({servingGsmCell()}));
+  section.take(record(0x7135, "", 31));
+  EXPECT_EQ(section.surroundings.log.warnings(), std::vector<std::string>(4, "Serving PLMN"));
+}
+
 TEST(ServingPLMN, ShowsTheSelectionModeFromByte14) {
   const char* texts[] = {"Automatic",          "Manual", "Limited", "LIMITED_ROUTINE_ACQ",
                          "LIMITED_MANUAL_ACQ", "Unknown"};

@@ -43,6 +43,22 @@ TEST_F(RuntimeDirectoryTest, IsFoundAgain) {
   EXPECT_EQ(refusalOf(directory + "/"), "(opened)");
 }
 
+TEST_F(RuntimeDirectoryTest, IsRefusedWithABitMoreThanItsOwner) {
+  for (const mode_t extra : {01000U, 02000U, 04000U, 00010U, 00001U}) {
+    ASSERT_EQ(::chmod(directory.c_str(), 0700U | extra), 0);
+    EXPECT_EQ(refusalOf(directory), "Runtime directory \"" + directory + "\" refused: its mode is not 0700")
+        << std::oct << extra;
+  }
+  ASSERT_EQ(::chmod(directory.c_str(), 0700), 0);
+  EXPECT_EQ(refusalOf(directory), "(opened)");
+}
+
+TEST_F(RuntimeDirectoryTest, IsMadeForTheUserAloneInADirectoryThatHandsItsGroupOn) {
+  ASSERT_EQ(::mkdir(inside("shared").c_str(), 0700), 0);
+  ASSERT_EQ(::chmod(inside("shared").c_str(), 02700), 0);
+  EXPECT_EQ(refusalOf(inside("shared/new")), "(opened)");
+}
+
 TEST_F(RuntimeDirectoryTest, ComesFromTheUsersRuntimeDirectoryOtherwise) {
   ::setenv("TELVON_RUNTIME_DIR", "", 1);
   ::setenv("XDG_RUNTIME_DIR", directory.c_str(), 1);
