@@ -1,6 +1,7 @@
 #include "Simulator/GSM/World.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace kelvasi::sim::gsm {
 
@@ -56,12 +57,16 @@ void World::pass(double seconds) {
 }
 
 World::Situation World::situation() const {
+  std::vector<std::size_t> neighbours = gsmNeighbours_;
+  neighbours.insert(neighbours.end(), umtsNeighbours_.begin(), umtsNeighbours_.end());
+  std::ranges::sort(neighbours);
   return {.registration = registration_.situation(),
           .rrc = connection_.rrc(),
           .isConnected = connection_.isConnected(),
           .isDedicated = connection_.isDedicated(),
           .hasChangedCell = hasChangedCell_,
-          .activeSet = activeSet_.cells()};
+          .activeSet = activeSet_.cells(),
+          .neighbours = std::move(neighbours)};
 }
 
 Use World::use() const {

@@ -27,6 +27,7 @@ class World {
     bool isDedicated;
     bool hasChangedCell;
     std::vector<std::size_t> activeSet;
+    std::vector<std::size_t> neighbours;  // ascending: which they are, whatever their order
     bool operator==(const Situation&) const = default;
   };
 
