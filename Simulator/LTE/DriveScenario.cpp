@@ -25,7 +25,7 @@ Record ofContexts(const World& world, const PlistSerialiser& plists) {
   return gsm::pdpContextRecord(world.attachment().contexts(), plists);
 }
 Record ofSim(const World&, const PlistSerialiser& plists) {
-  return gsm::simFilesRecord(plists);
+  return gsm::simFilesRecord(plists, "GSM, UMTS and LTE");
 }
 
 // The daemon's own records first: where a section shows both, the baseband's record is the later one.

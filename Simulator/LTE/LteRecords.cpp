@@ -61,7 +61,7 @@ std::int64_t qrxlevminRaw(const Cell& cell) {
 // Each cell's frames begin at a time of its own.
 std::int64_t sampleOffset(const World& world, const Cell& cell) {
   const double way = distance(cell.site, world.position()) * samplesPerMetre;
-  return (cell.id * 7919 + static_cast<std::uint32_t>(way)) % samplesPerFrame;
+  return (cell.code * 7919U + static_cast<std::uint32_t>(way)) % samplesPerFrame;
 }
 
 // Hz: the Doppler shift straight ahead.
@@ -81,7 +81,7 @@ void encodeNeighbour(const World& world, std::size_t place, RecordWriter& entry)
       .set("average RSRQ", raw(average.ecNo, quarterRsrq, 7))
       .set("Srxlev", srxlevRaw(world, place))
       .set("frequency offset", dopplerShift(world, cell))
-      .set("frame offset", cell.id * 37 % frameNumbers)
+      .set("frame offset", cell.code * 37 % frameNumbers)
       .set("sample offset", sampleOffset(world, cell));
 }
 
@@ -173,7 +173,7 @@ std::optional<Bytes> servingCellMeasurementRecord(const World& world) {
 }
 
 std::optional<Bytes> neighborMeasurementRecord(const World& world) {
-  if (!isIdle(world) || world.neighbours().empty()) return std::nullopt;
+  if (!isIdle(world)) return std::nullopt;
   const Cell& cell = world.cell(*world.serving());
   RecordWriter record(neighbour::logCode, neighbour::layout, neighbour::minimumLength);
   record.set("version", neighbourVersion).set("E-ARFCN", cell.frequency).set("Qrxlevmin", qrxlevminRaw(cell));

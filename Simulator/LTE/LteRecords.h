@@ -12,8 +12,7 @@ namespace kelvasi::sim::lte {
 std::optional<Bytes> servingCellRecord(const World& world);             // 0xB0C2
 std::optional<Bytes> transmitAntennasRecord(const World& world);        // 0xB0C1
 std::optional<Bytes> servingCellMeasurementRecord(const World& world);  // 0xB17F, in idle mode
-// 0xB180, in idle mode. A list of no cells cannot be told: its count leaves one out.
-std::optional<Bytes> neighborMeasurementRecord(const World& world);
+std::optional<Bytes> neighborMeasurementRecord(const World& world);     // 0xB180, in idle mode
 // 0xB186, in idle mode. Never more than one candidate: a second one would stand in the bytes of the first.
 std::optional<Bytes> reselectionCandidatesRecord(const World& world);
 std::optional<Bytes> connectedModeMeasurementRecord(const World& world);  // 0xB179

@@ -113,11 +113,23 @@ void World::findNeighbours() {
       (isMeasured ? neighbours_ : detected_).push_back(place);
     }
   }
+  if (isOnLte() && !isConnected() && neighbours_.empty()) keepOneNeighbour();
   for (auto* places : {&neighbours_, &detected_, &otherLayers_}) {
     std::ranges::sort(*places, std::ranges::greater(),
                       [this](std::size_t place) { return average(place).level; });
     if (places->size() > mostNeighbours) places->resize(mostNeighbours);
   }
+}
+
+void World::keepOneNeighbour() {
+  std::optional<std::size_t> strongest;
+  for (std::size_t place = 0; place < cells_.size(); ++place) {
+    if (place == serving_ || &layerOf(cell(place)) != &layerOf(cell(*serving_))) continue;
+    if (!strongest || average(place).level > average(*strongest).level) strongest = place;
+  }
+  if (!strongest) return;
+  neighbours_.push_back(*strongest);
+  std::erase(detected_, *strongest);
 }
 
 double World::rssi(std::size_t place) const {

@@ -50,7 +50,9 @@ class World {
   // dB, of the serving cell by its average.
   double srxlev(std::size_t place) const { return receiveLevelCriterion(cell(place), average(place)); }
 
-  // Places of other cells of the serving carrier, the strongest first; none where no search is due.
+  // Places of other cells of the serving carrier or, away from LTE, technology; the strongest first. In idle
+  // mode on LTE never none, as the record of them has no way to say so: where no search is due or nothing is
+  // heard it is the strongest all the same.
   const std::vector<std::size_t>& neighbours() const { return neighbours_; }
   // Those too weak to be measured.
   const std::vector<std::size_t>& detected() const { return detected_; }
@@ -76,6 +78,7 @@ class World {
   void averageReceptions(double seconds);
   void followRules(double seconds);
   void findNeighbours();
+  void keepOneNeighbour();
   bool isHeard(std::size_t place) const;
   bool isLookedFor(std::size_t place) const;
 
