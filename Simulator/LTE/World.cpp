@@ -13,7 +13,7 @@ constexpr double averageSeconds = 1.5;
 constexpr double drxCycle = 1.28;       // seconds
 constexpr unsigned mostDrxCycles = 63;  // that the record has room for
 
-constexpr double weakestLevel = -126;        // dBm; for every technology the cell search's own limit below
+constexpr double weakestLevel = -126;        // dBm
 constexpr double weakestRsrq = -19.5;        // dB
 constexpr double weakestMeasuredRsrq = -17;  // dB: what is weaker is detected and no more
 constexpr double weakestGsm = -108;          // dBm

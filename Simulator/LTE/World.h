@@ -47,7 +47,7 @@ class World {
   const Reception& average(std::size_t place) const { return averages_[place]; }
   // dBm over the whole of an LTE cell's bandwidth.
   double rssi(std::size_t place) const;
-  // dB, of the serving cell by its average.
+  // dB, by a cell's average.
   double srxlev(std::size_t place) const { return receiveLevelCriterion(cell(place), average(place)); }
 
   // Places of other cells of the serving carrier or, away from LTE, technology; the strongest first. In idle
@@ -65,7 +65,7 @@ class World {
 
   unsigned measurementRules() const { return measurementRules_; }
   bool hasNewMeasurementRules() const { return hasNewMeasurementRules_; }
-  // Since the serving cell's criterion has been below 0.
+  // That have passed since the serving cell's criterion fell below 0.
   unsigned drxCyclesBelow() const;
 
   const Attachment& attachment() const { return attachment_; }

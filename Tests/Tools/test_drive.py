@@ -21,7 +21,7 @@ def sections(display):
 class Drive(LiveTest):
     def displays(self, technology):
         self.start_daemon("--seed", "7", "--speed", "30", technology=technology)
-        monitor = self.start_live("monitor", "--format", "json", "--log-stderr", resources=RESOURCES)
+        monitor = self.start_live("monitor", "--format", "json", resources=RESOURCES)
         for line in monitor.stdout:
             yield sections(json.loads(line)["display"])
         self.fail("the monitor ended: " + monitor.stderr.read().decode())
