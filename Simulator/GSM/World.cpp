@@ -29,9 +29,9 @@ std::vector<Shadow> shadowsAlong(const Route& route) {
 
 }  // namespace
 
-World::World(Random random)
+World::World(Random random, Layout layOut)
     : random_(random),
-      cells_(layOutCells(random_.split())),
+      cells_(layOut(random_.split())),
       route_(random_.split()),
       radio_(cells_, shadowsAlong(route_), random_.split()),
       selection_(cells_),

@@ -31,7 +31,9 @@ class World {
     bool operator==(const Situation&) const = default;
   };
 
-  explicit World(Random random);
+  using Layout = std::vector<Cell> (*)(Random random);
+
+  explicit World(Random random, Layout layOut = layOutCells);
   World(const World&) = delete;
   World& operator=(const World&) = delete;
 

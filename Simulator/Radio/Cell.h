@@ -37,6 +37,7 @@ struct Cell {
   std::uint16_t code = 0;       // BSIC, primary scrambling code, or physical cell identity
   bool isForbidden = false;     // its location area rejects the handset
   bool hasTwoCarriers = false;  // HSDPA on two carriers at once
+  bool isTdd = false;           // of UTRA TDD; the code is the cell parameter then
   Point site;
 };
 
