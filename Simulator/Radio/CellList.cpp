@@ -1,5 +1,6 @@
 #include "Simulator/Radio/CellList.h"
 
+#include "LogGenerator/CellRows.h"
 #include "LogGenerator/LogCode.h"
 #include "Simulator/PropertyListRecord.h"
 #include "Simulator/Radio/EutraBand.h"
@@ -9,7 +10,6 @@ namespace kelvasi::sim {
 
 namespace {
 
-constexpr int notMeasured = 32767;
 constexpr int tddBandA = 1;  // 3GPP TS 25.102, 5.2, counted from a
 
 void set(PlistDictionary& entry, std::string_view key, PlistValue value) {

@@ -20,10 +20,8 @@ class SectionSweep {
   // Gives each subscriber of the code a section of its own.
   void bind(LogCode logCode) {
     for (Base* decoder : index_.getSubscribers(logCode)) {
-      PlistValue container = PlistDictionary::make();
-      if (isList(decoder->getSectionName())) container = PlistArray::make();
-      sections_.push_back(container);
-      decoder->updateSectionRef(container);
+      sections_.push_back(sectionFor(decoder->getSectionName()));
+      decoder->updateSectionRef(sections_.back());
     }
   }
 
@@ -74,11 +72,6 @@ class SectionSweep {
       take(swept.logCode, length, 0xFF);
       EXPECT_EQ(shown(), before) << swept.logCode << " of " << length;
     }
-  }
-
-  static bool isList(std::string_view name) {
-    return name.ends_with("List") || name.ends_with("Cells") || name.ends_with("Set") ||
-           name == "TRCH BLER" || name == "CCTRCH SIR";
   }
 
   TestPlatform surroundings_;
