@@ -5,6 +5,8 @@
 
 #include "Simulator/GSM/DriveScenario.h"
 #include "Simulator/GSM/MobilityScenario.h"
+#include "Simulator/LTE/DriveScenario.h"
+#include "Simulator/UTRAN/DriveScenario.h"
 #include "Telvon/Technology.h"
 
 namespace kelvasi::sim {
@@ -22,6 +24,10 @@ constexpr std::array kinds{
     ScenarioKind{kTelvonLogChannelTechnology_Orvane_GSM, "mobility",
                  "registration, calls, data and loss of service; mobility management only",
                  make<gsm::MobilityScenario>},
+    ScenarioKind{kTelvonLogChannelTechnology_Orvane_LTE, "drive",
+                 "a drive through a town of LTE, UMTS and GSM cells; all records", make<lte::DriveScenario>},
+    ScenarioKind{kTelvonLogChannelTechnology_Orvane_UTRAN2, "drive",
+                 "a drive through a town of UTRA TDD and GSM cells; all records", make<utran::DriveScenario>},
 };
 
 }  // namespace

@@ -1,7 +1,8 @@
 #!/usr/bin/env python3
 """Checks the one rule of direction: a folder includes only what stands below it.
 
-Also that headers other than the C++ standard library's are included only where the platform, captures or tools are.
+Also that headers other than the C++ standard library's are included only where the platform, captures or tools are,
+and that every test is built.
 """
 
 import pathlib
@@ -38,6 +39,13 @@ def faults(path: pathlib.Path):
             yield f'{path}:{number}: "{name}" is not written from the root'
 
 
+def tests_not_built():
+    for path in sorted((ROOT / "Tests").rglob("*Test.cpp")):
+        lists = [folder / "CMakeLists.txt" for folder in path.parents if ROOT in folder.parents]
+        if not any(path.name in file.read_text() for file in lists if file.exists()):
+            yield f"{path.relative_to(ROOT)}: is not built"
+
+
 def main() -> int:
     sources = [
         path.relative_to(ROOT)
@@ -46,9 +54,10 @@ def main() -> int:
         if path.suffix in (".h", ".cpp")
     ]
     found = [fault for path in sources for fault in faults(path)]
+    found += tests_not_built()
     for fault in found:
         print(fault, file=sys.stderr)
-    print(f"{len(sources)} files, {len(found)} includes in the wrong direction")
+    print(f"{len(sources)} files, {len(found)} faults of structure")
     return 1 if found else 0
 
 

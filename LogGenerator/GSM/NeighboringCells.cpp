@@ -51,7 +51,6 @@ void NeighboringCells::addEntry(RecordView record, std::size_t place) {
   RowWriter row = addRows();
   show(neighbour, neighbourLayout, rows, row);
   const std::int64_t arfcn = valueOf(neighbour, fieldIn(neighbourLayout, "ARFCN"));
-  // Of two entries with one ARFCN the later counts.
   const auto coded = std::find_if(arfcnToBsic_.rbegin(), arfcnToBsic_.rend(),
                                   [&](const CodedCell& cell) { return cell.arfcn == arfcn; });
   if (coded != arfcnToBsic_.rend()) row.number("BSIC", coded->bsic);

@@ -6,7 +6,7 @@ namespace kelvasi::utran::channelMeasurement {
 
 std::int64_t ratioOf(RecordView compositeChannel, std::size_t timeslot) {
   if (timeslot >= timeslots) throw ArrayOutOfBoundsException();
-  return valueOf(compositeChannel.from(timeslot), firstRatio);
+  return valueOf(compositeChannel, ratioLayout[timeslot]);
 }
 
 }  // namespace kelvasi::utran::channelMeasurement

@@ -25,8 +25,10 @@ inline constexpr std::array transportLayout{
 static_assert(inWireOrder(transportLayout));
 
 inline constexpr std::array compositeLayout{
-    Field{.name = "CCTRCH identity", .byte = 0},
-    Field{.name = "timeslot number", .byte = 1},
+    Field{.name = "CCTRCH identity", .byte = 0}, Field{.name = "timeslot number", .byte = 1},
+    Field{.name = "SIR 0", .byte = 2},           Field{.name = "SIR 1", .byte = 3},
+    Field{.name = "SIR 2", .byte = 4},           Field{.name = "SIR 3", .byte = 5},
+    Field{.name = "SIR 4", .byte = 6},           Field{.name = "SIR 5", .byte = 7},
 };
 static_assert(inWireOrder(compositeLayout));
 
@@ -41,7 +43,9 @@ inline constexpr EntryList compositeChannels{.count = fieldIn(layout, "coded com
 
 // A coded composite channel has one ratio for each of these timeslots.
 inline constexpr std::size_t timeslots = 6;
-inline constexpr Field firstRatio{.name = "SIR", .byte = 2};
+inline constexpr std::span ratioLayout =
+    std::span(compositeLayout).subspan<indexIn(compositeLayout, "SIR 0")>();
+static_assert(ratioLayout.size() == timeslots);
 
 // Throws ArrayOutOfBoundsException for a timeslot that there is not.
 std::int64_t ratioOf(RecordView compositeChannel, std::size_t timeslot);

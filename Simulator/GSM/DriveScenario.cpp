@@ -29,7 +29,7 @@ Record ofCellList(const World& world, const PlistSerialiser& plists) {
   return cellInfoRecord(cellListOf(world), plists);
 }
 Record ofContexts(const World& world, const PlistSerialiser& plists) {
-  return pdpContextRecord(world.registration(), plists);
+  return pdpContextRecord(world.registration().packetSwitched().contexts(), plists);
 }
 Record ofSim(const World&, const PlistSerialiser& plists) {
   return simFilesRecord(plists);

@@ -22,7 +22,7 @@ std::optional<Bytes> ofCells(const MobilityWorld& world, const PlistSerialiser& 
   return cellInfoRecord(world.cells, plists);
 }
 std::optional<Bytes> ofContexts(const MobilityWorld& world, const PlistSerialiser& plists) {
-  return pdpContextRecord(world.registration, plists);
+  return pdpContextRecord(world.registration.packetSwitched().contexts(), plists);
 }
 
 constexpr std::array rules{

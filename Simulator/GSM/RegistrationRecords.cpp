@@ -99,11 +99,11 @@ Bytes equivalentPlmnRecord(const Registration& registration) {
   return record.bytes();
 }
 
-std::optional<Bytes> pdpContextRecord(const Registration& registration, const PlistSerialiser& plists) {
-  const auto contexts = PlistArray::make();
-  for (const PdpContext& context : registration.packetSwitched().contexts())
-    contexts->append(contextEntry(context));
-  return propertyListRecord(pdpContextLogCode, contexts, plists);
+std::optional<Bytes> pdpContextRecord(const std::vector<PdpContext>& contexts,
+                                      const PlistSerialiser& plists) {
+  const auto list = PlistArray::make();
+  for (const PdpContext& context : contexts) list->append(contextEntry(context));
+  return propertyListRecord(pdpContextLogCode, list, plists);
 }
 
 }  // namespace kelvasi::sim::gsm

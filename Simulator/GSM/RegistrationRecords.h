@@ -12,6 +12,6 @@ Bytes registrationStateRecord(const Registration& registration);  // 0x7132
 Bytes registeredPlmnRecord(const Registration& registration);     // 0x7135
 Bytes equivalentPlmnRecord(const Registration& registration);     // 0x7150
 // 0xFF0002; nothing when the contexts cannot be serialised.
-std::optional<Bytes> pdpContextRecord(const Registration& registration, const PlistSerialiser& plists);
+std::optional<Bytes> pdpContextRecord(const std::vector<PdpContext>& contexts, const PlistSerialiser& plists);
 
 }  // namespace kelvasi::sim::gsm

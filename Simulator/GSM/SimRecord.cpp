@@ -17,6 +17,8 @@ struct File {
   std::string_view contents;
 };
 
+constexpr std::string_view technologiesKey = "kSimFile_RATMODE";
+
 // Of a subscriber of the home network, 999 01; the PLMN lists are in the coding of 3GPP TS 31.102.
 constexpr std::array files{
     File{"kSimFile_ICCID", "8999901000000000018"},
@@ -29,7 +31,7 @@ constexpr std::array files{
     File{"kSimFile_AD", "00000002"},
     File{"kSimFile_FPLMN", "FFFFFFFFFFFFFFFFFFFFFFFF"},
     File{"kSimFile_AHPLMN", "99F910"},
-    File{"kSimFile_RATMODE", "GSM and UMTS"},
+    File{technologiesKey, {}},
     File{"kSimFile_PNN", "Test Network"},
     File{"kSimFile_OPL", "99F9100000FFFE01"},
     File{"kSimFile_OPLMNAcT", "99F9208080FFFFFF0000"},
@@ -38,9 +40,10 @@ static_assert(std::ranges::equal(files, simFiles::files, {}, &File::key, &simFil
 
 }  // namespace
 
-std::optional<Bytes> simFilesRecord(const PlistSerialiser& plists) {
+std::optional<Bytes> simFilesRecord(const PlistSerialiser& plists, std::string_view technologies) {
   const auto contents = PlistDictionary::make();
   for (const File& file : files) contents->set(file.key, file.contents);
+  contents->set(technologiesKey, technologies);
   return propertyListRecord(simFilesLogCode, contents, plists);
 }
 

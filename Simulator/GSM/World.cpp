@@ -1,8 +1,7 @@
 #include "Simulator/GSM/World.h"
 
 #include <algorithm>
-
-#include "Simulator/GSM/CellLayout.h"
+#include <utility>
 
 namespace kelvasi::sim::gsm {
 
@@ -24,15 +23,15 @@ constexpr double mostPower = 24;             // dBm, power class 3
 
 // A tunnel without radio, and a quarter that UMTS does not reach, both on the way.
 std::vector<Shadow> shadowsAlong(const Route& route) {
-  return {{.middle = route.corners()[4], .radius = 320, .gsmLoss = 75, .umtsLoss = 75},
-          {.middle = route.corners()[9], .radius = 600, .gsmLoss = 0, .umtsLoss = 40}};
+  return {{.middle = route.corners()[4], .radius = 320, .loss = {75, 75, 75}},
+          {.middle = route.corners()[9], .radius = 600, .loss = {0, 40, 0}}};
 }
 
 }  // namespace
 
-World::World(Random random)
+World::World(Random random, Layout layOut)
     : random_(random),
-      cells_(layOutCells(random_.split())),
+      cells_(layOut(random_.split())),
       route_(random_.split()),
       radio_(cells_, shadowsAlong(route_), random_.split()),
       selection_(cells_),
@@ -58,12 +57,16 @@ void World::pass(double seconds) {
 }
 
 World::Situation World::situation() const {
+  std::vector<std::size_t> neighbours = gsmNeighbours_;
+  neighbours.insert(neighbours.end(), umtsNeighbours_.begin(), umtsNeighbours_.end());
+  std::ranges::sort(neighbours);
   return {.registration = registration_.situation(),
           .rrc = connection_.rrc(),
           .isConnected = connection_.isConnected(),
           .isDedicated = connection_.isDedicated(),
           .hasChangedCell = hasChangedCell_,
-          .activeSet = activeSet_.cells()};
+          .activeSet = activeSet_.cells(),
+          .neighbours = std::move(neighbours)};
 }
 
 Use World::use() const {

@@ -11,6 +11,7 @@ namespace kelvasi::test {
 struct SweptRecord {
   LogCode logCode = 0;
   std::size_t minimumLength = 0;
+  std::uint8_t fill = 0xFF;  // of the payload that has to show rows
 };
 
 template <typename Index>
@@ -19,10 +20,8 @@ class SectionSweep {
   // Gives each subscriber of the code a section of its own.
   void bind(LogCode logCode) {
     for (Base* decoder : index_.getSubscribers(logCode)) {
-      PlistValue container = PlistDictionary::make();
-      if (isList(decoder->getSectionName())) container = PlistArray::make();
-      sections_.push_back(container);
-      decoder->updateSectionRef(container);
+      sections_.push_back(sectionFor(decoder->getSectionName()));
+      decoder->updateSectionRef(sections_.back());
     }
   }
 
@@ -36,19 +35,19 @@ class SectionSweep {
     }
   }
 
+  // Neither empty sections nor those that a whole record has filled.
   void expectNoChangeBelowMinimum(SweptRecord swept) {
     bind(swept.logCode);
-    for (std::size_t length = 0; length < swept.minimumLength; ++length) {
-      take(swept.logCode, length, 0xFF);
-      EXPECT_EQ(shown(), "") << swept.logCode << " of " << length;
-    }
+    expectNoChange(swept, "");
+    take(swept.logCode, swept.minimumLength + 64, 0x01);
+    expectNoChange(swept, shown());
   }
 
   void expectChangeFromMinimumOn(SweptRecord swept) {
     for (std::size_t length = swept.minimumLength; length <= swept.minimumLength + 2; ++length) {
       sections_.clear();
       bind(swept.logCode);
-      take(swept.logCode, length, 0xFF);
+      take(swept.logCode, length, swept.fill);
       EXPECT_NE(shown(), "") << swept.logCode << " of " << length;
     }
   }
@@ -68,9 +67,11 @@ class SectionSweep {
   }
 
  private:
-  static bool isList(std::string_view name) {
-    return name.ends_with("List") || name.ends_with("Cells") || name.ends_with("Set") ||
-           name == "TRCH BLER" || name == "CCTRCH SIR";
+  void expectNoChange(SweptRecord swept, const std::string& before) {
+    for (std::size_t length = 0; length < swept.minimumLength; ++length) {
+      take(swept.logCode, length, 0xFF);
+      EXPECT_EQ(shown(), before) << swept.logCode << " of " << length;
+    }
   }
 
   TestPlatform surroundings_;

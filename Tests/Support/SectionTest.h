@@ -2,6 +2,7 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 
 #include "LogGenerator/Base.h"
 #include "Tests/Support/HexBytes.h"
@@ -22,6 +23,13 @@ inline std::string asText(const PlistValue& value) {
     return lines;
   }
   return "(neither text nor container)";
+}
+
+// An empty section of the kind that the decoder of this name fills.
+inline PlistValue sectionFor(std::string_view name) {
+  const bool isList = name.ends_with("List") || name.ends_with("Cells") || name.ends_with("Set") ||
+                      name == "PDP Context Info" || name == "TRCH BLER" || name == "CCTRCH SIR";
+  return isList ? PlistValue(PlistArray::make()) : PlistValue(PlistDictionary::make());
 }
 
 template <typename Decoder>

@@ -44,9 +44,9 @@ class LiveTest(KelvasictlTest):
             if stream:
                 stream.close()
 
-    def start_daemon(self, *arguments):
+    def start_daemon(self, *arguments, technology="Orvane_GSM"):
         """Returns when the daemon can be reached."""
-        daemon = self.start([DAEMON, "--technology", "Orvane_GSM", *arguments])
+        daemon = self.start([DAEMON, "--technology", technology, *arguments])
         self.await_line(daemon, "serving")
         return daemon
 
@@ -56,8 +56,8 @@ class LiveTest(KelvasictlTest):
                 return
         self.fail(f"the daemon ended before it said {text!r}")
 
-    def start_live(self, verb, *arguments, **options):
-        return self.start([PROGRAM, verb, "--resources", TEMPLATES, *arguments], **options)
+    def start_live(self, verb, *arguments, resources=TEMPLATES, **options):
+        return self.start([PROGRAM, verb, "--resources", resources, *arguments], **options)
 
     def end(self, process, number=signal.SIGINT):
         """Ends a process with a signal; its status and what it wrote since it was last read."""

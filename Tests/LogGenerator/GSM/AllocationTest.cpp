@@ -39,13 +39,8 @@ class Sections {
 
  private:
   void bind(Base& decoder) {
-    const std::string_view name = decoder.getSectionName();
-    const bool isList = name.ends_with("Set") || name.ends_with("Cells") || name.ends_with("List") ||
-                        name == "PDP Context Info";
-    PlistValue container = PlistDictionary::make();
-    if (isList) container = PlistArray::make();
-    containers_.push_back(container);
-    decoder.updateSectionRef(container);
+    containers_.push_back(test::sectionFor(decoder.getSectionName()));
+    decoder.updateSectionRef(containers_.back());
   }
 
   test::TestPlatform surroundings_;

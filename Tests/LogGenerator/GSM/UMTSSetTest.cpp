@@ -81,6 +81,19 @@ TEST(UMTSSet, TheCellListHasItsOwnUnitAndFrequencyKey) {
   EXPECT_EQ(section.text(), "[UARFCN=10564\nScrambling Code=12\nRSCP=-95 dBm\nEnergy Per Chip=-7 dB\n]");
 }
 
+// Half dB, with the six decimals that %f gives.
+TEST(UMTSSet, TheEnergyPerChipHasSixDecimals) {
+  for (const auto& [halfDecibels, text] : {std::pair{"F9", "-3.500000 dB"},
+                                           {"7F", "63.500000 dB"},
+                                           {"01", "0.500000 dB"},
+                                           {"80", "-64.000000 dB"}}) {
+    auto section = Section::list();
+    section.take(record(0x4005, std::string("01 00 E803 2A00 9C F6FF ") + halfDecibels + " 0500"));
+    const PlistValue entry = section.section.array()->at(0);
+    EXPECT_EQ(*entry.dictionary()->get("Energy Per Chip").string(), text);
+  }
+}
+
 TEST(UMTSSet, MeasurementsOf32767ShowEmptyTexts) {
   auto section = Section::list();
   section.takeList(

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 
+#include "LogGenerator/LTE/MeasuredNeighborCells.h"
 #include "Tests/Support/SectionTest.h"
 
 namespace kelvasi {
@@ -48,6 +49,17 @@ TEST(NeighborCellsList, ShowsEachCellInThisOrderBothAntennasAlike) {
   auto section = Section::list();
   section.take(record(0xB180, oneCell));
   EXPECT_EQ(section.text(), oneCellText);
+}
+
+TEST(NeighborCellsList, CountsRsrpInHalvesWhereMeasuredNeighborCellsCountInQuarters) {
+  auto section = Section::list();
+  section.take(record(0xB180, "04 000000 9C18 0A00  00004001 A0000000", 41));
+  const PlistDictionary& cell = *section.section.array()->at(0).dictionary();
+  EXPECT_EQ(*cell.get("Measured RSRP").string(), "-60.00 dBm");
+  EXPECT_EQ(*cell.get("Average RSRP").string(), "-60.00 dBm");
+  auto measured = test::SectionFixture<MeasuredNeighborCells>::list();
+  measured.take(record(0xB179, "00000000 0000 0000 0000 0000 0000 01 00  0000 A000 0000"));
+  EXPECT_EQ(*measured.section.array()->at(0).dictionary()->get("Filtered RSRP").string(), "-100.00 dBm");
 }
 
 TEST(NeighborCellsList, ShowsTheLargestValues) {

@@ -110,6 +110,25 @@ INSTANTIATE_TEST_SUITE_P(
         FieldSet{"S Intra Search", "0000000000000000000000000000000000 E003", "62 dB"},
         FieldSet{"S Non Intra Search", "000000000000000000000000000000000000 0001", "Not Present"}));
 
+// The seventh bit of P-Max says 64; of the handset's power it would be a bit of the gap behind it.
+TEST(ServingCellMeasurement, TheHandsetsPowerIsNeverNotPresent) {
+  for (unsigned raw = 0; raw < 64; ++raw) {
+    auto section = Section::rows();
+    Bytes bytes = record(0xB17F, "", 33);
+    bytes[27] = static_cast<std::uint8_t>(raw << 6);
+    bytes[28] = static_cast<std::uint8_t>(0xF0 | raw >> 2);
+    section.take(bytes);
+    EXPECT_EQ(row(section, "Max UE Tx Power"), std::to_string(static_cast<int>(raw) - 30) + " dBm");
+  }
+}
+
+TEST(ServingCellMeasurement, TheSearchOfOtherLayersIsInDbmTheOneOfTheOwnInDb) {
+  auto section = Section::rows();
+  section.take(record(0xB17F, "0000000000000000000000000000000000 E0FB 00"));
+  EXPECT_EQ(row(section, "S Intra Search"), "62 dB");
+  EXPECT_EQ(row(section, "S Non Intra Search"), "62 dBm");
+}
+
 TEST(ServingCellMeasurement, TheBitsBetweenTheFieldsAreNotShown) {
   auto zero = Section::rows();
   zero.take(record(0xB17F, "", 33));

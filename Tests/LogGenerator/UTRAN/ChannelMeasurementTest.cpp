@@ -71,6 +71,15 @@ TEST(CCTRCHSIRMeasurement, BeginsAtByte289WithoutTransportChannels) {
             "[CCTRCH ID=9\nTSNUM=10\nSIR=[11][12][13][14][15][16]\n]");
 }
 
+TEST(CCTRCHSIRMeasurement, Begins34BytesLaterForEachTransportChannel) {
+  for (const auto& [head, start] : {std::pair{"00 4010 00", 289 + 34}, std::pair{"00 8010 00", 289 + 68},
+                                    std::pair{"00 C01F 00", 289 + 34 * 63}}) {
+    auto section = Sir::list();
+    section.take(channels(head, static_cast<std::size_t>(start), "03 04 0A 14 1E 28 32 FF"));
+    EXPECT_EQ(section.text(), "[CCTRCH ID=3\nTSNUM=4\nSIR=[10][20][30][40][50][255]\n]") << start;
+  }
+}
+
 TEST(CCTRCHSIRMeasurement, CountsFourBits) {
   auto section = Sir::list();
   section.take(record(0xD00C, "FF 00F0 FF"));

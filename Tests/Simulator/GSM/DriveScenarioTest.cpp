@@ -17,9 +17,9 @@ namespace {
 using test::DecodingViewer;
 using testing::AnyOf;
 using testing::Contains;
-using testing::Each;
 using testing::IsEmpty;
 using testing::Not;
+using testing::UnorderedElementsAreArray;
 
 constexpr int manySteps = 10000;
 
@@ -78,6 +78,12 @@ class Drive : public testing::Test {
   std::string rrState() const { return baseband.text("GSM RR Info", "RR State"); }
   std::string mmState() const { return baseband.text("Process CS", "MM State"); }
 
+  // Of these cells of the world, in their order.
+  std::vector<std::string> texts(const std::vector<std::size_t>& places, std::uint16_t Cell::*number) const {
+    std::vector<std::string> result;
+    for (const std::size_t place : places) result.push_back(std::to_string(world().cell(place).*number));
+    return result;
+  }
   void checkUmtsCell();
   void checkGsmCell();
   void checkNoService();
@@ -98,9 +104,21 @@ void Drive::checkUmtsCell() {
   ASSERT_EQ(daemon.number("UMTS RR Info", "UARFCN"), cell.frequency);
   const std::string code = daemon.text("UMTS RR Info", "Scrambling Code");
   ASSERT_EQ(code, std::to_string(cell.code));
-  ASSERT_EQ(baseband.column("Active Set", "Scrambling Code").at(0), code);
-  ASSERT_EQ(baseband.column("UMTS Set", "Scrambling Code").at(0), code);
-  ASSERT_THAT(daemon.column("UMTS Set", "Scrambling Code"), Not(Contains(code)));
+  const auto active = baseband.column("Active Set", "Scrambling Code");
+  ASSERT_EQ(active, texts(world().activeSet().cells(), &Cell::code));
+  ASSERT_EQ(active.at(0), code);
+  if (active.size() > 1) {
+    ASSERT_EQ(rrcState(), "CELL_DCH");
+  }
+  auto ranked = baseband.column("UMTS Set", "Scrambling Code");
+  ASSERT_THAT(ranked, testing::IsSupersetOf(active));
+  ASSERT_EQ(ranked.at(0), code);
+  ranked.erase(ranked.begin());
+  ASSERT_THAT(ranked, Not(Contains(code)));
+  ASSERT_THAT(ranked, UnorderedElementsAreArray(texts(world().umtsNeighbours(), &Cell::code)));
+  ASSERT_THAT(daemon.column("UMTS Set", "Scrambling Code"), UnorderedElementsAreArray(ranked));
+  ASSERT_THAT(daemon.column("Neighboring Cells", "ARFCN"),
+              UnorderedElementsAreArray(texts(world().gsmNeighbours(), &Cell::frequency)));
   ASSERT_EQ(baseband.entries("GSM Set"), 0u);
   ASSERT_THAT(rrState(), testing::MatchesRegex("RR_INACTIVE|RR_G2W.*"));
 }
@@ -113,10 +131,17 @@ void Drive::checkGsmCell() {
   }
   ASSERT_EQ(baseband.number("GSM Serving Cell", "BSIC"), cell.code);
   const std::string arfcn = std::to_string(cell.frequency);
-  ASSERT_EQ(baseband.column("GSM Set", "ARFCN").at(0), arfcn);
-  ASSERT_THAT(baseband.column("Neighboring Cells", "ARFCN"), Not(Contains(arfcn)));
-  ASSERT_THAT(daemon.column("Neighboring Cells", "ARFCN"), Not(Contains(arfcn)));
-  ASSERT_THAT(baseband.column("Neighboring Cells", "BSIC"), Each(testing::Ne("(none)")));
+  auto ranked = baseband.column("GSM Set", "ARFCN");
+  ASSERT_EQ(ranked.at(0), arfcn);
+  ranked.erase(ranked.begin());
+  ASSERT_THAT(ranked, Not(Contains(arfcn)));
+  ASSERT_THAT(ranked, UnorderedElementsAreArray(texts(world().gsmNeighbours(), &Cell::frequency)));
+  for (const DecodingViewer* display : {&baseband, &daemon})
+    ASSERT_THAT(display->column("Neighboring Cells", "ARFCN"), UnorderedElementsAreArray(ranked));
+  ASSERT_THAT(baseband.column("Neighboring Cells", "BSIC"),
+              UnorderedElementsAreArray(texts(world().gsmNeighbours(), &Cell::code)));
+  ASSERT_THAT(daemon.column("UMTS Set", "Scrambling Code"),
+              UnorderedElementsAreArray(texts(world().umtsNeighbours(), &Cell::code)));
   ASSERT_EQ(baseband.entries("Active Set"), 0u);
   ASSERT_EQ(baseband.entries("UMTS Set"), 0u);
   ASSERT_EQ(rrcState(), "Disconnected");
