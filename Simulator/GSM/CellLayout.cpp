@@ -4,9 +4,6 @@ namespace kelvasi::sim::gsm {
 
 namespace {
 
-constexpr int columns = 6;
-constexpr int rows = 4;
-constexpr double jitter = 150;  // metres
 constexpr double shareWithUmts = 0.75;
 
 // From west to east, two columns each.
@@ -15,28 +12,23 @@ constexpr std::array areas{LocationArea{homePlmn, 4101}, LocationArea{homePlmn, 
 constexpr LocationArea forbiddenArea{homePlmn, 4199};
 
 constexpr std::uint16_t firstArfcn = 12;
-constexpr std::uint16_t arfcnStep = 4;   // a cell's own BCCH and the three that it hops over
-constexpr std::uint16_t uarfcn = 10588;  // 2117.6 MHz, in band I
+constexpr std::uint16_t arfcnStep = 4;  // a cell's own BCCH and the three that it hops over
 constexpr std::uint32_t rncId = 0x2A5;
 constexpr std::uint16_t firstCellId = 21001;
 constexpr std::uint16_t scramblingCodeStep = 16;
 
-double along(int place, int count, double edge) {
-  return edge * (2 * (place + 0.5) / count - 1);
-}
-
-Cell siteAt(int column, int row, Random& random) {
+Cell emptySite(int column, int row, Random& random) {
   Cell cell;
-  cell.site = {along(column, columns, townEdge.x) + random.between(-jitter, jitter),
-               along(row, rows, townEdge.y) + random.between(-jitter, jitter)};
-  cell.isForbidden = column == columns - 1 && row == rows - 1;
+  cell.site = siteAt(column, row, random);
+  cell.isForbidden = column == siteColumns - 1 && row == siteRows - 1;
   cell.locationArea = cell.isForbidden ? forbiddenArea : areas[static_cast<std::size_t>(column / 2)];
-  cell.routingArea = static_cast<std::uint8_t>(row < rows / 2 ? 1 : 2);
+  cell.routingArea = static_cast<std::uint8_t>(row < siteRows / 2 ? 1 : 2);
   return cell;
 }
 
 Cell gsmCell(Cell site, std::uint16_t number) {
   site.technology = Technology::gsm;
+  site.megahertz = 900;
   site.id = firstCellId + number;
   site.frequency = static_cast<std::uint16_t>(firstArfcn + number * arfcnStep);
   site.code = static_cast<std::uint16_t>(number % 64);
@@ -45,8 +37,9 @@ Cell gsmCell(Cell site, std::uint16_t number) {
 
 Cell umtsCell(Cell site, std::uint16_t number) {
   site.technology = Technology::umts;
+  site.megahertz = 2000;
   site.id = (rncId << 16) | (firstCellId + 500u + number);
-  site.frequency = uarfcn;
+  site.frequency = umtsFrequency;
   site.code = static_cast<std::uint16_t>(number * scramblingCodeStep);
   site.hasTwoCarriers = number % 3 == 0;
   return site;
@@ -56,8 +49,8 @@ Cell umtsCell(Cell site, std::uint16_t number) {
 
 std::vector<Cell> layOutCells(Random random) {
   std::vector<Cell> cells;
-  for (std::uint16_t number = 0; number < columns * rows; ++number) {
-    const Cell site = siteAt(number / rows, number % rows, random);
+  for (std::uint16_t number = 0; number < siteCount; ++number) {
+    const Cell site = emptySite(number / siteRows, number % siteRows, random);
     cells.push_back(gsmCell(site, number));
     if (random.happens(shareWithUmts)) cells.push_back(umtsCell(site, number));
   }

@@ -4,17 +4,12 @@
 #include <array>
 #include <vector>
 
-#include "Simulator/GSM/Cell.h"
-#include "Simulator/Random.h"
+#include "Simulator/Radio/Town.h"
 
 namespace kelvasi::sim::gsm {
 
-// Mobile country code 999 is kept free for networks of nobody (ITU-T E.212).
-inline constexpr Plmn homePlmn{999, 1};
-inline constexpr Plmn partnerPlmn{999, 2};
-
-// Half the extent of the town, metres.
-inline constexpr Point townEdge{2400, 1600};
+// The downlink UARFCN of all UMTS cells: 2117.6 MHz, in band I.
+inline constexpr std::uint16_t umtsFrequency = 10588;
 
 // Sites on an irregular grid, every one with a GSM cell, most with a UMTS cell as well. Location areas lie
 // from west to east, routing areas south and north; in the north-east corner is one that rejects the handset.

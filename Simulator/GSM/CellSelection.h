@@ -5,8 +5,8 @@
 #include <span>
 #include <vector>
 
-#include "Simulator/GSM/Cell.h"
-#include "Simulator/GSM/RadioModel.h"
+#include "Simulator/Radio/Cell.h"
+#include "Simulator/Radio/RadioModel.h"
 
 namespace kelvasi::sim::gsm {
 

@@ -3,8 +3,8 @@
 
 #include <optional>
 
-#include "Simulator/GSM/CellList.h"
 #include "Simulator/GSM/World.h"
+#include "Simulator/Radio/CellList.h"
 
 namespace kelvasi::sim::gsm {
 

@@ -3,8 +3,8 @@
 
 #include <optional>
 
-#include "Simulator/GSM/Cell.h"
 #include "Simulator/GSM/Phase.h"
+#include "Simulator/Radio/Cell.h"
 
 namespace kelvasi::sim::gsm {
 

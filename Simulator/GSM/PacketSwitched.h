@@ -5,8 +5,8 @@
 #include <string>
 #include <vector>
 
-#include "Simulator/GSM/Cell.h"
 #include "Simulator/GSM/Phase.h"
+#include "Simulator/Radio/Cell.h"
 
 namespace kelvasi::sim::gsm {
 

@@ -4,8 +4,8 @@
 #include <cstdint>
 #include <optional>
 
-#include "Simulator/GSM/Cell.h"
 #include "Simulator/GSM/Phase.h"
+#include "Simulator/Radio/Cell.h"
 
 namespace kelvasi::sim::gsm {
 

@@ -2,8 +2,6 @@
 
 #include <algorithm>
 
-#include "Simulator/GSM/CellLayout.h"
-
 namespace kelvasi::sim::gsm {
 
 namespace {
@@ -24,8 +22,8 @@ constexpr double mostPower = 24;             // dBm, power class 3
 
 // A tunnel without radio, and a quarter that UMTS does not reach, both on the way.
 std::vector<Shadow> shadowsAlong(const Route& route) {
-  return {{.middle = route.corners()[4], .radius = 320, .gsmLoss = 75, .umtsLoss = 75},
-          {.middle = route.corners()[9], .radius = 600, .gsmLoss = 0, .umtsLoss = 40}};
+  return {{.middle = route.corners()[4], .radius = 320, .loss = {75, 75, 75}},
+          {.middle = route.corners()[9], .radius = 600, .loss = {0, 40, 0}}};
 }
 
 }  // namespace

@@ -5,12 +5,13 @@
 #include <vector>
 
 #include "Simulator/GSM/ActiveSet.h"
+#include "Simulator/GSM/CellLayout.h"
 #include "Simulator/GSM/CellSelection.h"
 #include "Simulator/GSM/RadioConnection.h"
-#include "Simulator/GSM/RadioModel.h"
 #include "Simulator/GSM/Registration.h"
-#include "Simulator/GSM/Route.h"
 #include "Simulator/GSM/Traffic.h"
+#include "Simulator/Radio/RadioModel.h"
+#include "Simulator/Radio/Route.h"
 
 namespace kelvasi::sim::gsm {
 
@@ -54,7 +55,8 @@ class World {
   const RadioConnection& connection() const { return connection_; }
   const Registration& registration() const { return registration_; }
   const Traffic& traffic() const { return traffic_; }
-  double carrierPower() const { return radio_.carrierPower(); }
+  // All that is received in the UMTS carrier, dBm.
+  double carrierPower() const { return radio_.carrierPower(Technology::umts, umtsFrequency); }
   // dBm, in UMTS.
   double transmitPower() const;
   Point position() const { return route_.position(); }

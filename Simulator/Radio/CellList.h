@@ -5,9 +5,9 @@
 #include <vector>
 
 #include "Platform/PlistSerialiser.h"
-#include "Simulator/GSM/Cell.h"
+#include "Simulator/Radio/Cell.h"
 
-namespace kelvasi::sim::gsm {
+namespace kelvasi::sim {
 
 struct MeasuredCell {
   Cell cell;
@@ -24,4 +24,4 @@ struct CellList {
 // Record 0xFF0001; nothing when the list cannot be serialised.
 std::optional<Bytes> cellInfoRecord(const CellList& cells, const PlistSerialiser& plists);
 
-}  // namespace kelvasi::sim::gsm
+}  // namespace kelvasi::sim

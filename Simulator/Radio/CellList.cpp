@@ -1,10 +1,10 @@
-#include "Simulator/GSM/CellList.h"
+#include "Simulator/Radio/CellList.h"
 
 #include "LogGenerator/LogCode.h"
 #include "Simulator/PropertyListRecord.h"
 #include "Telvon/CellMonitor.h"
 
-namespace kelvasi::sim::gsm {
+namespace kelvasi::sim {
 
 namespace {
 
@@ -55,4 +55,4 @@ std::optional<Bytes> cellInfoRecord(const CellList& cells, const PlistSerialiser
   return propertyListRecord(cellInfoLogCode, list, plists);
 }
 
-}  // namespace kelvasi::sim::gsm
+}  // namespace kelvasi::sim

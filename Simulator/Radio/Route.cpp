@@ -1,11 +1,11 @@
-#include "Simulator/GSM/Route.h"
+#include "Simulator/Radio/Route.h"
 
 #include <cmath>
 #include <numbers>
 
-#include "Simulator/GSM/CellLayout.h"
+#include "Simulator/Radio/Town.h"
 
-namespace kelvasi::sim::gsm {
+namespace kelvasi::sim {
 
 namespace {
 
@@ -52,4 +52,4 @@ void Route::reachCorner() {
   if (random_.happens(shareOfStops)) untilGo_ = random_.between(1, longestStop);
 }
 
-}  // namespace kelvasi::sim::gsm
+}  // namespace kelvasi::sim

@@ -1,9 +1,10 @@
 // A cell of the simulated networks.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 
-namespace kelvasi::sim::gsm {
+namespace kelvasi::sim {
 
 // Metres east and north of the middle of the town.
 struct Point {
@@ -23,18 +24,20 @@ struct LocationArea {
   bool operator==(const LocationArea&) const = default;
 };
 
-enum class Technology { gsm, umts };
+enum class Technology { gsm, umts, lte };
+inline constexpr std::size_t technologyCount = 3;
 
 struct Cell {
   Technology technology = Technology::gsm;
-  LocationArea locationArea;
+  LocationArea locationArea;  // in LTE the tracking area
   std::uint8_t routingArea = 0;
-  std::uint32_t id = 0;         // 16 bits in GSM, 28 bits with the RNC's identity in UMTS
-  std::uint16_t frequency = 0;  // ARFCN of the BCCH, or downlink UARFCN
-  std::uint16_t code = 0;       // BSIC, or primary scrambling code
+  std::uint32_t id = 0;         // 16 bits in GSM, 28 bits in UMTS and LTE with the RNC's or eNodeB's identity
+  std::uint16_t frequency = 0;  // ARFCN of the BCCH, downlink UARFCN, or downlink E-ARFCN
+  double megahertz = 2000;      // of the carrier, as far as propagation goes
+  std::uint16_t code = 0;       // BSIC, primary scrambling code, or physical cell identity
   bool isForbidden = false;     // its location area rejects the handset
   bool hasTwoCarriers = false;  // HSDPA on two carriers at once
   Point site;
 };
 
-}  // namespace kelvasi::sim::gsm
+}  // namespace kelvasi::sim

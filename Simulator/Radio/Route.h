@@ -4,10 +4,10 @@
 #include <cstddef>
 #include <vector>
 
-#include "Simulator/GSM/Cell.h"
+#include "Simulator/Radio/Cell.h"
 #include "Simulator/Random.h"
 
-namespace kelvasi::sim::gsm {
+namespace kelvasi::sim {
 
 double distance(Point from, Point to);  // metres
 
@@ -32,4 +32,4 @@ class Route {
   double untilGo_ = 0;  // seconds of a stop that are left
 };
 
-}  // namespace kelvasi::sim::gsm
+}  // namespace kelvasi::sim

@@ -2,25 +2,25 @@
 // which the radio hardly reaches.
 #pragma once
 
+#include <array>
 #include <span>
 #include <vector>
 
-#include "Simulator/GSM/Cell.h"
+#include "Simulator/Radio/Cell.h"
 #include "Simulator/Random.h"
 
-namespace kelvasi::sim::gsm {
+namespace kelvasi::sim {
 
 struct Reception {
-  double level = -200;  // dBm, filtered: received level of a GSM cell, RSCP of a UMTS cell
-  double ecNo = -40;    // dB, of a UMTS cell
+  double level = -200;  // dBm, filtered: received level of a GSM cell, RSCP in UMTS, RSRP in LTE
+  double ecNo = -40;    // dB, in UMTS; RSRQ in LTE
 };
 
-// A round place with additional loss, dB.
+// A round place with additional loss.
 struct Shadow {
   Point middle;
   double radius = 0;
-  double gsmLoss = 0;
-  double umtsLoss = 0;
+  std::array<double, technologyCount> loss{};  // dB, in the order of the technologies
 };
 
 class RadioModel {
@@ -33,10 +33,19 @@ class RadioModel {
 
   // By the places of the cells.
   const std::vector<Reception>& receptions() const { return receptions_; }
-  // All that is received in the UMTS carrier, dBm.
-  double carrierPower() const { return carrierPower_; }
+  // All that is received in a carrier that cells share, dBm: of UMTS, or of one resource block in LTE.
+  double carrierPower(Technology technology, std::uint16_t frequency) const;
 
  private:
+  struct Carrier {
+    Technology technology;
+    std::uint16_t frequency;
+    std::vector<std::size_t> cells;
+    double power = -200;  // dBm
+  };
+
+  void addToCarrier(std::size_t cell);
+  void receiveCarrier(Carrier& carrier);
   void moveShadowing(double metres);
   double levelOf(std::size_t cell, Point at) const;
 
@@ -45,9 +54,9 @@ class RadioModel {
   Random random_;
   std::vector<double> shadowing_;  // dB, by cell
   std::vector<Reception> receptions_;
-  double carrierPower_ = -100;
+  std::vector<Carrier> carriers_;
   Point last_;
   bool isFirst_ = true;
 };
 
-}  // namespace kelvasi::sim::gsm
+}  // namespace kelvasi::sim
