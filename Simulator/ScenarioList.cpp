@@ -5,6 +5,7 @@
 
 #include "Simulator/GSM/DriveScenario.h"
 #include "Simulator/GSM/MobilityScenario.h"
+#include "Simulator/ObjectStream/ObjectStreamScenario.h"
 #include "Telvon/Technology.h"
 
 namespace kelvasi::sim {
@@ -17,6 +18,9 @@ std::unique_ptr<Scenario> make(std::uint64_t seed, const PlistSerialiser& plists
 }
 
 constexpr std::array kinds{
+    ScenarioKind{kTelvonLogChannelTechnology_IFX, "drive",
+                 "the same town, told by a property list a second, XML and binary in turn",
+                 make<objectStream::ObjectStreamScenario>},
     ScenarioKind{kTelvonLogChannelTechnology_Orvane_GSM, "drive",
                  "a drive through a town of GSM and UMTS cells; all records", make<gsm::DriveScenario>},
     ScenarioKind{kTelvonLogChannelTechnology_Orvane_GSM, "mobility",

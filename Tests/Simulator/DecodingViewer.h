@@ -64,9 +64,10 @@ class DecodingViewer {
     }
     return texts;
   }
+  PlistValue display() const { return state_->get("Display"); }
   PlistValue sectionOf(std::string_view section) const {
-    const PlistValue display = state_->get("Display");
-    return display.dictionary() ? display.dictionary()->get(section) : PlistValue();
+    const PlistValue all = display();
+    return all.dictionary() ? all.dictionary()->get(section) : PlistValue();
   }
   std::size_t entries(std::string_view section) const {
     const PlistValue list = sectionOf(section);
