@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 
+#include "Simulator/C2K/DriveScenario.h"
 #include "Simulator/GSM/DriveScenario.h"
 #include "Simulator/GSM/MobilityScenario.h"
 #include "Simulator/ObjectStream/ObjectStreamScenario.h"
@@ -26,6 +27,9 @@ constexpr std::array kinds{
     ScenarioKind{kTelvonLogChannelTechnology_Orvane_GSM, "mobility",
                  "registration, calls, data and loss of service; mobility management only",
                  make<gsm::MobilityScenario>},
+    ScenarioKind{kTelvonLogChannelTechnology_Orvane_CDMA, "drive",
+                 "a drive through a town of 1x and EV-DO base stations; all records",
+                 make<c2k::DriveScenario>},
 };
 
 }  // namespace

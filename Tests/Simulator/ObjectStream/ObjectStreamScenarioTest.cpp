@@ -60,7 +60,7 @@ class ObjectStream : public testing::TestWithParam<std::uint64_t> {
 
   LibplistSerialiser plists;
   ObjectStreamScenario scenario{GetParam(), plists};
-  DecodingViewer viewer{kTelvonLogChannelTechnology_IFX, "", {}};
+  DecodingViewer viewer{kTelvonLogChannelTechnology_IFX, "none", PlistDictionary::make()};
 };
 
 INSTANTIATE_TEST_SUITE_P(Seeds, ObjectStream, testing::ValuesIn(seeds));
