@@ -20,7 +20,7 @@ std::unique_ptr<Scenario> make(std::uint64_t seed, const PlistSerialiser& plists
 
 constexpr std::array kinds{
     ScenarioKind{kTelvonLogChannelTechnology_IFX, "drive",
-                 "the same town, told by a property list a second, XML and binary in turn",
+                 "a drive through GSM and UMTS cells; a property list a second, XML and binary in turn",
                  make<objectStream::ObjectStreamScenario>},
     ScenarioKind{kTelvonLogChannelTechnology_Orvane_GSM, "drive",
                  "a drive through a town of GSM and UMTS cells; all records", make<gsm::DriveScenario>},

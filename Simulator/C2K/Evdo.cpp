@@ -29,8 +29,14 @@ void Evdo::enter(State state) {
   if (state >= State::sync) return;
   pilots_.clear();
   serving_.reset();
-  // An address that was never answered is asked for again.
-  if (session_ != Session::open) session_ = Session::closed;
+  if (session_ != Session::open) close();
+}
+
+// What was not agreed on to the end is begun anew.
+void Evdo::close() {
+  session_ = Session::closed;
+  uati24_ = 0;
+  colorCode_ = 0;
 }
 
 void Evdo::pass(const Situation& situation, double seconds) {

@@ -40,6 +40,7 @@ class Evdo {
 
  private:
   void enter(State state);
+  void close();
   void search(const Situation& situation);
   void passIdle(const Situation& situation, double seconds);
   void passConnected(const Situation& situation, double seconds);

@@ -9,8 +9,8 @@ class User {
  public:
   enum class Wish { nothing, call, data };
 
-  // Soon wants something.
-  explicit User(Random random) : random_(random), left_(random_.between(2, 6)) {}
+  // Wants something once the handset has found its systems.
+  explicit User(Random random) : random_(random), left_(random_.between(6, 9)) {}
 
   void pass(double seconds);
   // A call that was lost is not made again at once.

@@ -30,15 +30,13 @@ PlistValue stateOnly(std::string_view state) {
   return PlistDictionary::make({{"State", state}});
 }
 
-Object channelOf(const Cell& cell) {
-  const bool isGsm = cell.technology == Technology::gsm;
-  return PlistDictionary::make({{isGsm ? "ARFCN" : "UARFCN", std::to_string(cell.frequency)},
-                                {isGsm ? "BSIC" : "Scrambling Code", std::to_string(cell.code)}});
-}
-
 void addMeasurements(const World& world, std::size_t place, PlistDictionary& rows) {
+  const Cell& cell = world.cell(place);
+  const bool isGsm = cell.technology == Technology::gsm;
+  rows.set(isGsm ? "ARFCN" : "UARFCN", std::to_string(cell.frequency));
+  rows.set(isGsm ? "BSIC" : "Scrambling Code", std::to_string(cell.code));
   const auto& heard = world.reception(place);
-  if (world.cell(place).technology == Technology::gsm) {
+  if (isGsm) {
     rows.set("Received Level", withUnit(heard.level, " dBm"));
   } else {
     rows.set("RSCP", withUnit(heard.level, " dBm"));
@@ -51,9 +49,8 @@ PlistValue servingCell(const World& world) {
   const auto place = world.serving();
   if (!place) return PlistDictionary::make();
   const Cell& cell = world.cell(*place);
-  const Object rows = channelOf(cell);
-  rows->set("Cell ID", std::to_string(cell.id));
-  rows->set("Location Area Code", std::to_string(cell.locationArea.code));
+  const Object rows = PlistDictionary::make(
+      {{"Cell ID", std::to_string(cell.id)}, {"Location Area Code", std::to_string(cell.locationArea.code)}});
   addMeasurements(world, *place, *rows);
   return PlistDictionary::make({{nameOf(cell.technology), rows}});
 }
@@ -61,7 +58,7 @@ PlistValue servingCell(const World& world) {
 PlistValue neighbours(const World& world, const std::vector<std::size_t>& places) {
   const auto list = PlistArray::make();
   for (const std::size_t place : places) {
-    const Object rows = channelOf(world.cell(place));
+    const Object rows = PlistDictionary::make();
     addMeasurements(world, place, *rows);
     list->append(PlistDictionary::make({{"Cell", rows}}));
   }

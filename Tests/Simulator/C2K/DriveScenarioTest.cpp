@@ -166,6 +166,9 @@ void CdmaDrive::checkEvdo() {
   ASSERT_EQ(text("kColorCode"), std::to_string(evdo.colorCode()));
   for (const char* row : {"kRxAGC1", "kTxAGC"})
     ASSERT_EQ(text(row) != "N/A", evdo.state() >= Evdo::State::access) << row;
+  if (evdo.session() != Evdo::Session::ampSetup) {
+    ASSERT_EQ(evdo.uati24() == 0, evdo.session() == Evdo::Session::closed);
+  }
   // There is one radio.
   if (world().oneX().isInCall()) {
     ASSERT_EQ(evdo.state(), Evdo::State::inactive);
