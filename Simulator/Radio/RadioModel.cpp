@@ -62,7 +62,8 @@ RadioModel::RadioModel(std::span<const Cell> cells, std::vector<Shadow> shadows,
 }
 
 void RadioModel::addToCarrier(std::size_t cell) {
-  const auto [technology, frequency] = std::pair(cells_[cell].technology, cells_[cell].frequency);
+  const Technology technology = cells_[cell].technology;
+  const std::uint16_t frequency = cells_[cell].frequency;
   auto carrier = std::ranges::find_if(carriers_, [&](const Carrier& known) {
     return known.technology == technology && known.frequency == frequency;
   });
