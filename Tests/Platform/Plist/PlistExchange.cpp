@@ -31,7 +31,8 @@ std::optional<PlistValue> read(const char* path) {
 }  // namespace
 
 int main(int count, char** arguments) {
-  const auto value = count == 4 ? written(arguments[1], arguments[2], arguments[3]) : read(arguments[count - 1]);
+  const auto value =
+      count == 4 ? written(arguments[1], arguments[2], arguments[3]) : read(arguments[count - 1]);
   if (!value) return EXIT_FAILURE;
   std::puts(testing::canonical(*value).c_str());
 }
