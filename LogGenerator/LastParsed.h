@@ -16,6 +16,9 @@ class LastParsed : public PlistSerialiser {
   std::optional<Bytes> serialiseXml(const PlistValue& value) const override {
     return serialiser_.serialiseXml(value);
   }
+  std::optional<Bytes> serialiseBinary(const PlistValue& value) const override {
+    return serialiser_.serialiseBinary(value);
+  }
 
  private:
   const PlistSerialiser& serialiser_;

@@ -18,6 +18,8 @@ class PlistSerialiser {
   virtual std::optional<PlistValue> parse(std::span<const std::uint8_t> bytes) const = 0;
   // An XML property list, format version 1.0. Nothing when the value, or one inside it, is absent.
   virtual std::optional<Bytes> serialiseXml(const PlistValue& value) const = 0;
+  // The same as a binary property list, format version 00.
+  virtual std::optional<Bytes> serialiseBinary(const PlistValue& value) const = 0;
 };
 
 }  // namespace kelvasi

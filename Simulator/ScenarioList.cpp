@@ -3,9 +3,11 @@
 #include <algorithm>
 #include <array>
 
+#include "Simulator/C2K/DriveScenario.h"
 #include "Simulator/GSM/DriveScenario.h"
 #include "Simulator/GSM/MobilityScenario.h"
 #include "Simulator/LTE/DriveScenario.h"
+#include "Simulator/ObjectStream/ObjectStreamScenario.h"
 #include "Simulator/UTRAN/DriveScenario.h"
 #include "Telvon/Technology.h"
 
@@ -19,6 +21,9 @@ std::unique_ptr<Scenario> make(std::uint64_t seed, const PlistSerialiser& plists
 }
 
 constexpr std::array kinds{
+    ScenarioKind{kTelvonLogChannelTechnology_IFX, "drive",
+                 "a drive through GSM and UMTS cells; a property list a second, XML and binary in turn",
+                 make<objectStream::ObjectStreamScenario>},
     ScenarioKind{kTelvonLogChannelTechnology_Orvane_GSM, "drive",
                  "a drive through a town of GSM and UMTS cells; all records", make<gsm::DriveScenario>},
     ScenarioKind{kTelvonLogChannelTechnology_Orvane_GSM, "mobility",
@@ -28,6 +33,9 @@ constexpr std::array kinds{
                  "a drive through a town of LTE, UMTS and GSM cells; all records", make<lte::DriveScenario>},
     ScenarioKind{kTelvonLogChannelTechnology_Orvane_UTRAN2, "drive",
                  "a drive through a town of UTRA TDD and GSM cells; all records", make<utran::DriveScenario>},
+    ScenarioKind{kTelvonLogChannelTechnology_Orvane_CDMA, "drive",
+                 "a drive through a town of 1x and EV-DO base stations; all records",
+                 make<c2k::DriveScenario>},
 };
 
 }  // namespace

@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <array>
 
-#include "LogGenerator/C2K/C2KLookup.h"
 #include "LogGenerator/C2K/C2KRecords.h"
 #include "LogGenerator/C2K/DeviceStatus.h"
 #include "LogGenerator/C2K/EvdoActiveSet.h"
@@ -32,10 +31,19 @@ constexpr std::array records{
     C2KRecord{systemParameters::logCode, parseSystemParameters},
 };
 
+constexpr std::string_view sortedMark = "_sorted";
+
 PlistValue loadTemplate(const Platform& platform) {
   const auto bytes = platform.resources.contents("C2KTemplate", "plist");
   const auto parsed = bytes ? platform.plists.parse(*bytes) : std::nullopt;
   return parsed && parsed->dictionary() ? *parsed : PlistValue();
+}
+
+void addLeaf(const std::string& name, const std::string& key, const PlistValue& display,
+             PlistDictionary& lookup) {
+  display.dictionary()->set(key, "");
+  if (!lookup.find(name)) lookup.set(name, PlistArray::make());
+  lookup.find(name)->array()->append(PlistDictionary::make({{"key", key}, {"dict", display}}));
 }
 
 }  // namespace
@@ -48,12 +56,11 @@ void C2KLogGenerator::updateState(PlistDictionary& state, std::span<const std::u
   static const PlistDictionary nothing;
   getDisplayFromState(state, platform());
   const PlistValue lookup = state.get("Lookup");
-  updateFromLogUsingLookupUsingState(data, lookup.dictionary() ? *lookup.dictionary() : nothing, state);
+  updateFromLog(data, lookup.dictionary() ? *lookup.dictionary() : nothing, state);
 }
 
-void C2KLogGenerator::updateFromLogUsingLookupUsingState(std::span<const std::uint8_t> data,
-                                                         const PlistDictionary& lookup,
-                                                         PlistDictionary& state) {
+void C2KLogGenerator::updateFromLog(std::span<const std::uint8_t> data, const PlistDictionary& lookup,
+                                    PlistDictionary& state) {
   const auto framed = frameRecord(data);
   if (!framed) return;
   // Despite its wording the line does not stop the record.
@@ -93,12 +100,30 @@ PlistValue C2KLogGenerator::getDisplayFromState(PlistDictionary& state, const Pl
   const PlistValue lookup = PlistDictionary::make();
   const PlistValue displayTemplate = state.get("Template");
   if (displayTemplate.dictionary()) {
-    fillFromTemplate(*displayTemplate.dictionary(), display, *lookup.dictionary(), platform.log);
+    processTemplate(*displayTemplate.dictionary(), display, *lookup.dictionary(), platform.log);
   }
   state.set("Display", display);
   state.set("Lookup", lookup);
   state.set("ExtraInfo", PlistDictionary::make());
   return display;
+}
+
+void C2KLogGenerator::processTemplate(const PlistDictionary& displayTemplate, const PlistValue& display,
+                                      PlistDictionary& lookup, SystemLog& log) {
+  for (const auto& [key, value] : displayTemplate) {
+    if (const PlistDictionary* section = value.dictionary()) {
+      const PlistValue nested = PlistDictionary::make();
+      processTemplate(*section, nested, lookup, log);
+      display.dictionary()->set(key, nested);
+    } else if (const std::string* name = value.string()) {
+      if (*name == sortedMark) {
+        display.dictionary()->set(key, *name);
+      } else {
+        addLeaf(*name, key, display, lookup);
+      }
+    }
+  }
+  log.print(LogPriority::warning, "Processing the template");
 }
 
 }  // namespace kelvasi

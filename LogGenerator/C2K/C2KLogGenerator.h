@@ -6,6 +6,7 @@
 #pragma once
 
 #include "LogGenerator/OrvaneLogGenerator.h"
+#include "Platform/SystemLog.h"
 
 namespace kelvasi {
 
@@ -21,12 +22,17 @@ class C2KLogGenerator : public OrvaneLogGenerator {
 
   // Frames a message and hands the record to its parser. A record of a known code is kept, without the
   // prefix, for the raw log, whatever its parser made of it.
-  void updateFromLogUsingLookupUsingState(std::span<const std::uint8_t> data, const PlistDictionary& lookup,
-                                          PlistDictionary& state);
+  void updateFromLog(std::span<const std::uint8_t> data, const PlistDictionary& lookup,
+                     PlistDictionary& state);
 
   // The state's display, built with its lookup table on the first call; absent when the template cannot be
   // loaded.
   static PlistValue getDisplayFromState(PlistDictionary& state, const Platform& platform);
+
+  // Walks a template into `display`, a dictionary, with empty leaves, and into a lookup table: a name to the
+  // entries ("key" and "dict") of the leaves that it fills, in the order of the walk.
+  static void processTemplate(const PlistDictionary& displayTemplate, const PlistValue& display,
+                              PlistDictionary& lookup, SystemLog& log);
 };
 
 }  // namespace kelvasi

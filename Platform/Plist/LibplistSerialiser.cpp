@@ -78,4 +78,15 @@ std::optional<Bytes> LibplistSerialiser::serialiseXml(const PlistValue& value) c
   return withCarriageReturnsKept({text, size});
 }
 
+std::optional<Bytes> LibplistSerialiser::serialiseBinary(const PlistValue& value) const {
+  const LibplistNode node = toLibplist(value);
+  if (!node) return std::nullopt;
+  char* content = nullptr;
+  std::uint32_t size = 0;
+  plist_to_bin(node.get(), &content, &size);
+  const std::unique_ptr<char, decltype(&plist_to_bin_free)> owned(content, &plist_to_bin_free);
+  if (!content) return std::nullopt;
+  return Bytes(content, content + size);
+}
+
 }  // namespace kelvasi

@@ -19,7 +19,7 @@ namespace kelvasi {
 // Writing. What is written, `parse` and every other reader takes, and yields the value again, save that
 // - a byte that is not UTF-8 and a character XML cannot hold (control characters, NUL) become U+FFFD;
 // - a date loses its fraction of a second, rounded down;
-// - the real -0.0 becomes 0.0.
+// - in XML, the real -0.0 becomes 0.0.
 // Nothing is returned, besides for absent values, for dates outside the years 1000 to 9999, for containers
 // nested deeper than 128 levels (those that contain themselves too), and for more than 4,000,000 values or
 // 256 MiB of texts and data.
@@ -29,6 +29,7 @@ class LibplistSerialiser : public PlistSerialiser {
  public:
   std::optional<PlistValue> parse(std::span<const std::uint8_t> bytes) const override;
   std::optional<Bytes> serialiseXml(const PlistValue& value) const override;
+  std::optional<Bytes> serialiseBinary(const PlistValue& value) const override;
 };
 
 }  // namespace kelvasi

@@ -20,6 +20,7 @@ constexpr std::array<Transmission, technologyCount> transmissions{
     Transmission{.power = 38, .sharesCarrier = false},
     Transmission{.power = 27, .loadOverPilot = 6.5, .noise = -100},
     Transmission{.power = 20, .loadOverPilot = 6.8, .noise = -114},
+    Transmission{.power = 30, .loadOverPilot = 6.5, .noise = -105},
 };
 
 // Macro-cell propagation, 3GPP TR 36.942, 4.5.2: loss in dB over kilometres.

@@ -12,8 +12,9 @@
 namespace kelvasi::sim {
 
 struct Reception {
-  double level = -200;  // dBm, filtered: received level of a GSM cell, RSCP in UMTS, RSRP in LTE
-  double ecNo = -40;    // dB, in UMTS; RSRQ in LTE
+  // dBm, filtered: received level of a GSM cell, RSCP in UMTS, RSRP in LTE, the pilot's level in CDMA.
+  double level = -200;
+  double ecNo = -40;  // dB, in UMTS; RSRQ in LTE; Ec/Io in CDMA
 };
 
 // A round place with additional loss.
@@ -33,7 +34,8 @@ class RadioModel {
 
   // By the places of the cells.
   const std::vector<Reception>& receptions() const { return receptions_; }
-  // All that is received in a carrier that cells share, dBm: of UMTS, or of one resource block in LTE.
+  // All that is received in a carrier that cells share, dBm: of UMTS and CDMA, or of one resource block in
+  // LTE.
   double carrierPower(Technology technology, std::uint16_t frequency) const;
 
  private:

@@ -17,6 +17,7 @@ struct CountingSerialiser : PlistSerialiser {
     return PlistArray::make({bytes.size()});
   }
   std::optional<Bytes> serialiseXml(const PlistValue&) const override { return hex("AB"); }
+  std::optional<Bytes> serialiseBinary(const PlistValue&) const override { return hex("CD"); }
   mutable int parses = 0;
 };
 
@@ -52,6 +53,7 @@ TEST(LastParsed, RemembersThatBytesDidNotParse) {
 TEST(LastParsed, SerialisesThroughWhatItWasGiven) {
   const CountingSerialiser serialiser;
   EXPECT_EQ(LastParsed(serialiser).serialiseXml("text"), hex("AB"));
+  EXPECT_EQ(LastParsed(serialiser).serialiseBinary("text"), hex("CD"));
 }
 
 }  // namespace

@@ -91,5 +91,30 @@ TEST(UTRANTemplate, IsOrderedFromTheServingCellOutwards) {
               ElementsAre("Serving Cell", "Neighbor Cells", "Channel Quality", "SIM and Data"));
 }
 
+// The lookup names of the leaves, wherever they stand.
+std::vector<std::string> lookupNames(const PlistValue& object) {
+  std::vector<std::string> names;
+  for (const auto& [key, value] : *object.dictionary()) {
+    const auto inside = value.dictionary() ? lookupNames(value) : std::vector<std::string>{*value.string()};
+    if (key != "_sorted") names.insert(names.end(), inside.begin(), inside.end());
+  }
+  return names;
+}
+
+TEST(C2KTemplate, UsesEveryLookupNameOnce) {
+  EXPECT_THAT(
+      lookupNames(displayTemplate("C2KTemplate")),
+      testing::UnorderedElementsAre(
+          "kChannel", "k1xEVDODeviceState", "kBandClass", "kRxAGC0", "kRxAGC1", "kTxAGC", "kServingPNOffset",
+          "kSessionState", "kUATI24", "kColorCode", "kActiveSetPilots", "kFingerC2I", "k1xDeviceState",
+          "k1xRx0BandClass", "k1xRx0ChanNum", "k1xRxAGC0", "k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1",
+          "k1xTxAGC", "k1xActiveSetInfo", "k1xTrafficFER", "k1xRoamingHome", "kSystemId", "kNetworkId",
+          "kPacketZoneId", "kBaseId", "kProtocolRevision", "kFLDataRate", "kRLDataRate"));
+}
+
+TEST(C2KTemplate, ShowsTheVoiceSystemBeforeTheDataSystem) {
+  EXPECT_THAT(groupsOf("C2KTemplate"), ElementsAre("1x", "1x System", "EV-DO", "EV-DO Data Rates"));
+}
+
 }  // namespace
 }  // namespace kelvasi

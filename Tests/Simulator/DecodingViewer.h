@@ -21,12 +21,12 @@ class DecodingViewer {
  public:
   // The template has these sections and is found as `templateName`.
   DecodingViewer(std::string_view technology, std::string_view templateName,
-                 std::span<const SectionOfTemplate> sections) {
+                 std::span<const SectionOfTemplate> sections)
+      : DecodingViewer(technology, templateName, templateOf(sections)) {
     surroundings_.log.isMasked = true;
-    const auto display = PlistDictionary::make();
-    for (const SectionOfTemplate& section : sections)
-      display->set(section.name,
-                   section.isList ? PlistValue(PlistArray::make()) : PlistValue(PlistDictionary::make()));
+  }
+  // The same with a template as it is. Warnings are remembered as well.
+  DecodingViewer(std::string_view technology, std::string_view templateName, const PlistValue& display) {
     surroundings_.resources.files[std::string(templateName) + ".plist"] =
         plists_.serialiseXml(display).value();
     generator_ = LogGenerator::generatorFromTechnology(technology, platform());
@@ -64,15 +64,18 @@ class DecodingViewer {
     }
     return texts;
   }
+  PlistValue display() const { return state_->get("Display"); }
   PlistValue sectionOf(std::string_view section) const {
-    const PlistValue display = state_->get("Display");
-    return display.dictionary() ? display.dictionary()->get(section) : PlistValue();
+    const PlistValue all = display();
+    return all.dictionary() ? all.dictionary()->get(section) : PlistValue();
   }
   std::size_t entries(std::string_view section) const {
     const PlistValue list = sectionOf(section);
     return list.array() ? list.array()->size() : 0;
   }
+  PlistValue inState(std::string_view key) const { return state_->get(key); }
   std::vector<std::string> errors() const { return surroundings_.log.errors(); }
+  std::vector<std::string> warnings() const { return surroundings_.log.warnings(); }
   LogGenerator& generator() { return *generator_; }
 
   static std::optional<double> leadingNumber(const std::string& text) {
@@ -83,6 +86,13 @@ class DecodingViewer {
   }
 
  private:
+  static PlistValue templateOf(std::span<const SectionOfTemplate> sections) {
+    const auto display = PlistDictionary::make();
+    for (const SectionOfTemplate& section : sections)
+      display->set(section.name,
+                   section.isList ? PlistValue(PlistArray::make()) : PlistValue(PlistDictionary::make()));
+    return display;
+  }
   Platform platform() {
     return {surroundings_.log, surroundings_.trace, plists_, surroundings_.resources, surroundings_.clock};
   }

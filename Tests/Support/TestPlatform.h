@@ -51,6 +51,7 @@ class FakeSerialiser : public PlistSerialiser {
     return known == parsed.end() ? std::nullopt : std::optional(known->second);
   }
   std::optional<Bytes> serialiseXml(const PlistValue&) const override { return std::nullopt; }
+  std::optional<Bytes> serialiseBinary(const PlistValue&) const override { return std::nullopt; }
 
   // Bytes that stand for `value` from now on.
   Bytes standFor(PlistValue value) {

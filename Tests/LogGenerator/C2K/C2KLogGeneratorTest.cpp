@@ -71,6 +71,47 @@ TEST(C2KLogGenerator, APrefixedRecordIsDecodedAndKeptWithoutThePrefix) {
   EXPECT_EQ(*fixture.state.find("DisplayState")->data(), inner);
 }
 
+TEST(C2KLogGenerator, AMessageOf13BytesWithAPrefixIsARecordOf11) {
+  C2KFixture fixture({});
+  const Bytes inner = hex("01 0000 B612 000000000000");
+  fixture.take(hex("81 00 01 0000 B612 000000000000"));
+  EXPECT_THAT(fixture.errors(),
+              ElementsAre("Log code 0x12b6 is 11 bytes long but must be at least 25 bytes."));
+  fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), inner);
+}
+
+TEST(C2KLogGenerator, EachTickTakesTheRecordsSinceTheLast) {
+  C2KFixture fixture({});
+  fixture.take(emptyActiveSet());
+  fixture.take(record(0x12B6, "", 24));
+  Bytes both = emptyActiveSet();
+  const Bytes second = record(0x12B6, "", 24);
+  both.insert(both.end(), second.begin(), second.end());
+  fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), both);
+}
+
+TEST(C2KLogGenerator, ADisplayThatTheStateHoldsIsKept) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  const PlistValue display = PlistDictionary::make({{"kActiveSetPilots", "as it was"}});
+  fixture.state.set("Display", display);
+  fixture.take(emptyActiveSet());
+  EXPECT_EQ(fixture.generator.generateLogUsingState(fixture.state), display);
+  EXPECT_EQ(fixture.text("kActiveSetPilots"), "as it was");
+  EXPECT_EQ(fixture.state.find("Template"), nullptr);
+}
+
+TEST(C2KLogGenerator, TheTemplateIsReadOncePerState) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  fixture.generator.generateLogUsingState(fixture.state);
+  fixture.surroundings.resources.files.clear();
+  fixture.state.remove("Display");
+  EXPECT_EQ(fixture.generator.generateLogUsingState(fixture.state),
+            PlistValue(PlistDictionary::make({{"kActiveSetPilots", ""}})));
+  EXPECT_THAT(fixture.errors(), IsEmpty());
+}
+
 TEST(C2KLogGenerator, AWrongLogTypeIsLoggedButNotDropped) {
   C2KFixture fixture({"kActiveSetPilots"});
   fixture.take(test::with(emptyActiveSet(), 0, "07"));

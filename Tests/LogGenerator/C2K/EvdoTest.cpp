@@ -181,6 +181,36 @@ TEST(EvdoForwardRate, AnEqualOrSmallerSequenceUpdatesTheCountersButNotTheRate) {
   EXPECT_EQ(fixture.extraInfo("FLDataSeqNum2"), PlistValue(7));
 }
 
+TEST(EvdoForwardRate, PrimesAnewUnlessBothReadingsAreThere) {
+  for (const char* lost : {"FLDataSeqNum", "FLDataSent"}) {
+    C2KFixture fixture({"kFLDataRate"});
+    fixture.take(forwardRate("05000000"));
+    fixture.take(forwardRate("07000000", 3, "03000000"));
+    fixture.state.remove(lost);
+    fixture.take(forwardRate("09000000", 3, "03000000"));
+    EXPECT_EQ(fixture.text("kFLDataRate"), "") << lost;
+    EXPECT_EQ(fixture.extraInfo("FLDataSeqNum1"), PlistValue(9)) << lost;
+    EXPECT_EQ(fixture.extraInfo("FLDataSeqNum2"), PlistValue(5)) << lost;
+  }
+}
+
+TEST(EvdoForwardRate, CountersThatWereClearedGiveANegativeRate) {
+  C2KFixture fixture({"kFLDataRate"});
+  fixture.take(forwardRate("05000000", 3, "02000000"));
+  fixture.take(forwardRate("06000000"));
+  EXPECT_EQ(fixture.text("kFLDataRate"), "-2.00 kbps");
+}
+
+// 0x80000001 - 1 is the most negative difference, 0x7FFFFFFF the largest.
+TEST(EvdoForwardRate, ADifferenceIsSigned) {
+  C2KFixture fixture({"kFLDataRate"});
+  fixture.take(forwardRate("01000000"));
+  fixture.take(forwardRate("01000080", 52, "FFFFFFFF"));
+  EXPECT_EQ(fixture.text("kFLDataRate"), "");
+  fixture.take(forwardRate("00000000"));
+  EXPECT_EQ(fixture.text("kFLDataRate"), "-10.00 kbps");
+}
+
 TEST(EvdoForwardRate, TheSequenceMayWrapForwards) {
   C2KFixture fixture({"kFLDataRate"});
   fixture.take(forwardRate("FFFFFFFF"));
@@ -251,6 +281,21 @@ TEST(EvdoReverseRate, WeighsEveryCounterByItsRate) {
       }
     }
   }
+}
+
+TEST(EvdoReverseRate, TheFirstRecordPrimesAndAnEqualSequenceKeepsTheRate) {
+  C2KFixture fixture({"kRLDataRate"});
+  const Bytes first = with(record(0x127E, "", 1750), 14, "05000000");
+  fixture.take(first);
+  EXPECT_EQ(fixture.text("kRLDataRate"), "");
+  EXPECT_TRUE(fixture.extraInfo("RLDataSeqNum2").isAbsent());
+  fixture.take(with(with(first, 14, "06000000"), 18, "08000000"));  // 8 packets of 128 bits
+  EXPECT_EQ(fixture.text("kRLDataRate"), "1.00 kbps");
+  fixture.take(with(with(first, 14, "06000000"), 18, "10000000"));
+  EXPECT_EQ(fixture.text("kRLDataRate"), "1.00 kbps");
+  EXPECT_EQ(fixture.extraInfo("RLDataSent1"), PlistValue(2048));
+  EXPECT_EQ(fixture.extraInfo("RLDataSent2"), PlistValue(1024));
+  EXPECT_EQ(fixture.state.get("RLDataSent"), PlistValue(2048));
 }
 
 TEST(EvdoReverseRate, NeedsAtLeast1750Bytes) {

@@ -44,6 +44,12 @@ TEST(Fingers, ItsLengthIsExact) {
                           "Log code 0x108a has bad length of 38 bytes, but has 1 substructs (size=23)."));
 }
 
+TEST(Fingers, ARatioOfZeroPrintsMinusInfinity) {
+  C2KFixture fixture({"kFingerC2I"});
+  fixture.take(record(0x108A, "000000000000000000 01 0700", 37));
+  EXPECT_EQ(fixture.text("kFingerC2I"), "_sorted=_sorted\n0;7=-inf dB\n");
+}
+
 // Four sub-packets: state, radio (bands 1 and 0, channels 25 and 50, AGC -63.248 and -20.832... raw 0 and
 // 127, Tx 105), active set as given, and one of fingers.
 Bytes deviceStatus(std::string_view state, const std::string& activeSet) {
@@ -133,6 +139,58 @@ TEST(DeviceStatus, AWindowOfZeroPrintsWhatPrintfPrints) {
               testing::MatchesRegex("_sorted=_sorted\n0;0=\\(ref pilot\\) [-+]nan dB\n"));
 }
 
+// Without gain the divisor is 0: energy 5 gives infinity, energy 0 no number.
+TEST(DeviceStatus, AGainOfZeroPrintsWhatPrintfPrints) {
+  auto fixture = deviceFixture();
+  fixture.take(
+      deviceStatus("06", "03 00 2000 0100 00 02 01 00 0000 0000 00000000000000000000 0500 0000 0000 0000"));
+  EXPECT_EQ(fixture.text("k1xActiveSetInfo"), "_sorted=_sorted\n0;0=(ref pilot) +inf dB\n");
+  fixture.take(
+      deviceStatus("06", "03 00 2000 0100 00 02 01 00 0000 0000 00000000000000000000 0000 0000 0000 0000"));
+  EXPECT_THAT(fixture.text("k1xActiveSetInfo"),
+              testing::MatchesRegex("_sorted=_sorted\n0;0=\\(ref pilot\\) [-+]nan dB\n"));
+}
+
+// W = 2, G = 4, E = 0: P = 1/8, D = 144, R = 1/2. K = 0: a pilot every 12 bytes, its energy 24 bytes in,
+// which is the PN offset of the next one. 1152 / 8 / 144 - 1/2 = 1/2.
+TEST(DeviceStatus, WithoutFingersPilotRecordsAre12BytesApart) {
+  auto fixture = deviceFixture();
+  fixture.take(
+      deviceStatus("06",
+                   "03 00 3200 0200 04 00 02 00 0000"
+                   "0300 00000000000000000000 8004 00000000000000000000 8004 00000000000000000000 0000"));
+  EXPECT_EQ(fixture.text("k1xActiveSetInfo"), "_sorted=_sorted\n0;3=-3.01 dB\n1;1152=-3.01 dB\n");
+}
+
+// K = 3: 33 rounded down to 32 bytes, the energy 36 bytes in; E = 3: P = 8. 8 * 45 / (9 * 4) - 1/2 = 9.5.
+TEST(DeviceStatus, ThePilotStrideIsRoundedDownToFour) {
+  auto fixture = deviceFixture();
+  fixture.take(deviceStatus("06",
+                            "03 00 4800 0200 01 03 02 03 0500"
+                            "0300 0000 00000000 00000000 00000000 00000000 00000000"
+                            "2D00 0000 00000000 0500 0000 00000000 00000000 00000000 00000000 00000000"
+                            "2D00 0000"));
+  EXPECT_EQ(fixture.text("k1xActiveSetInfo"), "_sorted=_sorted\n0;3=+9.78 dB\n1;5=(ref pilot) +9.78 dB\n");
+}
+
+// 2^(2 * 255 - 3) is a finite number.
+TEST(DeviceStatus, TheLargestExponentIsNoInfinity) {
+  auto fixture = deviceFixture();
+  fixture.take(
+      deviceStatus("06", "03 00 2000 0100 01 FF 01 00 0000 0000 00000000000000000000 0100 0000 0000 0000"));
+  EXPECT_EQ(fixture.text("k1xActiveSetInfo"), "_sorted=_sorted\n0;0=(ref pilot) +1516.68 dB\n");
+}
+
+TEST(DeviceStatus, SubPacketSizesOfZeroAndOf65535LeaveTheRestMissing) {
+  auto fixture = deviceFixture();
+  fixture.take(record(0x119C, "00 04 0000 01 00 0000 02 00 0E00"));
+  EXPECT_EQ(fixture.warnings().back(), "Log code 0x119c: missing subpacket (ss=1,rf=0,ai=0,fi=0).");
+  EXPECT_THAT(fixture.errors(), IsEmpty());
+  fixture.take(record(0x119C, "00 04 0000 01 00 0400 02 00 FFFF"));
+  EXPECT_EQ(fixture.warnings().back(), "Log code 0x119c: missing subpacket (ss=1,rf=0,ai=0,fi=0).");
+  EXPECT_EQ(fixture.errors(), std::vector<std::string>(3, "Log code error in subpkt#1: bad size (65535)."));
+}
+
 TEST(DeviceStatus, A255PilotListStaysInsideTheRecord) {
   auto fixture = deviceFixture();
   fixture.take(deviceStatus("06", "03 00 0C00 0100 01 02 FF FF 0000"));
@@ -180,6 +238,20 @@ TEST(SubPackets, SizesOfZeroAndOf65535EndTheSearch) {
   EXPECT_THAT(fixture.errors(), ElementsAre("Log code error in subpkt#0: bad size (65535)."));
 }
 
+TEST(SubPackets, ASizeOfZeroIsFoundWhenItsIdMatches) {
+  C2KFixture fixture({"k1xTrafficFER"});
+  fixture.take(with(record(0x119D, "00 01 0000 0B 00 0000", 42), 41, "01"));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "1.56%");
+}
+
+TEST(SubPackets, TheSearchEndsWithTheCount) {
+  C2KFixture fixture({"k1xTrafficFER"});
+  fixture.take(record(0x119D, "00 01 0000 01 00 0400 0B 00 0400"));
+  EXPECT_EQ(fixture.warnings().back(), "Log code 0x119d: missing traffic demod subpacket.");
+  fixture.take(record(0x119D, "00 02 0000 01 00 0400 0B 00 0400"));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "0.00%");
+}
+
 Bytes frame(bool isError) {
   return with(record(0x119D, "00 01 0000 0B 00 1900", 42), 41, isError ? "01" : "00");
 }
@@ -210,6 +282,26 @@ TEST(TrafficFER, IsShownOnceMoreAsOldWhenTheCallHasEnded) {
   EXPECT_EQ(fixture.state.find("TrafficFER"), nullptr);
   fixture.take(frame(false));
   EXPECT_EQ(fixture.text("k1xTrafficFER"), "0.00%");
+}
+
+TEST(TrafficFER, ADeviceStatusThatIsNotWholeKeepsIt) {
+  auto fixture = deviceFixture();
+  fixture.take(frame(true));
+  fixture.take(record(0x119C, "00 01 0000 01 00 0500 06"));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "1.56%");
+  EXPECT_NE(fixture.state.find("TrafficFER"), nullptr);
+}
+
+TEST(TrafficFER, WithoutACallBeforeTheRowStays) {
+  auto fixture = deviceFixture();
+  fixture.take(deviceStatus("06", noPilots));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "");
+}
+
+TEST(TrafficFER, AnyNonZeroByteIsAnError) {
+  C2KFixture fixture({"k1xTrafficFER"});
+  fixture.take(with(frame(false), 41, "80"));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "1.56%");
 }
 
 TEST(TrafficFER, NeedsAtLeast17BytesAndItsSubPacket) {

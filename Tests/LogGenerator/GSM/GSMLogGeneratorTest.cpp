@@ -3,8 +3,14 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <csignal>
+
 #include "LogGenerator/Exceptions.h"
+#include "Platform/Plist/LibplistSerialiser.h"
+#include "Platform/Posix/SystemLogs.h"
+#include "Platform/Posix/TerminateHandler.h"
 #include "Telvon/Technology.h"
+#include "Tests/Support/HexBytes.h"
 #include "Tests/Support/TestPlatform.h"
 
 namespace kelvasi {
@@ -107,6 +113,119 @@ TEST(GSMLogGenerator, SavesTheHistoryAlone) {
 TEST(GSMLogGenerator, StartCommandNamesNoLogCodes) {
   const Stream stream;
   EXPECT_EQ(stream.generator.getStartCommand(), one("SetState", "Streaming"));
+}
+
+TEST(GSMLogGenerator, EveryMessageHasExtraInformationOfItsOwn) {
+  Stream stream;
+  stream.take(one("A", "x"));
+  const PlistValue first = stream.state.get("ExtraInfo");
+  first.dictionary()->set("kept", "no");
+  stream.take(one("A", "x"));
+  EXPECT_TRUE(stream.state.get("ExtraInfo").dictionary()->empty());
+}
+
+TEST(GSMLogGenerator, AListAtTheTopIsSimplifiedInside) {
+  EXPECT_EQ(GSMLogGenerator::processObject(PlistArray::make({one("A", PlistArray::make({one("B", "x")}))})),
+            PlistValue(PlistArray::make({PlistArray::make({"x"})})));
+  EXPECT_EQ(GSMLogGenerator::processObject("text"), PlistValue("text"));
+}
+
+TEST(GSMLogGenerator, WhatWasReceivedStaysAsItWas) {
+  const PlistValue message = one("A", one("B", "x"));
+  GSMLogGenerator::processObject(message);
+  EXPECT_EQ(message, one("A", one("B", "x")));
+}
+
+TEST(GSMLogGenerator, AMessageThatFailsChangesNothing) {
+  Stream stream;
+  stream.take(one("A", "x"));
+  EXPECT_THROW(stream.take(one("A", 1)), AssertionFailure);
+  EXPECT_EQ(stream.generator.generateLogUsingState(stream.state), one("A", "x"));
+  EXPECT_EQ(stream.state.get("DisplayState"), one("A", "x"));
+}
+
+// As in the program: nothing catches what the handler of a message throws.
+void endWith(const PlistValue& message) {
+  static StderrSystemLog log{LogLevel("crit")};
+  installTerminateHandler(log);
+  [&]() noexcept {
+    Stream stream;
+    if (message.isAbsent()) stream.generator.updateState(stream.state, test::hex("3F"));
+    stream.take(message);
+  }();
+}
+
+TEST(GSMLogGeneratorDeathTest, BothFailedAssertionsEndTheProcessWithTheirTexts) {
+  const auto aborted = testing::KilledBySignal(SIGABRT);
+  EXPECT_EXIT(endWith({}), aborted,
+              "^<2>Terminating: uncaught kelvasi::AssertionFailure: Could not deserialize the object "
+              "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
+  EXPECT_EXIT(
+      endWith(one("A", PlistArray::make({"x", one("B", 7)}))), aborted,
+      "^<2>Terminating: uncaught kelvasi::AssertionFailure: Unknown object of type number encountered "
+      "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
+}
+
+// Messages as they come, cut and changed at every byte: each is shown or fails as an assertion does.
+struct RealStream {
+  Platform platform() {
+    return {surroundings.log, surroundings.trace, plists, surroundings.resources, surroundings.clock};
+  }
+  bool isShown(Bytes message) {
+    message.shrink_to_fit();
+    PlistDictionary state;
+    try {
+      GSMLogGenerator(platform()).updateState(state, message);
+    } catch (const AssertionFailure&) {
+      return false;
+    }
+    return state.find("Display") != nullptr;
+  }
+
+  test::TestPlatform surroundings;
+  LibplistSerialiser plists;
+};
+
+const PlistValue sample =
+    PlistDictionary::make({{"Cell", one("GSM", PlistDictionary::make({{"ARFCN", "24"}, {"BSIC", "7"}}))},
+                           {"Neighbors", PlistArray::make({one("ARFCN", "28"), PlistDictionary::make()})}});
+
+TEST(GSMLogGeneratorSweep, CutMessagesAreShownOrFail) {
+  RealStream stream;
+  const Bytes xml = *stream.plists.serialiseXml(sample);
+  const Bytes binary = *stream.plists.serialiseBinary(sample);
+  for (const Bytes& whole : {xml, binary}) {
+    EXPECT_TRUE(stream.isShown(whole));
+    for (std::size_t length = 0; length + 16 < whole.size(); ++length)
+      EXPECT_FALSE(stream.isShown({whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(length)}));
+  }
+}
+
+TEST(GSMLogGeneratorSweep, ChangedMessagesAreShownOrFail) {
+  RealStream stream;
+  int shown = 0;
+  int failed = 0;
+  const Bytes xml = *stream.plists.serialiseXml(sample);
+  const Bytes binary = *stream.plists.serialiseBinary(sample);
+  for (const Bytes& whole : {xml, binary}) {
+    for (std::size_t at = 0; at < whole.size(); ++at) {
+      for (const int change : {0x01, 0x10, 0x80, 0xFF}) {
+        Bytes changed = whole;
+        changed[at] = static_cast<std::uint8_t>(changed[at] ^ change);
+        ++(stream.isShown(changed) ? shown : failed);
+      }
+    }
+  }
+  EXPECT_GT(shown, 100);
+  EXPECT_GT(failed, 100);
+}
+
+TEST(GSMLogGeneratorSweep, AsDeepAsAPropertyListMayBe) {
+  RealStream stream;
+  PlistValue value = "x";
+  for (int level = 0; level < 128; ++level) value = one("A", value);
+  EXPECT_TRUE(stream.isShown(*stream.plists.serialiseXml(value)));
+  EXPECT_EQ(GSMLogGenerator::processObject(value), one("A", "x"));
 }
 
 TEST(GSMLogGenerator, AMessageThatIsNoPropertyListIsAFailedAssertion) {

@@ -1,10 +1,11 @@
-// For exchange_with_plistlib.py. `write SEED FILE` writes a sample as XML, `read FILE` parses a file; both
-// print the value's canonical text.
+// For exchange_with_plistlib.py. `xml SEED FILE` and `binary SEED FILE` write a sample, `read FILE` parses a
+// file; all print the value's canonical text.
 #include <cstdio>
 #include <cstdlib>
 #include <fstream>
 #include <iterator>
 #include <string>
+#include <string_view>
 
 #include "Platform/Plist/LibplistSerialiser.h"
 #include "Tests/Platform/Plist/PlistSamples.h"
@@ -13,9 +14,10 @@ namespace {
 
 using namespace kelvasi;
 
-std::optional<PlistValue> written(const std::string& seed, const char* path) {
+std::optional<PlistValue> written(std::string_view form, const std::string& seed, const char* path) {
   const PlistValue value = testing::PlistSamples(std::stoull(seed)).value();
-  const auto bytes = LibplistSerialiser().serialiseXml(value);
+  const LibplistSerialiser plists;
+  const auto bytes = form == "xml" ? plists.serialiseXml(value) : plists.serialiseBinary(value);
   if (!bytes) return std::nullopt;
   std::ofstream(path, std::ios::binary) << testing::textOf(*bytes);
   return value;
@@ -29,7 +31,8 @@ std::optional<PlistValue> read(const char* path) {
 }  // namespace
 
 int main(int count, char** arguments) {
-  const auto value = count == 4 ? written(arguments[2], arguments[3]) : read(arguments[count - 1]);
+  const auto value =
+      count == 4 ? written(arguments[1], arguments[2], arguments[3]) : read(arguments[count - 1]);
   if (!value) return EXIT_FAILURE;
   std::puts(testing::canonical(*value).c_str());
 }

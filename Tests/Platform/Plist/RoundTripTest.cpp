@@ -1,7 +1,5 @@
 #include <gtest/gtest.h>
-#include <plist/plist.h>
 
-#include "Platform/Plist/LibplistNode.h"
 #include "Platform/Plist/LibplistSerialiser.h"
 #include "Tests/Platform/Plist/PlistSamples.h"
 
@@ -26,13 +24,12 @@ TEST(RoundTrip, ThroughXmlKeepsEveryValueAndItsOrder) {
 }
 
 TEST(RoundTrip, ThroughTheBinaryFormatKeepsEveryValueAndItsOrder) {
+  const LibplistSerialiser serialiser;
   for (std::uint64_t seed = 0; seed < seeds; ++seed) {
     const PlistValue value = PlistSamples(seed).value();
-    char* bytes = nullptr;
-    std::uint32_t size = 0;
-    plist_to_bin(toLibplist(value).get(), &bytes, &size);
-    const std::unique_ptr<char, decltype(&plist_to_bin_free)> owned(bytes, &plist_to_bin_free);
-    const auto again = LibplistSerialiser().parse(testing::bytesOf({bytes, size}));
+    const auto bytes = serialiser.serialiseBinary(value);
+    ASSERT_TRUE(bytes) << "seed " << seed;
+    const auto again = serialiser.parse(*bytes);
     ASSERT_TRUE(again) << "seed " << seed;
     ASSERT_EQ(canonical(*again), canonical(value)) << "seed " << seed;
   }

@@ -6,6 +6,7 @@
 
 #include "Platform/Plist/LibplistSerialiser.h"
 #include "Tests/Platform/Plist/PlistSamples.h"
+#include "Tests/Support/HexBytes.h"
 
 namespace kelvasi {
 namespace {
@@ -49,6 +50,19 @@ TEST(Serialise, WritesEveryKind) {
   EXPECT_THAT(xml(PlistDate{1709647629}), HasSubstr("<date>2024-03-05T14:07:09Z</date>"));
   EXPECT_THAT(xml(Bytes{0, 1, 255}), HasSubstr("AAH/"));
   EXPECT_THAT(xml(PlistArray::make()), HasSubstr("<array/>"));
+}
+
+// {"A": "x"}: a dictionary of one entry, its key, its value, and where each of them stands.
+TEST(Serialise, WritesABinaryPropertyList) {
+  const auto bytes = serialiser.serialiseBinary(PlistDictionary::make({{"A", "x"}}));
+  EXPECT_EQ(*bytes,
+            test::hex("62706C6973743030 D1 01 02 51 41 51 78 08 0B 0D"
+                      "000000000000 01 01 0000000000000003 0000000000000000 000000000000000F"));
+}
+
+TEST(Serialise, NothingForWhatIsAbsentInTheBinaryFormatEither) {
+  EXPECT_FALSE(serialiser.serialiseBinary(PlistArray::make({1, PlistValue()})));
+  EXPECT_FALSE(serialiser.serialiseBinary(inArrays(129, 1)));
 }
 
 TEST(Serialise, EscapesTextsAndKeys) {

@@ -43,10 +43,13 @@ def run(*arguments):
 
 def exchange(program, seed, path):
     """The differences found with the sample of one seed."""
-    ours = run(program, "write", str(seed), str(path))
-    value = plistlib.loads(path.read_bytes(), fmt=plistlib.FMT_XML)
-    texts = {"plistlib reads": canonical(value)}
-    for name, form in (("XML", plistlib.FMT_XML), ("binary", plistlib.FMT_BINARY)):
+    forms = (("XML", plistlib.FMT_XML), ("binary", plistlib.FMT_BINARY))
+    texts = {}
+    for name, form in forms:
+        ours = run(program, name.lower(), str(seed), str(path))
+        value = plistlib.loads(path.read_bytes(), fmt=form)
+        texts[f"plistlib reads of the {name}"] = canonical(value)
+    for name, form in forms:
         # plistlib writes carriage returns bare and reads them back as line feeds.
         if name == "XML" and "0d" in canonical(value):
             continue

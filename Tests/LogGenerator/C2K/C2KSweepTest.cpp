@@ -1,0 +1,132 @@
+// Records of every length and with every count at its most, for the sanitizers to watch.
+#include <gtest/gtest.h>
+
+#include <array>
+#include <random>
+
+#include "Tests/LogGenerator/C2K/C2KFixture.h"
+
+namespace kelvasi {
+namespace {
+
+using test::C2KFixture;
+using test::record;
+
+struct SweptRecord {
+  LogCode logCode;
+  std::size_t minimumLength;
+  bool isExact = false;  // longer ones are refused again
+};
+
+constexpr std::array swept{
+    SweptRecord{0x108A, 23, true}, SweptRecord{0x1183, 50, true}, SweptRecord{0x1192, 241},
+    SweptRecord{0x12B6, 25},       SweptRecord{0x119C, 17},       SweptRecord{0x119D, 17},
+    SweptRecord{0x127E, 1750},     SweptRecord{0x134F, 171},
+};
+
+constexpr std::array<std::uint8_t, 2> fills{0x00, 0xFF};
+
+// Every lookup name has a leaf.
+struct AllRows : C2KFixture {
+  AllRows()
+      : C2KFixture({"kChannel",         "k1xEVDODeviceState",
+                    "kBandClass",       "kRxAGC0",
+                    "kRxAGC1",          "kTxAGC",
+                    "kServingPNOffset", "kSessionState",
+                    "kUATI24",          "kColorCode",
+                    "kActiveSetPilots", "kFingerC2I",
+                    "k1xDeviceState",   "k1xRx0BandClass",
+                    "k1xRx0ChanNum",    "k1xRxAGC0",
+                    "k1xRx1BandClass",  "k1xRx1ChanNum",
+                    "k1xRxAGC1",        "k1xTxAGC",
+                    "k1xActiveSetInfo", "k1xTrafficFER",
+                    "k1xRoamingHome",   "kSystemId",
+                    "kNetworkId",       "kPacketZoneId",
+                    "kBaseId",          "kProtocolRevision",
+                    "kFLDataRate",      "kRLDataRate"}) {
+    generator.generateLogUsingState(state);
+  }
+};
+
+// In a buffer of exactly this size, so that a read past its end is seen. Every payload byte is `fill`.
+Bytes filled(LogCode logCode, std::size_t length, std::uint8_t fill) {
+  Bytes bytes = record(logCode, "");
+  bytes.resize(length, fill);
+  bytes.shrink_to_fit();
+  return bytes;
+}
+
+// Neither a row nor anything that is remembered for the next record.
+std::string everything(const C2KFixture& fixture) {
+  std::string text = fixture.display();
+  for (const char* key : {"TrafficFER", "FLDataSeqNum", "FLDataSent", "RLDataSeqNum", "RLDataSent"})
+    text += fixture.state.find(key) ? key : "";
+  return text;
+}
+
+TEST(C2KSweep, RecordsShorterThanTheirMinimumChangeNothing) {
+  for (const auto& each : swept) {
+    AllRows fixture;
+    const std::string before = everything(fixture);
+    for (std::size_t length = 0; length < each.minimumLength; ++length) {
+      for (const std::uint8_t fill : fills) fixture.take(filled(each.logCode, length, fill));
+      ASSERT_EQ(everything(fixture), before) << each.logCode << " of " << length;
+    }
+    // Below a header there is no record to complain of.
+    EXPECT_EQ(fixture.errors().size(), 2 * (each.minimumLength - RecordView::headerSize)) << each.logCode;
+  }
+}
+
+TEST(C2KSweep, RecordsOfTheirMinimumAreTaken) {
+  for (const auto& each : swept) {
+    for (std::size_t length = each.minimumLength; length <= each.minimumLength + 2; ++length) {
+      AllRows fixture;
+      fixture.take(filled(each.logCode, length, 0));
+      const bool isRefused = (each.isExact && length > each.minimumLength) || each.logCode == 0x134F;
+      EXPECT_EQ(fixture.errors().size(), isRefused ? 1u : 0u) << each.logCode << " of " << length;
+    }
+  }
+}
+
+// Counts of 255 over records that end inside the first entries, inside later ones, and behind the last.
+TEST(C2KSweep, CountsOf255AreTakenWhereverTheRecordEnds) {
+  for (const auto& each : swept) {
+    AllRows fixture;
+    for (std::size_t length = 13; length <= 700; ++length) fixture.take(filled(each.logCode, length, 0xFF));
+    for (const std::size_t length : {2500U, 3085U, 3593U, 5000U, 70000U})
+      fixture.take(filled(each.logCode, length, 0xFF));
+    EXPECT_FALSE(fixture.errors().empty()) << each.logCode;
+  }
+}
+
+TEST(C2KSweep, ListsOf255AreShownWhole) {
+  AllRows fixture;
+  fixture.take(filled(0x12B6, 25 + 12 * 255, 0xFF));
+  EXPECT_EQ(fixture.shown("kActiveSetPilots").dictionary()->size(), 256u);
+  EXPECT_EQ(test::asText(fixture.shown("kActiveSetPilots").dictionary()->get("254;65535")), "+21.07 dB");
+  Bytes fingers = filled(0x108A, 23 + 14 * 255, 0x02);
+  fingers[22] = 255;
+  fixture.take(fingers);
+  EXPECT_EQ(fixture.shown("kFingerC2I").dictionary()->size(), 256u);
+  EXPECT_EQ(test::asText(fixture.shown("kFingerC2I").dictionary()->get("254;514")), "+0.02 dB");
+}
+
+TEST(C2KSweep, RandomRecordsLeaveTextsAndDictionariesOnly) {
+  AllRows fixture;
+  fixture.surroundings.log.isMasked = true;
+  std::mt19937 random(7);
+  for (int turn = 0; turn < 4000; ++turn) {
+    const SweptRecord& each = swept[random() % swept.size()];
+    Bytes bytes = filled(each.logCode, each.minimumLength + random() % 64, 0);
+    for (std::size_t at = 13; at < bytes.size(); ++at) bytes[at] = static_cast<std::uint8_t>(random());
+    // Otherwise hardly a list or a sub-packet would be found.
+    if (turn % 2 == 0) bytes[14] = static_cast<std::uint8_t>(random() % 6);
+    if (turn % 2 == 0) bytes[15] = static_cast<std::uint8_t>(random() % 6);
+    fixture.take(bytes);
+  }
+  for (const auto& [name, value] : *fixture.state.find("Display")->dictionary())
+    EXPECT_TRUE(value.string() || value.dictionary()) << name;
+}
+
+}  // namespace
+}  // namespace kelvasi
