@@ -174,6 +174,19 @@ TEST(C2KLogGenerator, TheLookupTableNamesLeafAndDictionary) {
   EXPECT_EQ(entry.get("dict").dictionary(), fixture.state.find("Display")->dictionary());
 }
 
+TEST(C2KLogGenerator, TheLeavesOfOneNameStandInTheOrderOfTheWalk) {
+  C2KFixture fixture({});
+  fixture.useTemplate(PlistDictionary::make({{"Section", PlistDictionary::make({{"First", "kChannel"}})},
+                                             {"Second", "kChannel"},
+                                             {"Another", PlistDictionary::make({{"Third", "kChannel"}})}}));
+  const PlistValue display = fixture.generator.generateLogUsingState(fixture.state);
+  const PlistValue entries = fixture.state.find("Lookup")->dictionary()->get("kChannel");
+  std::vector<std::string> keys;
+  for (const PlistValue& entry : *entries.array()) keys.push_back(*entry.dictionary()->get("key").string());
+  EXPECT_THAT(keys, ElementsAre("First", "Second", "Third"));
+  EXPECT_EQ(test::asText(display), "Section=First=\n\nSecond=\nAnother=Third=\n\n");
+}
+
 TEST(C2KLogGenerator, ANameThatTheTemplateDoesNotUseIsDropped) {
   C2KFixture fixture({"kChannel"});
   fixture.take(emptyActiveSet());
