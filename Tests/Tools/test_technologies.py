@@ -12,8 +12,8 @@ from support import PROGRAM, pcap
 TECHNOLOGIES = {
     "IFX": ("Power", "Network/PLMN/MCC"),
     "Orvane_GSM": ("01;Registration/Process CS/MM State", "01;Registration/Serving PLMN/Service Type"),
-    "Orvane_LTE": ("01;Serving Cell/Serving Cell Measurements/E-ARFCN", "01;Serving Cell/Serving Cell Info/Freq Band Indicator"),
-    "Orvane_UTRAN2": ("01;Serving Cell/RRC Info/State", "01;Serving Cell/Serving Cell Info/Allowed Access"),
+    "Orvane_LTE": ("01;Serving Cell/Serving Cell Info/Freq Band Indicator",),
+    "Orvane_UTRAN2": ("01;Serving Cell/RRC Info/State", "01;Serving Cell/Serving Cell Info/Downlink UARFCN"),
     "Orvane_CDMA": ("01;1x/Device State", "03;EV-DO/Session State", "04;EV-DO Data Rates/Forward Link"),
 }
 OBJECT_STREAM = "IFX"
