@@ -31,7 +31,7 @@ constexpr std::uint8_t candidatesVersion = 1;
 constexpr int powerOffset = 30;       // dB, of powers and of Srxlev
 constexpr int leastQrxlevmin = -140;  // dBm
 constexpr double framesPerSecond = 100;
-constexpr int subframesPerFrame = 10;
+constexpr std::int64_t subframesPerFrame = 10;
 constexpr int frameNumbers = 1024;
 constexpr std::uint32_t samplesPerFrame = 307200;  // at 30.72 MHz
 constexpr double samplesPerMetre = 30.72e6 / 299792458;
@@ -42,6 +42,14 @@ constexpr std::uint8_t band900 = 0;
 
 int whole(double value) {
   return static_cast<int>(std::lround(value));
+}
+
+// What a handset can report (3GPP TS 36.133, 9.1.4 and 9.1.7).
+double reportedRsrp(const Reception& heard) {
+  return std::clamp(heard.level, -140.0, -44.0);
+}
+double reportedRsrq(const Reception& heard) {
+  return std::clamp(heard.ecNo, -19.5, -3.0);
 }
 
 // The nearest raw value of a scale, in so many bits.
@@ -75,10 +83,10 @@ void encodeNeighbour(const World& world, std::size_t place, RecordWriter& entry)
   const Reception& average = world.average(place);
   entry.set("physical cell identity", cell.code)
       .set("measured RSSI", raw(world.rssi(place), halfRssi, 8))
-      .set("measured RSRP", raw(now.level, halfRsrp, 9))
-      .set("average RSRP", raw(average.level, halfRsrp, 9))
-      .set("measured RSRQ", raw(now.ecNo, quarterRsrq, 7))
-      .set("average RSRQ", raw(average.ecNo, quarterRsrq, 7))
+      .set("measured RSRP", raw(reportedRsrp(now), halfRsrp, 9))
+      .set("average RSRP", raw(reportedRsrp(average), halfRsrp, 9))
+      .set("measured RSRQ", raw(reportedRsrq(now), quarterRsrq, 7))
+      .set("average RSRQ", raw(reportedRsrq(average), quarterRsrq, 7))
       .set("Srxlev", srxlevRaw(world, place))
       .set("frequency offset", dopplerShift(world, cell))
       .set("frame offset", cell.code * 37 % frameNumbers)
@@ -155,10 +163,10 @@ std::optional<Bytes> servingCellMeasurementRecord(const World& world) {
       .set("E-ARFCN", cell.frequency)
       .set("physical cell identity", cell.code)
       .set("serving layer priority", layerOf(cell).priority)
-      .set("measured RSRP", raw(now.level, quarterRsrp, 9))
-      .set("average RSRP", raw(average.level, quarterRsrp, 9))
-      .set("measured RSRQ", raw(now.ecNo, quarterRsrq, 7))
-      .set("average RSRQ", raw(average.ecNo, quarterRsrq, 7))
+      .set("measured RSRP", raw(reportedRsrp(now), quarterRsrp, 9))
+      .set("average RSRP", raw(reportedRsrp(average), quarterRsrp, 9))
+      .set("measured RSRQ", raw(reportedRsrq(now), quarterRsrq, 7))
+      .set("average RSRQ", raw(reportedRsrq(average), quarterRsrq, 7))
       .set("measured RSSI", raw(world.rssi(place), halfRssi, 9))
       .set("Qrxlevmin", qrxlevminRaw(cell))
       .set("P-Max", mostTransmitPower + powerOffset)
@@ -209,12 +217,12 @@ std::optional<Bytes> connectedModeMeasurementRecord(const World& world) {
   record.set("E-ARFCN", world.cell(place).frequency)
       .set("serving physical cell identity", world.cell(place).code)
       .set("subframe number", subframe % (frameNumbers * subframesPerFrame))
-      .set("filtered RSRP", raw(world.average(place).level, quarterRsrp, 16))
-      .set("filtered RSRQ", raw(world.average(place).ecNo, eighthRsrq, 16));
+      .set("filtered RSRP", raw(reportedRsrp(world.average(place)), quarterRsrp, 16))
+      .set("filtered RSRQ", raw(reportedRsrq(world.average(place)), eighthRsrq, 16));
   writeEntries(record, connected::measured, world.neighbours(), [&](std::size_t other, RecordWriter& entry) {
     entry.set("physical cell identity", world.cell(other).code)
-        .set("filtered RSRP", raw(world.average(other).level, quarterRsrp, 16))
-        .set("filtered RSRQ", raw(world.average(other).ecNo, eighthRsrq, 16));
+        .set("filtered RSRP", raw(reportedRsrp(world.average(other)), quarterRsrp, 16))
+        .set("filtered RSRQ", raw(reportedRsrq(world.average(other)), eighthRsrq, 16));
   });
   writeEntries(record, connected::detected, world.detected(), [&](std::size_t other, RecordWriter& entry) {
     entry.set("physical cell identity", world.cell(other).code);

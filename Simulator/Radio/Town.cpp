@@ -6,8 +6,8 @@ namespace {
 
 constexpr double jitter = 150;  // metres
 
-double along(int place, int count, double edge) {
-  return edge * (2 * (place + 0.5) / count - 1);
+double along(int number, int howMany, double edge) {
+  return edge * (2 * (number + 0.5) / howMany - 1);
 }
 
 }  // namespace
