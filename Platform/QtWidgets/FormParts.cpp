@@ -74,7 +74,7 @@ FormTitle::FormTitle(QWidget* parent) : QLabel(parent) {
 FormHeading::FormHeading(QWidget* parent) : QLabel(parent) {
   setFont(qtFont(Font::boldSystem(13)));
   setForegroundRole(QPalette::PlaceholderText);
-  setContentsMargins(14, 14, 0, 0);
+  setContentsMargins(16, 14, 0, 0);
 }
 
 }  // namespace kelvasi

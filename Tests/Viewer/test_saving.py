@@ -127,6 +127,11 @@ class Saving(ViewerTest):
         viewer.await_state(lambda state: state["saveView"] is None)
         self.assertEqual(self.snapshots(), [])
 
+    def test_it_may_end_with_the_view_open(self):
+        viewer = self.replay(MM_IDLE)
+        viewer.do("click Save")
+        self.assertEqual((viewer.close(), viewer.said()), (0, ""))
+
     def assert_alert_and_life_after_it(self, viewer):
         """One alert over the panes, which go on."""
         viewer.do("press Ctrl+S", "click Save")

@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include <QtGlobal>
+#include <QByteArray>
 #include <ctime>
 
 namespace kelvasi {

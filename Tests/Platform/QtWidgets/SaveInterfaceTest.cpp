@@ -53,6 +53,11 @@ class SaveInterfaceTest : public test::QtFixture {
     return nullptr;
   }
 
+  // A button that is pressed by its shortcut shows that it is down for a moment first.
+  void awaitUses(std::size_t count) const {
+    EXPECT_TRUE(QTest::qWaitFor([&] { return form->used.size() >= count; }, 60'000));
+  }
+
   std::unique_ptr<Form> form;
 };
 
@@ -81,7 +86,9 @@ TEST_F(SaveInterfaceTest, ButtonsAndBackgroundRunTheirActions) {
 TEST_F(SaveInterfaceTest, CtrlSSavesAndEscapeCancels) {
   const Form& shown = present();
   key(Qt::Key_S, Qt::ControlModifier);
+  awaitUses(1);
   key(Qt::Key_Escape);
+  awaitUses(2);
   EXPECT_THAT(shown.used, ElementsAre("savePressed", "cancelPressed"));
 }
 
@@ -113,6 +120,7 @@ TEST_F(SaveInterfaceTest, KeysGoOnWorkingTheFormAfterTheFieldGaveUpTheKeyboard) 
   Form& shown = present();
   shown.field().resignFirstResponder();
   QTest::keyClick(&windowWidget(), Qt::Key_S, Qt::ControlModifier);
+  awaitUses(1);
   EXPECT_THAT(shown.used, ElementsAre("savePressed"));
 }
 
@@ -129,6 +137,26 @@ TEST_F(SaveInterfaceTest, ItFollowsTheSizeOfTheWindow) {
   windowWidget().resize(500, 700);
   settle();
   EXPECT_EQ(widgetOf(shown.view()).size(), QSize(500, 700));
+}
+
+struct SixRows : TableViewDataSource {
+  std::size_t tableViewNumberOfRowsInSection(TableView&, std::size_t) override { return 6; }
+  std::unique_ptr<TableViewCell> tableViewCellForRowAtIndexPath(TableView& table, const IndexPath&) override {
+    return std::make_unique<TableViewCell>(table.makeCellBody(CellStyle::oneLabel), "row");
+  }
+  void tableViewDidSelectRowAtIndexPath(TableView&, const std::optional<IndexPath>&) override {}
+};
+
+TEST_F(SaveInterfaceTest, TheListFillsItsCardAndIsAsHighAsItsRows) {
+  SixRows rows;
+  TableView& table = *static_cast<InterfaceBody&>(present().body()).tableView("saveContentTable");
+  table.setDataSource(&rows);
+  table.sizeToFit();
+  settle();
+  const QWidget& list = widgetOf(table);
+  EXPECT_EQ(list.geometry(), list.parentWidget()->rect());
+  EXPECT_EQ(list.height(), 300);
+  table.setDataSource(nullptr);
 }
 
 TEST_F(SaveInterfaceTest, DismissedItIsTakenAwayAndThePaneHasTheKeyboardAgain) {
@@ -148,6 +176,12 @@ TEST_F(SaveInterfaceTest, AnimatedItRisesAndSinks) {
   stack->dismissModalViewController(true);
   ASSERT_NE(the<SlideOverlay>(), nullptr);
   while (the<SlideOverlay>()) QTest::qWait(1);
+}
+
+TEST_F(SaveInterfaceTest, TheStackMayGoWhileTheViewIsOpen) {
+  present();
+  stack.reset();
+  EXPECT_EQ(the<ModalLayer>(), nullptr);
 }
 
 class AlertTest : public SaveInterfaceTest {
