@@ -4,6 +4,7 @@ import plistlib
 import signal
 import unittest
 
+from live_support import DAEMON
 from support import MM_IDLE, pcap, record
 from viewer_support import ViewerTest
 
@@ -78,7 +79,8 @@ class Connection(ViewerTest):
         for technology in ("IFX", "Orvane_GSM", "Orvane_CDMA", "Orvane_LTE", "Orvane_UTRAN2"):
             with self.subTest(technology):
                 capture = self.write("world.pcap", pcap(MM_IDLE))
-                daemon = self.start_daemon("--replay", capture, "--technology", technology)
+                daemon = self.start([DAEMON, "--technology", technology, "--replay", capture])
+                self.await_line(daemon, "serving")
                 viewer = self.start_viewer()
                 viewer.await_updated()
                 self.assertEqual(viewer.close(), 0)

@@ -68,7 +68,8 @@ class Program(ViewerTest):
         self.run_viewer("--script", "-", input=f"picture {self.path('window.png')}\n")
         picture = self.read("window.png")
         self.assertEqual(picture[:8], b"\x89PNG\r\n\x1a\n")
-        self.assertEqual(int.from_bytes(picture[16:20], "big"), 2 * 390)
+        size = [int.from_bytes(picture[at:at + 4], "big") for at in (16, 20)]
+        self.assertEqual(size, [2 * 390, 2 * 844])
 
 
 class Preferences(ViewerTest):

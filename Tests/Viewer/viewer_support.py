@@ -10,6 +10,7 @@ from live_support import PATIENCE, LiveTest
 from support import TEMPLATES
 
 VIEWER = os.environ["KELVASI"]
+SCREEN = json.dumps({"screens": [{"name": "desk", "x": 0, "y": 0, "width": 2560, "height": 2048}]}).encode()
 
 
 class Viewer:
@@ -30,10 +31,10 @@ class Viewer:
 
     def state(self):
         self.do("state")
-        line = self.process.stdout.readline()
-        if not line:
-            self.test.fail(f"the viewer ended: {self.said()}")
-        return json.loads(line)
+        for line in self.process.stdout:
+            if line.startswith(b"{"):  # not a trace of a generator that went
+                return json.loads(line)
+        return self.test.fail(f"the viewer ended: {self.said()}")
 
     def await_state(self, condition):
         deadline = time.monotonic() + PATIENCE
@@ -68,7 +69,7 @@ class ViewerTest(LiveTest):
             "HOME": self.directory.name,
             "KELVASI_LOG_DIRECTORY": self.path("snapshots"),
             "KELVASI_RESOURCES": str(TEMPLATES),
-            "QT_QPA_PLATFORM": "offscreen",
+            "QT_QPA_PLATFORM": "offscreen:configfile=" + self.write("screen.json", SCREEN),
             "TZ": "UTC",
             "XDG_CONFIG_HOME": self.path("config"),
             "XDG_RUNTIME_DIR": self.directory.name,
