@@ -5,7 +5,7 @@ import signal
 import unittest
 
 from live_support import DAEMON
-from support import MM_IDLE, pcap, record
+from support import CAPTURES, MM_IDLE, pcap, record
 from viewer_support import ViewerTest
 
 UPDATED = r"^Updated \d{4}-\d\d-\d\d at \d\d:\d\d:\d\d$"
@@ -78,11 +78,12 @@ class Connection(ViewerTest):
     def test_every_technology_is_shown(self):
         for technology in ("IFX", "Orvane_GSM", "Orvane_CDMA", "Orvane_LTE", "Orvane_UTRAN2"):
             with self.subTest(technology):
-                capture = self.write("world.pcap", pcap(MM_IDLE))
-                daemon = self.start([DAEMON, "--technology", technology, "--replay", capture])
+                capture = CAPTURES / technology / "random_1.pcap"
+                daemon = self.start([DAEMON, "--technology", technology, "--replay", capture,
+                                     "--speed", "max"])
                 self.await_line(daemon, "serving")
                 viewer = self.start_viewer()
-                viewer.await_updated()
+                self.assertNotEqual(viewer.await_updated()["rows"], [])
                 self.assertEqual(viewer.close(), 0)
                 daemon.kill()
                 daemon.wait()

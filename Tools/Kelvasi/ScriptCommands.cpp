@@ -60,36 +60,43 @@ ScriptStep openNamed(const QString& name) {
   };
 }
 
-// The first branch of the pane, as soon as there is one.
-ScriptStep openFirst(const QString&) {
-  return [] {
+// The first branch of the pane, as soon as there is one, and that one's, until there are only values.
+ScriptStep openDeepest(const QString&) {
+  return [depth = 0]() mutable {
     for (const CellWidget* const cell : shownTable()->cellsInSight()) {
       if (!cell->opens()) continue;
       shownTable()->open(cell->row());
-      return done;
+      ++depth;
+      return notYet;
     }
-    return notYet;
+    return doneIf(depth > 0);
   };
 }
 
 // Opens pane after pane, the first branch first, until one shows a value that is wider than the window; then
-// scrolls it a little way.
+// scrolls it a little way and takes its picture.
 class WideValueSearch {
  public:
+  explicit WideValueSearch(const QString& path) : path_(path) {}
+
   StepResult operator()() {
     if (showsWideValue()) {
       scrollWideValue();
-      return done;
+      return doneOr(savePicture(path_), "cannot write " + path_);
     }
     if (shownTable()->rows() == 0 && tried_.size() == 1) return notYet;
     if (openNextBranch()) return notYet;
     tried_.pop_back();
-    if (tried_.empty()) return {.failure = "no value is wider than the window"};
+    if (tried_.empty()) return giveUp();
     press(Qt::Key_Escape);
     return notYet;
   }
 
  private:
+  static StepResult giveUp() {
+    std::fputs("kelvasi: no value is wider than the window, so there is no picture of one\n", stderr);
+    return done;
+  }
   bool openNextBranch() {
     TableWidget& table = *shownTable();
     for (const CellWidget* const cell : table.cellsInSight()) {
@@ -103,11 +110,12 @@ class WideValueSearch {
     return false;
   }
 
+  QString path_;
   std::vector<std::size_t> tried_{0};  // how many rows of each open pane have been looked into
 };
 
-ScriptStep findWideValue(const QString&) {
-  return WideValueSearch();
+ScriptStep takePictureOfWideValue(const QString& path) {
+  return WideValueSearch(path);
 }
 
 ScriptStep goBack(const QString&) {
@@ -167,8 +175,7 @@ constexpr std::array commands{
     Command{"await-title", awaitTitle},
     Command{"await-update", awaitUpdate},
     Command{"open", openNamed},
-    Command{"open-first", openFirst},
-    Command{"find-wide-value", findWideValue},
+    Command{"open-deepest", openDeepest},
     Command{"back", goBack},
     Command{"root", goToRoot},
     Command{"press", pressKeys},
@@ -176,6 +183,7 @@ constexpr std::array commands{
     Command{"click", clickButton},
     Command{"click-twice", clickButtonTwice},
     Command{"picture", takePicture},
+    Command{"picture-wide-value", takePictureOfWideValue},
 };
 
 }  // namespace
