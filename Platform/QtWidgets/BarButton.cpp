@@ -1,5 +1,6 @@
 #include "Platform/QtWidgets/BarButton.h"
 
+#include <QFocusEvent>
 #include <QPainter>
 #include <cmath>
 
@@ -49,11 +50,16 @@ QSize BarButton::minimumSizeHint() const {
   return {buttonHeight, buttonHeight};
 }
 
+void BarButton::focusInEvent(QFocusEvent* event) {
+  wasTabbedTo_ = event->reason() == Qt::TabFocusReason || event->reason() == Qt::BacktabFocusReason;
+  QPushButton::focusInEvent(event);
+}
+
 void BarButton::paintEvent(QPaintEvent*) {
   QPainter painter(this);
   painter.setRenderHint(QPainter::Antialiasing);
   const QColor colour = palette().color(isEnabled() ? QPalette::Highlight : QPalette::PlaceholderText);
-  if (hasFocus()) {
+  if (hasFocus() && wasTabbedTo_) {
     painter.setPen(QPen(colour, 2));
     painter.drawRoundedRect(QRectF(rect()).adjusted(3, 6, -3, -6), 7, 7);
   }

@@ -16,8 +16,13 @@ namespace kelvasi {
 
 namespace {
 
-constexpr StepResult done{.isDone = true};
-constexpr StepResult notYet{};
+StepResult notYet() {
+  return {};
+}
+
+StepResult done() {
+  return {.isDone = true};
+}
 
 StepResult doneIf(bool isDone) {
   return {.isDone = isDone};
@@ -31,7 +36,7 @@ ScriptStep showState(const QString&) {
   return [] {
     std::puts(QJsonDocument(shownState()).toJson(QJsonDocument::Compact).constData());
     std::fflush(stdout);
-    return done;
+    return done();
   };
 }
 
@@ -54,9 +59,9 @@ ScriptStep awaitUpdate(const QString&) {
 // Waits for the row, so that a script may begin before there is anything to see.
 ScriptStep openNamed(const QString& name) {
   return [name] {
-    if (!goToRow(name)) return notYet;
+    if (!goToRow(name)) return notYet();
     openRow();
-    return done;
+    return done();
   };
 }
 
@@ -67,7 +72,7 @@ ScriptStep openDeepest(const QString&) {
       if (!cell->opens()) continue;
       shownTable()->open(cell->row());
       ++depth;
-      return notYet;
+      return notYet();
     }
     return doneIf(depth > 0);
   };
@@ -84,18 +89,18 @@ class WideValueSearch {
       scrollWideValue();
       return doneOr(savePicture(path_), "cannot write " + path_);
     }
-    if (shownTable()->rows() == 0 && tried_.size() == 1) return notYet;
-    if (openNextBranch()) return notYet;
+    if (shownTable()->rows() == 0 && tried_.size() == 1) return notYet();
+    if (openNextBranch()) return notYet();
     tried_.pop_back();
     if (tried_.empty()) return giveUp();
     press(Qt::Key_Escape);
-    return notYet;
+    return notYet();
   }
 
  private:
   static StepResult giveUp() {
     std::fputs("kelvasi: no value is wider than the window, so there is no picture of one\n", stderr);
-    return done;
+    return done();
   }
   bool openNextBranch() {
     TableWidget& table = *shownTable();
@@ -121,15 +126,15 @@ ScriptStep takePictureOfWideValue(const QString& path) {
 ScriptStep goBack(const QString&) {
   return [] {
     press(Qt::Key_Escape);
-    return done;
+    return done();
   };
 }
 
 ScriptStep goToRoot(const QString&) {
   return [] {
-    if (shownState()["back"].toString().isEmpty()) return done;
+    if (shownState()["back"].toString().isEmpty()) return done();
     press(Qt::Key_Escape);
-    return notYet;
+    return notYet();
   };
 }
 
@@ -144,7 +149,7 @@ ScriptStep pressKeys(const QString& keys) {
 ScriptStep typeText(const QString& text) {
   return [text] {
     type(text);
-    return done;
+    return done();
   };
 }
 
