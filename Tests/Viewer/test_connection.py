@@ -78,7 +78,8 @@ class Connection(ViewerTest):
     def test_every_technology_is_shown(self):
         for technology in ("IFX", "Orvane_GSM", "Orvane_CDMA", "Orvane_LTE", "Orvane_UTRAN2"):
             with self.subTest(technology):
-                capture = CAPTURES / technology / "random_1.pcap"
+                name = "ifx_collapse_to_array" if technology == "IFX" else "random_1"
+                capture = CAPTURES / technology / f"{name}.pcap"
                 daemon = self.start([DAEMON, "--technology", technology, "--replay", capture,
                                      "--speed", "max"])
                 self.await_line(daemon, "serving")
