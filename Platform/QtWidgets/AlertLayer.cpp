@@ -36,6 +36,7 @@ QFrame* makeLine(QWidget& parent) {
 }  // namespace
 
 AlertLayer::AlertLayer(QWidget& parent, const AlertText& text) : Layer(parent) {
+  setAttribute(Qt::WA_DeleteOnClose);
   setAccessibleName(text.title);
   setAccessibleDescription(text.message);
   auto* const card = new Card(this);

@@ -1,5 +1,6 @@
 // The interface resource of the save view, the view over the panes, and alerts over both.
 #include <QLineEdit>
+#include <QPointer>
 
 #include "Platform/QtWidgets/AlertLayer.h"
 #include "Platform/QtWidgets/BarButton.h"
@@ -225,6 +226,13 @@ TEST_F(AlertTest, NothingBeneathIsReachedByKeyboardOrMouse) {
   EXPECT_TRUE(button("Close")->hasFocus());
   QTest::mouseClick(QApplication::widgetAt(windowWidget().mapToGlobal(QPoint(100, 70))), Qt::LeftButton);
   EXPECT_THAT(pane.opened, IsEmpty());
+}
+
+TEST_F(AlertTest, ItGoesWithItsWindow) {
+  showRows(3);
+  const QPointer<AlertLayer> shown = &alert();
+  window.reset();
+  EXPECT_EQ(shown, nullptr);
 }
 
 TEST_F(AlertTest, ItStaysAfterTheSaveViewBelowItIsGone) {
