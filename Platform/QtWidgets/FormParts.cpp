@@ -47,6 +47,7 @@ void Card::paintEvent(QPaintEvent*) {
 }
 
 ListCard::ListCard(QWidget* parent) : Card(parent) {
+  // NOLINTNEXTLINE(cppcoreguidelines-prefer-member-initializer): its coming calls childEvent(), which asks
   corners_ = new CardCorners(this);
 }
 
