@@ -111,7 +111,8 @@ void startViewer(benchmark::State& state) {
   const PrivateRuntimeDirectory runtime;
   for (auto _ : state) {
     std::optional<Process> viewer(std::in_place, KELVASI_BENCH_VIEWER,
-                                  std::vector<std::string>{"--script", stateScript}, Process::Output::talking);
+                                  std::vector<std::string>{"--script", stateScript},
+                                  Process::Output::talking);
     if (!viewer->waitForOutput()) return state.SkipWithError("the viewer showed nothing");
     state.PauseTiming();
     viewer.reset();
