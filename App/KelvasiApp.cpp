@@ -22,7 +22,7 @@ constexpr const char* updatePattern = "'Updated' yyyy-MM-dd 'at' HH:mm:ss";
 
 // Only panes are ever put on the stack.
 KelvasiPaneController& asPane(ViewController& controller) {
-  return static_cast<KelvasiPaneController&>(controller);
+  return dynamic_cast<KelvasiPaneController&>(controller);
 }
 
 }  // namespace

@@ -23,6 +23,7 @@ class KelvasiApp : public Application,
                    public SaveShell {
  public:
   explicit KelvasiApp(const AppPlatform& platform) : platform_(platform) {}
+  ~KelvasiApp() override { setSaveViewController(nullptr); }
   ApplicationDelegate* asDelegate() override { return this; }
 
   // Switches the home-screen shell's display of the signal strength.

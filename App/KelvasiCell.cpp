@@ -22,6 +22,10 @@ double centred(double height, double in) {
   return (in - height) * 0.5;
 }
 
+Rect keyFrame(const Rect& bounds, Size size) {
+  return {bounds.x + keyIndent, centred(size.height, bounds.height), size.width, size.height};
+}
+
 }  // namespace
 
 KelvasiCell::KelvasiCell(UserInterface& ui, TableView& table, StyleKey styleKey, std::string reuseIdentifier)
@@ -49,10 +53,6 @@ void KelvasiCell::setValue(std::string_view text) {
 // The value too is measured in the bold font, though drawn in the regular one.
 Size KelvasiCell::sizeOf(const Label& label) const {
   return ui_.sizeOfText(label.text(), Font::boldSystem(fontSize));
-}
-
-Rect KelvasiCell::keyFrame(const Rect& bounds, Size size) const {
-  return {bounds.x + keyIndent, centred(size.height, bounds.height), size.width, size.height};
 }
 
 void KelvasiCell::setLayoutKey() {

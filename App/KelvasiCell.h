@@ -32,7 +32,6 @@ class KelvasiCell : public TableViewCell {
 
  private:
   Size sizeOf(const Label& label) const;
-  Rect keyFrame(const Rect& bounds, Size size) const;
 
   UserInterface& ui_;
   // The view first: the labels in it go before it does.

@@ -87,7 +87,7 @@ std::unique_ptr<TableViewCell> KelvasiPaneController::tableViewCellForRowAtIndex
     TableView& tableView, const IndexPath& indexPath) {
   const KelvasiModelNode& child = childAt(indexPath);
   auto reused = tableView.dequeueReusableCellWithIdentifier(cellIdentifier);
-  // The table holds no other cells than those made here.
+  // NOLINTNEXTLINE(cppcoreguidelines-pro-type-static-cast-downcast): the table holds only cells made here
   std::unique_ptr<KelvasiCell> cell(static_cast<KelvasiCell*>(reused.release()));
   constexpr CellStyle style = CellStyle::twoLabelValue;
   if (child.childNodes()) {

@@ -42,7 +42,7 @@ KelvasiSaveViewController::KelvasiSaveViewController(const AppPlatform& platform
       shell_(shell),
       timeStamp_(platform.core.clock.now()),
       saveHistory_(saveHistory.shallowCopy()) {
-  auto& parts = static_cast<InterfaceBody&>(body());
+  auto& parts = dynamic_cast<InterfaceBody&>(body());
   setSaveContentTable(*parts.tableView("saveContentTable"));
   setSaveDescription(*parts.textField("saveDescription"));
   parts.setAction("savePressed", [this] { savePressed(); });

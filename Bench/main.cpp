@@ -3,6 +3,7 @@
 #include <cstring>
 #include <vector>
 
+#include "Bench/App/ViewerBench.h"
 #include "Bench/LogGenerator/DecodeBench.h"
 #include "Bench/Model/TreeBench.h"
 #include "Bench/Platform/ChannelBench.h"
@@ -43,6 +44,7 @@ int main(int count, char** arguments) {
   addTree(table);
   addChannel(table, isSmoke);
   addToolStart(table, isSmoke);
+  addViewer(table, isSmoke);
   benchmark::RunSpecifiedBenchmarks(&table);
   return table.isComplete() ? 0 : 1;
 }

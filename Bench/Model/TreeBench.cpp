@@ -14,12 +14,6 @@ namespace {
 
 constexpr std::size_t messagesPerTick = 1000;
 
-struct Candidate {
-  Technology technology;
-  Messages messages;
-  std::size_t nodes;
-};
-
 std::size_t treeSize(const PlistValue& display) {
   PathDictionary nodes;
   KelvasiModelNode::makeTreeFromObject(display, nodes);
@@ -31,20 +25,14 @@ PlistValue displayOf(Decoding& generator, const Messages& messages) {
   return generator.tick();
 }
 
-Candidate candidate(const Technology& technology) {
+FilledDisplay filled(const Technology& technology) {
   Messages messages = mixtureOf(technology, messagesPerTick);
   Decoding generator(technology.id);
   const std::size_t nodes = treeSize(displayOf(generator, messages));
   return {technology, std::move(messages), nodes};
 }
 
-Candidate largest() {
-  std::vector<Candidate> candidates;
-  std::ranges::transform(technologies(), std::back_inserter(candidates), candidate);
-  return std::ranges::max(candidates, {}, &Candidate::nodes);
-}
-
-void buildTree(benchmark::State& state, const Candidate& display) {
+void buildTree(benchmark::State& state, const FilledDisplay& display) {
   Decoding generator(display.technology.id);
   const PlistValue shown = displayOf(generator, display.messages);
   const std::uint64_t before = test::allocationsSoFar();
@@ -56,7 +44,7 @@ void buildTree(benchmark::State& state, const Candidate& display) {
 }
 
 // The tree of the tick before is released within the tick, as the model does.
-void tick(benchmark::State& state, const Candidate& display) {
+void tick(benchmark::State& state, const FilledDisplay& display) {
   Decoding generator(display.technology.id);
   PathDictionary nodes;
   std::uint64_t allocated = 0;
@@ -74,8 +62,14 @@ void tick(benchmark::State& state, const Candidate& display) {
 
 }  // namespace
 
+FilledDisplay largestDisplay() {
+  std::vector<FilledDisplay> displays;
+  std::ranges::transform(technologies(), std::back_inserter(displays), filled);
+  return std::ranges::max(displays, {}, &FilledDisplay::nodes);
+}
+
 void addTree(Table& table) {
-  const Candidate display = largest();
+  const FilledDisplay display = largestDisplay();
   Decoding generator(display.technology.id);
   const PlainRows rows(displayOf(generator, display.messages));
   const std::string what =

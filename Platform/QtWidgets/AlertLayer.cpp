@@ -25,9 +25,18 @@ QLabel* makeText(const QString& text, const Font& font, QWidget& parent) {
   return label;
 }
 
+QFrame* makeLine(QWidget& parent) {
+  auto* const line = new QFrame(&parent);
+  line->setFixedHeight(1);
+  line->setAutoFillBackground(true);
+  line->setBackgroundRole(QPalette::Mid);
+  return line;
+}
+
 }  // namespace
 
 AlertLayer::AlertLayer(QWidget& parent, const AlertText& text) : Layer(parent) {
+  setAttribute(Qt::WA_DeleteOnClose);
   setAccessibleName(text.title);
   setAccessibleDescription(text.message);
   auto* const card = new Card(this);
@@ -46,11 +55,12 @@ void AlertLayer::fill(Card& card, const AlertText& text) {
   button_->setObjectName(QStringLiteral("alertButton"));
   connect(button_, &QAbstractButton::clicked, this, [this] { close(); });
   auto* const layout = new QVBoxLayout(&card);
-  layout->setContentsMargins(0, 20, 0, 4);
+  layout->setContentsMargins(0, 20, 0, 0);
   layout->setSpacing(6);
   layout->addWidget(makeText(text.title, Font::boldSystem(17), card));
   layout->addWidget(makeText(text.message, Font::system(14), card));
   layout->addSpacing(8);
+  layout->addWidget(makeLine(card));
   layout->addWidget(button_);
 }
 

@@ -1,6 +1,8 @@
 #include "Platform/QtWidgets/BarButton.h"
 
+#include <QFocusEvent>
 #include <QPainter>
+#include <cmath>
 
 #include "Platform/QtWidgets/Fonts.h"
 #include "Platform/QtWidgets/Glyphs.h"
@@ -11,6 +13,7 @@ namespace {
 
 constexpr int buttonHeight = 44;  // as much as a fingertip covers
 constexpr int margin = 10;
+constexpr int slack = 2;
 constexpr double fontSize = 16;
 constexpr double pressedOpacity = 0.4;
 
@@ -36,19 +39,27 @@ int BarButton::chevronWidth() const {
   return isBack_ ? 14 : 0;
 }
 
+// Fonts are up to a point wider on screens of another scale than their metrics say. The bold font keeps its
+// room, whether the button is the default one or not.
 QSize BarButton::sizeHint() const {
-  return {QFontMetrics(textFont()).horizontalAdvance(text()) + chevronWidth() + 2 * margin, buttonHeight};
+  const double width = QFontMetricsF(qtFont(Font::boldSystem(fontSize))).horizontalAdvance(text());
+  return {static_cast<int>(std::ceil(width)) + slack + chevronWidth() + 2 * margin, buttonHeight};
 }
 
 QSize BarButton::minimumSizeHint() const {
   return {buttonHeight, buttonHeight};
 }
 
+void BarButton::focusInEvent(QFocusEvent* event) {
+  wasTabbedTo_ = event->reason() == Qt::TabFocusReason || event->reason() == Qt::BacktabFocusReason;
+  QPushButton::focusInEvent(event);
+}
+
 void BarButton::paintEvent(QPaintEvent*) {
   QPainter painter(this);
   painter.setRenderHint(QPainter::Antialiasing);
   const QColor colour = palette().color(isEnabled() ? QPalette::Highlight : QPalette::PlaceholderText);
-  if (hasFocus()) {
+  if (hasFocus() && wasTabbedTo_) {
     painter.setPen(QPen(colour, 2));
     painter.drawRoundedRect(QRectF(rect()).adjusted(3, 6, -3, -6), 7, 7);
   }
@@ -58,7 +69,7 @@ void BarButton::paintEvent(QPaintEvent*) {
   painter.setPen(colour);
   painter.setFont(textFont());
   const Qt::Alignment alignment = (isBack_ ? Qt::AlignLeft : Qt::AlignHCenter) | Qt::AlignVCenter;
-  painter.drawText(area, static_cast<int>(alignment),
+  painter.drawText(area, static_cast<int>(alignment) | Qt::TextSingleLine,
                    painter.fontMetrics().elidedText(text(), Qt::ElideRight, area.width()));
 }
 

@@ -19,12 +19,14 @@ class BarButton : public QPushButton {
 
  protected:
   void paintEvent(QPaintEvent* event) override;
+  void focusInEvent(QFocusEvent* event) override;
 
  private:
   QFont textFont() const;
   int chevronWidth() const;
 
   bool isBack_ = false;
+  bool wasTabbedTo_ = false;  // the keyboard is marked only where it was moved by hand
 };
 
 }  // namespace kelvasi

@@ -43,6 +43,7 @@ void CellWidget::setAccessory(CellAccessory accessory) {
 
 void CellWidget::showRow(std::size_t row) {
   if (std::exchange(row_, row) == row) return;
+  update();
   if (QtScrollView* view = scrollView()) view->scrollTo(0);
 }
 
@@ -54,10 +55,10 @@ void CellWidget::setFocusMark(bool marked) {
   if (std::exchange(hasFocusMark_, marked) != marked) update();
 }
 
-QString CellWidget::spokenText() const {
-  QStringList texts;
-  content_.group.collectTexts(texts);
-  return texts.join(QStringLiteral(", "));
+QStringList CellWidget::texts() const {
+  QStringList all;
+  content_.group.collectTexts(all);
+  return all;
 }
 
 QColor CellWidget::ground() const {
@@ -77,15 +78,17 @@ void CellWidget::paintEvent(QPaintEvent*) {
 
 void CellWidget::paintAccessory(QPainter& painter) const {
   const QRectF area(width() - glyphWidth, 0, glyphWidth, height());
-  if (opens()) drawGlyph(painter, Glyph::disclosure, area, palette().color(QPalette::PlaceholderText));
+  if (opens()) drawGlyph(painter, Glyph::disclosure, area, palette().color(QPalette::Dark));
   if (isChecked()) drawGlyph(painter, Glyph::checkmark, area, palette().color(QPalette::Highlight));
 }
 
-// One pixel of the screen, whatever its scale.
+// One pixel of the screen, whatever its scale. One-label rows lie on a card: lines are only between them.
 void CellWidget::paintLine(QPainter& painter) const {
   const double thickness = 1 / devicePixelRatioF();
-  const double indent = style_ == CellStyle::oneLabel ? labelIndent : lineIndent;
-  painter.fillRect(QRectF(indent, height() - thickness, width() - indent, thickness),
+  const bool isOnCard = style_ == CellStyle::oneLabel;
+  if (isOnCard && row_ == 0) return;
+  const double indent = isOnCard ? labelIndent : lineIndent;
+  painter.fillRect(QRectF(indent, isOnCard ? 0 : height() - thickness, width() - indent, thickness),
                    palette().color(QPalette::Mid));
 }
 

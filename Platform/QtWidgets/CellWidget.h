@@ -28,8 +28,10 @@ class CellWidget : public QWidget, public CellBody {
   // Null when nothing in the row scrolls.
   QtScrollView* scrollView() const { return content_.group.scrollView(); }
 
-  // The row's texts as one, for those who do not see it.
-  QString spokenText() const;
+  // What the row says, its name first.
+  QStringList texts() const;
+  // The same as one, for those who do not see it.
+  QString spokenText() const { return texts().join(QStringLiteral(", ")); }
   bool opens() const { return accessory_ == CellAccessory::disclosureIndicator; }
   bool isChecked() const { return accessory_ == CellAccessory::checkmark; }
   bool hasFocusMark() const { return hasFocusMark_; }

@@ -1,14 +1,38 @@
 #include "Platform/QtWidgets/FormParts.h"
 
+#include <QChildEvent>
 #include <QPainter>
+#include <QPainterPath>
 
 #include "Platform/QtWidgets/Fonts.h"
 
 namespace kelvasi {
 
 namespace {
+
 constexpr double radius = 12;
-}
+
+// Paints the ground behind a card over its corners.
+class CardCorners : public QWidget {
+ public:
+  explicit CardCorners(ListCard* card) : QWidget(card) {
+    setAttribute(Qt::WA_TransparentForMouseEvents);
+    setFocusPolicy(Qt::NoFocus);
+  }
+
+ protected:
+  void paintEvent(QPaintEvent*) override {
+    QPainterPath outside;
+    outside.addRect(rect());
+    QPainterPath inside;
+    inside.addRoundedRect(rect(), radius, radius);
+    QPainter painter(this);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.fillPath(outside.subtracted(inside), palette().color(QPalette::Light));
+  }
+};
+
+}  // namespace
 
 Card::Card(QWidget* parent) : QFrame(parent) {
   setFrameShape(QFrame::NoFrame);
@@ -20,6 +44,20 @@ void Card::paintEvent(QPaintEvent*) {
   painter.setPen(Qt::NoPen);
   painter.setBrush(palette().color(QPalette::Base));
   painter.drawRoundedRect(rect(), radius, radius);
+}
+
+ListCard::ListCard(QWidget* parent) : Card(parent) {
+  // NOLINTNEXTLINE(cppcoreguidelines-prefer-member-initializer): its coming calls childEvent(), which asks
+  corners_ = new CardCorners(this);
+}
+
+void ListCard::resizeEvent(QResizeEvent*) {
+  corners_->setGeometry(rect());
+}
+
+void ListCard::childEvent(QChildEvent* event) {
+  Card::childEvent(event);
+  if (event->added() && corners_) corners_->raise();
 }
 
 BackgroundControl::BackgroundControl(QWidget* parent) : QAbstractButton(parent) {
@@ -37,7 +75,7 @@ FormTitle::FormTitle(QWidget* parent) : QLabel(parent) {
 FormHeading::FormHeading(QWidget* parent) : QLabel(parent) {
   setFont(qtFont(Font::boldSystem(13)));
   setForegroundRole(QPalette::PlaceholderText);
-  setContentsMargins(14, 14, 0, 0);
+  setContentsMargins(16, 14, 0, 0);
 }
 
 }  // namespace kelvasi

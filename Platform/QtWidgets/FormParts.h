@@ -15,6 +15,19 @@ class Card : public QFrame {
   void paintEvent(QPaintEvent* event) override;
 };
 
+// A card in a form whose corners cut what lies on it too.
+class ListCard : public Card {
+ public:
+  explicit ListCard(QWidget* parent = nullptr);
+
+ protected:
+  void resizeEvent(QResizeEvent* event) override;
+  void childEvent(QChildEvent* event) override;
+
+ private:
+  QWidget* corners_ = nullptr;  // a child
+};
+
 // Covers a form's background; a click on it is a touch of no other control.
 class BackgroundControl : public QAbstractButton {
  public:

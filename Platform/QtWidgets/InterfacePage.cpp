@@ -53,7 +53,7 @@ TextField* InterfacePage::textField(std::string_view name) {
 
 void InterfacePage::setAction(std::string_view name, std::function<void()> action) {
   auto buttons = widget().findChildren<QAbstractButton*>();
-  buttons.append(static_cast<QAbstractButton*>(&widget()));
+  buttons.append(dynamic_cast<QAbstractButton*>(&widget()));
   for (QAbstractButton* const button : buttons) {
     if (button->property("action").toString() == qtText(name))
       QObject::connect(button, &QAbstractButton::clicked, &widget(), [action] { action(); });

@@ -37,8 +37,11 @@ void NavigationBar::show(const QString& title, const QString& back) {
   update();
 }
 
+// At least a third of the bar, and what a short title in the middle leaves.
 void NavigationBar::placeBackButton() {
-  back_->setGeometry(0, 0, std::min(back_->sizeHint().width(), width() / 3), barHeight);
+  const int besideTitle = (width() - fontMetrics().horizontalAdvance(title_)) / 2 - margin;
+  back_->setGeometry(0, 0, std::min(back_->sizeHint().width(), std::max(width() / 3, besideTitle)),
+                     barHeight);
 }
 
 void NavigationBar::resizeEvent(QResizeEvent*) {

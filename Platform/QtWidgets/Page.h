@@ -64,7 +64,7 @@ class PageBody : public Interface, public Page {
 class TablePage : public PageBody<TableControllerBody> {
  public:
   TablePage() : PageBody(std::unique_ptr<QWidget, DeleteLater>(new TableWidget)) {}
-  TableWidget& tableView() override { return static_cast<TableWidget&>(widget()); }
+  TableWidget& tableView() override { return dynamic_cast<TableWidget&>(widget()); }
 };
 
 }  // namespace kelvasi

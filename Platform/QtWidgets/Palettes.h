@@ -1,8 +1,9 @@
 // The viewer's colours, as palettes: every widget takes them from its own palette.
 //   Base             rows                  AlternateBase  a row that is pressed or selected
 //   Window           bars                  Light          the ground behind cards
-//   Text, WindowText texts                 PlaceholderText  texts of less weight, glyphs
-//   Mid              hairlines             Highlight      what can be pressed
+//   Text, WindowText texts                 PlaceholderText  texts of less weight
+//   Mid              hairlines             Dark           chevrons
+//   Highlight        what can be pressed
 #pragma once
 
 #include <QPalette>

@@ -1,8 +1,7 @@
 #include "Platform/QtWidgets/QtApplicationFramework.h"
 
-#include <signal.h>
-
 #include <QApplication>
+#include <csignal>
 
 #include "Platform/Qt/QtEventLoop.h"
 

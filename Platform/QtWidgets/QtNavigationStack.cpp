@@ -33,7 +33,14 @@ QtNavigationStack::QtNavigationStack(std::unique_ptr<ViewController> root, bool 
   widget_->toolbar().hide();
 }
 
-QtNavigationStack::~QtNavigationStack() = default;
+// The pages belong to their controllers, which go later than the widgets around them.
+QtNavigationStack::~QtNavigationStack() {
+  for (const auto& controller : viewControllers()) {
+    Page& page = pageOf(*controller);
+    page.setChanged(nullptr);
+    page.widget().setParent(nullptr);
+  }
+}
 
 void QtNavigationStack::setToolbarHidden(bool hidden, bool) {
   widget_->toolbar().setVisible(!hidden);

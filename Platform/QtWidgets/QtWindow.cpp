@@ -18,8 +18,10 @@ QtWindow::QtWindow(const Rect& frame, bool fullScreen)
   layout->setContentsMargins(0, 0, 0, 0);
 }
 
+// What destroys itself goes with the window; the rest is somebody else's.
 QtWindow::~QtWindow() {
   for (QWidget* const subview : widget_->findChildren<QWidget*>(Qt::FindDirectChildrenOnly)) {
+    if (subview->testAttribute(Qt::WA_DeleteOnClose)) continue;
     subview->hide();
     subview->setParent(nullptr);
   }

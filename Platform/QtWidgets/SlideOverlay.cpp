@@ -17,6 +17,7 @@ SlideOverlay::SlideOverlay(QWidget& parent, const QRect& area, Pictures pictures
                            int barHeight)
     : QWidget(&parent), pictures_(std::move(pictures)), direction_(direction), barHeight_(barHeight) {
   setAttribute(Qt::WA_TransparentForMouseEvents);
+  setAttribute(Qt::WA_DeleteOnClose);
   setGeometry(area);
   progress_.setDuration(duration);
   progress_.setEasingCurve(QEasingCurve::OutCubic);

@@ -25,6 +25,12 @@ bool isBack(const QKeyEvent& event) {
   }
 }
 
+// Not with the keyboard in it: Qt would hand that on as if Tab had been pressed.
+void takeAway(QWidget& page) {
+  if (QWidget* const focused = page.focusWidget()) focused->clearFocus();
+  page.hide();
+}
+
 }  // namespace
 
 StackWidget::StackWidget(std::function<void()> goBack)
@@ -41,7 +47,7 @@ StackWidget::StackWidget(std::function<void()> goBack)
 }
 
 void StackWidget::showPage(QWidget& page) {
-  if (page_ && page_ != &page) page_->hide();
+  if (page_ && page_ != &page) takeAway(*page_);
   page_ = &page;
   page.setParent(content_);
   placePage();

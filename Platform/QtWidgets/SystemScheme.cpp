@@ -6,7 +6,6 @@
 #include <QDBusVariant>
 #include <QEvent>
 #include <QGuiApplication>
-#include <QTimer>
 #include <utility>
 
 #include "Platform/QtDesktop/SessionBus.h"
@@ -40,7 +39,8 @@ QVariant unwrapped(QVariant value) {
 
 SystemScheme::SystemScheme(Changed changed) : changed_(std::move(changed)), scheme_(schemeOfPalette()) {
   qGuiApp->installEventFilter(this);
-  QTimer::singleShot(0, this, [this] { askPortal(); });
+  QMetaObject::invokeMethod(
+      this, [this] { askPortal(); }, Qt::QueuedConnection);
 }
 
 void SystemScheme::askPortal() {

@@ -16,7 +16,7 @@ namespace {
 constexpr int deselectionTime = 300;
 
 CellWidget& widgetOf(const TableViewCell& cell) {
-  return static_cast<CellWidget&>(cell.body());
+  return dynamic_cast<CellWidget&>(cell.body());
 }
 
 void setUpScroller(QWidget& viewport) {
@@ -33,14 +33,14 @@ void setUpScroller(QWidget& viewport) {
 
 }  // namespace
 
-TableWidget::TableWidget(QWidget* parent) : QAbstractScrollArea(parent) {
+TableWidget::TableWidget(QWidget* parent)
+    : QAbstractScrollArea(parent), indicator_(new ScrollIndicator(*this, *verticalScrollBar())) {
   setFrameShape(QFrame::NoFrame);
   setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
   setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
   setFocusPolicy(Qt::StrongFocus);
   viewport()->setBackgroundRole(QPalette::Base);
   setUpScroller(*viewport());
-  indicator_ = new ScrollIndicator(*this, *verticalScrollBar());
   fade_.setDuration(deselectionTime);
   fade_.setStartValue(1.0);
   fade_.setEndValue(0.0);

@@ -38,11 +38,11 @@ bool TableWidget::viewportEvent(QEvent* event) {
 // One finger scrolls the table up and down and the row under it sideways.
 bool TableWidget::handleScroller(QEvent& event) {
   if (event.type() == QEvent::ScrollPrepare) {
-    prepareScroll(static_cast<QScrollPrepareEvent&>(event));
+    prepareScroll(dynamic_cast<QScrollPrepareEvent&>(event));
     return true;
   }
   if (event.type() == QEvent::Scroll) {
-    scrollTo(static_cast<QScrollEvent&>(event).contentPos());
+    scrollTo(dynamic_cast<QScrollEvent&>(event).contentPos());
     return true;
   }
   return false;

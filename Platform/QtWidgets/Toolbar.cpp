@@ -68,9 +68,9 @@ QWidget* Toolbar::widgetFor(const ToolbarItem& item) {
 
 void Toolbar::show(std::size_t place, const ToolbarItem& item) {
   if (const auto* spinner = std::get_if<ActivitySpinner>(&item))
-    static_cast<Spinner*>(widgets_[place])->setAnimating(spinner->isAnimating, spinner->hidesWhenStopped);
+    dynamic_cast<Spinner*>(widgets_[place])->setAnimating(spinner->isAnimating, spinner->hidesWhenStopped);
   if (const auto* label = std::get_if<ToolbarLabel>(&item)) {
-    auto& shown = static_cast<QLabel&>(*widgets_[place]);
+    auto& shown = dynamic_cast<QLabel&>(*widgets_[place]);
     shown.setFont(qtFont(label->font));
     shown.setText(qtText(label->text));
     shown.setMinimumWidth(1);
@@ -81,7 +81,7 @@ void Toolbar::show(std::size_t place, const ToolbarItem& item) {
 QAbstractButton* Toolbar::saveButton() const {
   for (std::size_t place = 0; place < items_.size(); ++place) {
     if (std::holds_alternative<SaveButton>(items_[place]))
-      return static_cast<QAbstractButton*>(widgets_[place]);
+      return dynamic_cast<QAbstractButton*>(widgets_[place]);
   }
   return nullptr;
 }

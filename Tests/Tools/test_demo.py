@@ -9,6 +9,7 @@ import unittest
 from live_support import DAEMON, PATIENCE, LiveTest
 from support import PROGRAM
 
+VIEWER = os.environ["KELVASI"]
 SOURCES = pathlib.Path(__file__).resolve().parent.parent.parent
 
 
@@ -18,7 +19,7 @@ class Demo(LiveTest):
         checkout = pathlib.Path(self.path("checkout"))
         tools = checkout / "build" / "release" / "Tools"
         tools.mkdir(parents=True)
-        for program in (PROGRAM, DAEMON):
+        for program in (PROGRAM, DAEMON, VIEWER):
             (tools / pathlib.Path(program).name).symlink_to(program)
         (tools.parent / "build.ninja").touch()
         self.demo = shutil.copy(SOURCES / "demo", checkout)
@@ -26,7 +27,13 @@ class Demo(LiveTest):
         self.write_script(checkout / "bin" / "cmake")
         self.temporary = pathlib.Path(self.path("temporary"))
         self.temporary.mkdir()
+        for unset in ("DISPLAY", "WAYLAND_DISPLAY", "QT_QPA_PLATFORM", "DBUS_SESSION_BUS_ADDRESS"):
+            self.environment.pop(unset, None)
+        self.pictures = checkout / "build" / "demo"
+        self.no_display = f"demo: there is no display; pictures of the viewer go to {self.pictures}\n"
         self.environment |= {
+            "HOME": self.path("home"),
+            "XDG_RUNTIME_DIR": self.directory.name,
             "PATH": f"{checkout / 'bin'}:{os.environ['PATH']}",
             "TMPDIR": str(self.temporary),
             "KELVASI_RESOURCES": str(SOURCES / "Resources"),
@@ -63,9 +70,9 @@ class Demo(LiveTest):
         for process in self.rest():
             os.kill(process, signal.SIGKILL)
 
-    def check_ended(self, demo, status=0, errors=""):
+    def check_ended(self, demo, status=0, errors=None):
         text = demo.communicate(timeout=PATIENCE)[1].decode()
-        self.assertEqual((demo.returncode, text), (status, errors))
+        self.assertEqual((demo.returncode, text), (status, self.no_display if errors is None else errors))
         self.assertEqual(self.rest(), [])
         self.assertEqual(list(self.temporary.iterdir()), [])
 
@@ -73,6 +80,35 @@ class Demo(LiveTest):
         demo = self.start_demo("--seconds", "5")
         self.assertIn(b"/Registration/Process CS/MM State", demo.stdout.read())
         self.check_ended(demo)
+
+    def test_without_a_display_it_leaves_pictures(self):
+        self.check_ended(self.start_demo("--seconds", "1"))
+        for name in ("root", "deep", "long-value", "save-view"):
+            self.assertEqual((self.pictures / f"{name}.png").read_bytes()[:8], b"\x89PNG\r\n\x1a\n")
+
+    def test_a_display_that_cannot_be_reached_is_none(self):
+        self.environment["DISPLAY"] = ":nowhere"
+        demo = self.start_demo("--seconds", "1")
+        text = demo.communicate(timeout=PATIENCE)[1].decode()
+        self.assertIn(self.no_display, text)
+        self.assertEqual(demo.returncode, 0)
+        self.assertTrue((self.pictures / "save-view.png").exists())
+
+    def test_the_end_of_the_window_ends_it(self):
+        # A display for the demo; Qt is told to do without it.
+        self.environment |= {"DISPLAY": ":nowhere", "QT_QPA_PLATFORM": "offscreen"}
+        demo = self.start_demo("--seconds", "1000")
+        for _ in range(3):
+            demo.stdout.readline()
+        os.kill(self.viewer(), signal.SIGTERM)
+        self.check_ended(demo, errors="")
+
+    def viewer(self):
+        """The process of the viewer that the demo started."""
+        for process in self.rest():
+            if pathlib.Path(f"/proc/{process}/comm").read_text() == "kelvasi\n":
+                return process
+        return self.fail("there is no viewer")
 
     def test_an_interrupt_ends_it_and_all_that_it_started(self):
         demo = self.start_demo("--seconds", "1000")
@@ -91,7 +127,7 @@ class Demo(LiveTest):
         for _ in range(3):
             demo.stdout.readline()
         demo.stdout.close()
-        self.check_ended(demo, 1, "kelvasictl: standard output: Broken pipe\n")
+        self.check_ended(demo, 1, self.no_display + "kelvasictl: standard output: Broken pipe\n")
 
 
 if __name__ == "__main__":

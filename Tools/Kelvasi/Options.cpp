@@ -10,7 +10,6 @@ namespace kelvasi {
 namespace {
 
 constexpr int wrongUsage = 2;
-constexpr const char* developers = "";  // a group without a name is left out of the help
 
 std::string environment(const char* name) {
   const char* const value = std::getenv(name);
@@ -26,7 +25,10 @@ void addOptions(CLI::App& app, Options& options) {
          "--appearance", [&options](ColourScheme scheme) { options.colourScheme = scheme; },
          "light or dark; the desktop's otherwise")
       ->transform(CLI::CheckedTransformer(schemes, CLI::ignore_case));
-  app.add_option("--screenshots", options.screenshots)->group(developers)->check(CLI::ExistingDirectory);
+  app.add_option(
+         "--script", options.script,
+         "lead the window through the commands of a file (Docs/viewer-script.md); - is the standard input")
+      ->type_name("FILE");
 }
 
 }  // namespace

@@ -11,7 +11,7 @@ namespace kelvasi {
 struct Options {
   bool fullScreen = false;
   std::optional<ColourScheme> colourScheme;
-  std::string screenshots;  // a directory; empty for none
+  std::string script;  // the name of a file; "-" for the standard input, empty for none
 };
 
 struct CommandLine {

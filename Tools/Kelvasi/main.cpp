@@ -1,5 +1,6 @@
 // kelvasi: wires the viewer to its surroundings.
 #include <cstdio>
+#include <system_error>
 
 #include "App/KelvasiApp.h"
 #include "Platform/Plist/LibplistSerialiser.h"
@@ -17,13 +18,14 @@
 #include "Platform/QtWidgets/QtApplicationFramework.h"
 #include "Platform/QtWidgets/QtUserInterface.h"
 #include "Tools/Kelvasi/Options.h"
-#include "Tools/Kelvasi/ScreenshotTour.h"
+#include "Tools/Kelvasi/Script.h"
 
 namespace kelvasi {
 
 namespace {
 
-void run(QtApplicationFramework& framework, const Options& options) {
+// False when the script that led the window failed.
+bool run(QtApplicationFramework& framework, const Options& options) {
   SyslogSystemLog log;
   installTerminateHandler(log);
   StandardOutputTrace trace;
@@ -43,8 +45,9 @@ void run(QtApplicationFramework& framework, const Options& options) {
       .shell = {ui, preferences, dateFormatters, files},
       .paths = {.logDirectory = logDirectory(), .internalInstallMarker = KELVASI_INTERNAL_INSTALL_MARKER}};
   const ApplicationClasses classes{{"KelvasiApp", [&] { return std::make_unique<KelvasiApp>(platform); }}};
-  const ScreenshotTour tour(options.screenshots);
+  const Script script(options.script);
   framework.run(classes, "KelvasiApp", "KelvasiApp");
+  return !script.hasFailed();
 }
 
 }  // namespace
@@ -60,6 +63,10 @@ int main(int argumentCount, char** arguments) {
   }
   int own = 1;  // the options are all this program's; Qt's has its variables
   kelvasi::QtApplicationFramework framework(own, arguments);
-  kelvasi::run(framework, *commandLine.options);
-  return 0;
+  try {
+    return kelvasi::run(framework, *commandLine.options) ? 0 : 1;
+  } catch (const std::system_error& fault) {
+    std::fprintf(stderr, "kelvasi: %s\n", fault.what());
+    return 1;
+  }
 }

@@ -1,0 +1,82 @@
+// Light and dark, the window and the screen.
+#include "Tests/Platform/QtWidgets/QtFixture.h"
+
+namespace kelvasi {
+namespace {
+
+// Of relative luminances, as WCAG 2.1 defines it: 1 to 21.
+double contrast(const QColor& one, const QColor& other) {
+  const auto luminance = [](const QColor& colour) {
+    const auto linear = [](double part) {
+      return part <= 0.04045 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4);
+    };
+    return 0.2126 * linear(colour.redF()) + 0.7152 * linear(colour.greenF()) +
+           0.0722 * linear(colour.blueF());
+  };
+  const auto [darker, lighter] = std::minmax({luminance(one), luminance(other)});
+  return (lighter + 0.05) / (darker + 0.05);
+}
+
+TEST(Palettes, TextsCanBeReadOnEveryGround) {
+  for (const ColourScheme scheme : {ColourScheme::light, ColourScheme::dark}) {
+    const QPalette palette = paletteOf(scheme);
+    for (const auto ground : {QPalette::Base, QPalette::AlternateBase, QPalette::Window, QPalette::Light}) {
+      EXPECT_GE(contrast(palette.color(QPalette::Text), palette.color(ground)), 7) << ground;
+      EXPECT_GE(contrast(palette.color(QPalette::PlaceholderText), palette.color(ground)), 4.5) << ground;
+      EXPECT_GE(contrast(palette.color(QPalette::Highlight), palette.color(ground)), 4.5) << ground;
+    }
+  }
+}
+
+class AppearanceTest : public test::QtFixture {
+ protected:
+  QColor groundOfRows() const { return windowWidget().grab().toImage().pixelColor(200, 700); }
+};
+
+TEST_F(AppearanceTest, AStatedSchemeIsPainted) {
+  for (const ColourScheme scheme : {ColourScheme::light, ColourScheme::dark}) {
+    ui = std::make_unique<QtUserInterface>(
+        QtUserInterface::Options{.colourScheme = scheme, .animates = false});
+    showRows(1);
+    EXPECT_EQ(groundOfRows(), paletteOf(scheme).color(QPalette::Base));
+    window.reset();
+    stack.reset();
+  }
+}
+
+TEST_F(AppearanceTest, WithoutAPortalItFollowsTheApplicationsPalette) {
+  qunsetenv("DBUS_SESSION_BUS_ADDRESS");
+  qputenv("XDG_RUNTIME_DIR", "/nowhere");
+  QApplication::setPalette(paletteOf(ColourScheme::light));
+  ui = std::make_unique<QtUserInterface>(QtUserInterface::Options{.animates = false});
+  showRows(1);
+  EXPECT_EQ(groundOfRows(), paletteOf(ColourScheme::light).color(QPalette::Base));
+  QApplication::setPalette(paletteOf(ColourScheme::dark));
+  settle();
+  EXPECT_EQ(groundOfRows(), paletteOf(ColourScheme::dark).color(QPalette::Base));
+  QApplication::setPalette(paletteOf(ColourScheme::light));
+}
+
+TEST_F(AppearanceTest, OnADesktopTheWindowIsAPhonesAndTheSaveViewMayTakeAllOfIt) {
+  // The offscreen display is 800 by 800 points: the window is no higher than it.
+  EXPECT_EQ(ui->mainScreen().bounds(), (Rect{0, 0, 390, 800}));
+  EXPECT_EQ(ui->mainScreen().applicationFrame(), ui->mainScreen().bounds());
+}
+
+TEST_F(AppearanceTest, FullScreenTakesTheWholeScreen) {
+  ui = std::make_unique<QtUserInterface>(QtUserInterface::Options{.fullScreen = true, .animates = false});
+  EXPECT_EQ(ui->mainScreen().bounds(), (Rect{0, 0, 800, 800}));
+}
+
+TEST_F(AppearanceTest, AWindowThatGoesLeavesItsSubviewsUnseen) {
+  showRows(3);
+  QWidget& view = widgetOf(stack->view());
+  window->orderOut();
+  EXPECT_FALSE(view.isVisible());
+  window.reset();
+  EXPECT_EQ(view.parentWidget(), nullptr);
+  EXPECT_FALSE(view.isVisible());
+}
+
+}  // namespace
+}  // namespace kelvasi

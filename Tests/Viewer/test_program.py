@@ -1,0 +1,104 @@
+"""The program around the viewer: options, ending, preferences."""
+
+import os
+import signal
+import subprocess
+import unittest
+
+from live_support import PATIENCE
+from viewer_support import VIEWER, ViewerTest
+
+HOME_SCREEN = "[General]\nHomerailShowGSMRSSI=true\n"
+
+
+class Program(ViewerTest):
+    def run_viewer(self, *arguments, **options):
+        return subprocess.run([VIEWER, *arguments], env=self.environment, capture_output=True, text=True,
+                              timeout=PATIENCE, check=False, **options)
+
+    def test_without_a_display_it_says_so(self):
+        del self.environment["QT_QPA_PLATFORM"]
+        result = self.run_viewer()
+        self.assertEqual(
+            (result.returncode, result.stdout, result.stderr),
+            (1, "", "kelvasi: there is no display (neither WAYLAND_DISPLAY nor DISPLAY is set)\n"))
+
+    def test_wrong_usage_has_status_2(self):
+        for arguments in (["--wrong"], ["file"], ["--appearance", "blue"]):
+            with self.subTest(arguments):
+                result = self.run_viewer(*arguments)
+                self.assertEqual(result.returncode, 2)
+                self.assertRegex(result.stderr, r"\Akelvasi: .*\(try --help\)\n\Z")
+
+    def test_help_names_the_options(self):
+        result = self.run_viewer("--help")
+        self.assertEqual((result.returncode, result.stderr), (0, ""))
+        for option in ("--fullscreen", "--appearance", "--script"):
+            self.assertIn(option, result.stdout)
+
+    def test_signals_end_it_well(self):
+        for number in (signal.SIGINT, signal.SIGTERM):
+            with self.subTest(number):
+                viewer = self.start_viewer()
+                viewer.state()
+                self.assertEqual(viewer.interrupt(number), 0)
+                self.assertEqual(viewer.said(), "")
+
+    def test_the_end_of_a_script_ends_it_well(self):
+        viewer = self.start_viewer()
+        viewer.do("# nothing to be done", "")
+        self.assertEqual(viewer.close(), 0)
+
+    def test_a_script_with_a_fault_ends_it_with_status_1(self):
+        for line, why in (("dance", "there is no such command"), ("click Dance", "there is no button Dance"),
+                          ("press Dance", "there is no key Dance"),
+                          ("picture /nowhere/a.png", "cannot write /nowhere/a.png")):
+            with self.subTest(line):
+                result = self.run_viewer("--script", "-", input=f"state\n{line}\nstate\n")
+                self.assertEqual(result.stderr, f"kelvasi: line 2 of the script: {why}\n")
+                self.assertEqual((result.returncode, result.stdout.count("\n")), (1, 1))
+
+    def test_a_script_that_is_not_there_is_a_fault(self):
+        result = self.run_viewer("--script", "/nowhere/script")
+        self.assertEqual((result.returncode, result.stderr),
+                         (1, "kelvasi: /nowhere/script: No such file or directory\n"))
+
+    def test_a_picture_is_as_large_as_the_window_in_pixels(self):
+        self.environment["QT_SCALE_FACTOR"] = "2"
+        self.run_viewer("--script", "-", input=f"picture {self.path('window.png')}\n")
+        picture = self.read("window.png")
+        self.assertEqual(picture[:8], b"\x89PNG\r\n\x1a\n")
+        size = [int.from_bytes(picture[at:at + 4], "big") for at in (16, 20)]
+        self.assertEqual(size, [2 * 390, 2 * 844])
+
+
+class Preferences(ViewerTest):
+    def read_home_screen(self):
+        with open(self.preference_file("org.kelvasi.Homerail"), encoding="utf-8") as file:
+            return file.read()
+
+    def prefer(self, text):
+        os.makedirs(os.path.dirname(self.preference_file("")))
+        with open(self.preference_file("org.kelvasi.Kelvasi"), "w", encoding="utf-8") as file:
+            file.write(f"[General]\nHomerailShowGSMRSSI={text}\n")
+
+    def test_the_signal_strength_is_switched_on_and_stays_so_after_the_end(self):
+        viewer = self.start_viewer()
+        viewer.state()
+        self.assertEqual(self.read_home_screen(), HOME_SCREEN)
+        self.assertEqual(viewer.interrupt(), 0)
+        self.assertEqual(self.read_home_screen(), HOME_SCREEN)
+
+    def test_a_preference_that_is_not_true_counts_as_absent(self):
+        self.prefer("perhaps")
+        self.start_viewer().state()
+        self.assertEqual(self.read_home_screen(), HOME_SCREEN)
+
+    def test_a_preference_that_is_true_leaves_the_home_screen_alone(self):
+        self.prefer("true")
+        self.start_viewer().state()
+        self.assertFalse(os.path.exists(self.preference_file("org.kelvasi.Homerail")))
+
+
+if __name__ == "__main__":
+    unittest.main()
