@@ -4,6 +4,7 @@
 #include "LogGenerator/C2K/C2KRecords.h"
 #include "LogGenerator/C2K/C2KTexts.h"
 #include "LogGenerator/C2K/SubPackets.h"
+#include "LogGenerator/C2K/TrafficFER.h"
 
 namespace kelvasi {
 
@@ -39,9 +40,9 @@ void showRadio(const C2KUpdate& update, RecordView radio, bool isTraffic) {
 
 // The error rate of a call that has ended is shown once more.
 void showOldErrorRate(const C2KUpdate& update) {
-  const PlistValue rate = update.state.get("TrafficFER");
-  if (!rate.real()) return;
-  update.set("k1xTrafficFER", C2KText("%.02f%% (old)", *rate.real() * 100));
+  const auto rate = trafficFER::rateOf(update.state);
+  if (!rate) return;
+  update.set("k1xTrafficFER", C2KText("%.02f%% (old)", trafficFER::percent(*rate)));
   update.state.remove("TrafficFER");
 }
 

@@ -5,6 +5,13 @@
 
 namespace kelvasi {
 
+std::optional<double> trafficFER::rateOf(const PlistDictionary& state) {
+  const PlistValue rate = state.get("TrafficFER");
+  if (rate.real()) return *rate.real();
+  if (rate.integer()) return static_cast<double>(*rate.integer());
+  return std::nullopt;
+}
+
 void parseTrafficFER(const C2KUpdate& update) {
   using namespace trafficFER;
   if (update.record.size() < subPackets::minimumLength) {
@@ -19,10 +26,9 @@ void parseTrafficFER(const C2KUpdate& update) {
   }
   const std::size_t frameError = indexIn(demodulationLayout, "frame error");
   float rate = valueOf(*demodulation, demodulationLayout[frameError]) != 0 ? newFrameWeight : 0.0F;
-  const PlistValue before = update.state.get("TrafficFER");
-  if (before.real()) rate += static_cast<float>(*before.real()) * oldRateWeight;
+  if (const auto before = rateOf(update.state)) rate += static_cast<float>(*before) * oldRateWeight;
   update.state.set("TrafficFER", static_cast<double>(rate));
-  update.set("k1xTrafficFER", C2KText("%.02f%%", static_cast<double>(rate * 100)));
+  update.set("k1xTrafficFER", C2KText("%.02f%%", percent(rate)));
 }
 
 }  // namespace kelvasi

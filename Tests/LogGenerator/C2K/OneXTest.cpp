@@ -272,6 +272,43 @@ TEST(TrafficFER, IsAFirstOrderAverageOfWeightOneIn64) {
   EXPECT_EQ(*fixture.state.find("TrafficFER")->real(), 0.015380859375);
 }
 
+TEST(TrafficFER, IsComputedInSinglePrecision) {
+  C2KFixture fixture({"k1xTrafficFER"});
+  for (int count = 0; count < 5; ++count) fixture.take(frame(true));
+  // In double precision it would be 0.07572144363075495.
+  EXPECT_EQ(*fixture.state.find("TrafficFER")->real(), 0.07572144269943237);
+}
+
+// 9.8349995911 as a double of the stored rate; in single precision the product would be 9.835.
+TEST(TrafficFER, TheStoredRatePrintsTheSameDuringTheCallAndAfterIt) {
+  auto fixture = deviceFixture();
+  for (const char each : std::string_view("10100101101100")) fixture.take(frame(each == '1'));
+  EXPECT_EQ(*fixture.state.find("TrafficFER")->real(), 0.098349995911121368);
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "9.83%");
+  fixture.take(deviceStatus("06", noPilots));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "9.83% (old)");
+}
+
+TEST(TrafficFER, AnIntegerInTheStateCountsAsARate) {
+  auto fixture = deviceFixture();
+  fixture.state.set("TrafficFER", 1);
+  fixture.take(frame(false));
+  EXPECT_EQ(*fixture.state.find("TrafficFER")->real(), 0.984375);
+  fixture.state.set("TrafficFER", 1);
+  fixture.take(deviceStatus("06", noPilots));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "100.00% (old)");
+  EXPECT_EQ(fixture.state.find("TrafficFER"), nullptr);
+}
+
+TEST(TrafficFER, WhatIsNoNumberCountsAsNoRate) {
+  auto fixture = deviceFixture();
+  fixture.state.set("TrafficFER", "0.5");
+  fixture.take(deviceStatus("06", noPilots));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "");
+  fixture.take(frame(true));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "1.56%");
+}
+
 TEST(TrafficFER, IsShownOnceMoreAsOldWhenTheCallHasEnded) {
   auto fixture = deviceFixture();
   fixture.take(frame(true));

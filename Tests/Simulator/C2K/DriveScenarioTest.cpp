@@ -266,7 +266,7 @@ TEST_P(CdmaDrive, TheFrameErrorRateFollowsTheFramesAndRisesInAFade) {
       rate = (isError ? 0.015625F : 0.0F) + (rate ? *rate * 0.984375F : 0.0F);
     if (!rate) return;
     char expected[32];
-    std::snprintf(expected, sizeof expected, "%.02f%%", static_cast<double>(*rate * 100));
+    std::snprintf(expected, sizeof expected, "%.02f%%", static_cast<double>(*rate) * 100);
     ASSERT_EQ(text("k1xTrafficFER"), expected);
     const double ratio = combinedRatio(oneX.pilots(), world().oneXRatios());
     goodSteps = ratio > -11 ? goodSteps + 1 : 0;
