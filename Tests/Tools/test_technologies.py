@@ -134,7 +134,7 @@ class ObjectStream(Processes):
 
     def test_a_number_ends_the_viewer(self):
         message = plistlib.dumps({"A": ["x", {"B": 7}]}, fmt=plistlib.FMT_BINARY)
-        self.assert_ends_the_viewer(message, "Unknown object of type number encountered")
+        self.assert_ends_the_viewer(message, "Unknown object of type int encountered")
 
 
 if __name__ == "__main__":

@@ -162,7 +162,7 @@ TEST(GSMLogGeneratorDeathTest, BothFailedAssertionsEndTheProcessWithTheirTexts) 
               "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
   EXPECT_EXIT(
       endWith(one("A", PlistArray::make({"x", one("B", 7)}))), aborted,
-      "^<2>Terminating: uncaught kelvasi::AssertionFailure: Unknown object of type number encountered "
+      "^<2>Terminating: uncaught kelvasi::AssertionFailure: Unknown object of type int encountered "
       "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
 }
 
@@ -240,10 +240,10 @@ TEST(GSMLogGenerator, AMessageThatIsNoPropertyListIsAFailedAssertion) {
 }
 
 TEST(GSMLogGenerator, AValueThatIsNeitherTextNorContainerIsAFailedAssertion) {
-  EXPECT_THAT(failureOf(one("A", 1)), HasSubstr("Unknown object of type number encountered"));
-  EXPECT_THAT(failureOf(one("A", 0.5)), HasSubstr("Unknown object of type number encountered"));
-  EXPECT_THAT(failureOf(PlistArray::make({true})), HasSubstr("Unknown object of type boolean encountered"));
-  EXPECT_THAT(failureOf(Bytes{1}), HasSubstr("Unknown object of type data encountered"));
+  EXPECT_THAT(failureOf(one("A", 1)), HasSubstr("Unknown object of type int encountered"));
+  EXPECT_THAT(failureOf(one("A", 0.5)), HasSubstr("Unknown object of type double encountered"));
+  EXPECT_THAT(failureOf(PlistArray::make({true})), HasSubstr("Unknown object of type bool encountered"));
+  EXPECT_THAT(failureOf(Bytes{1}), HasSubstr("Unknown object of type bytes encountered"));
   EXPECT_THAT(failureOf(PlistDate{}), HasSubstr("Unknown object of type date encountered"));
 }
 
