@@ -13,6 +13,7 @@
 #include "Simulator/Subscription.h"
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/DecodingViewer.h"
+#include "Tests/Support/C2KLookupNames.h"
 
 namespace kelvasi::sim::c2k {
 namespace {
@@ -28,22 +29,7 @@ constexpr std::array<std::uint64_t, 4> seeds{1, 3, 11, 12345};
 // A leaf for each lookup name, called after it.
 PlistValue displayTemplate() {
   const auto leaves = PlistDictionary::make();
-  for (const char* name : {"kChannel",         "k1xEVDODeviceState",
-                           "kBandClass",       "kRxAGC0",
-                           "kRxAGC1",          "kTxAGC",
-                           "kServingPNOffset", "kSessionState",
-                           "kUATI24",          "kColorCode",
-                           "kActiveSetPilots", "kFingerC2I",
-                           "k1xDeviceState",   "k1xRx0BandClass",
-                           "k1xRx0ChanNum",    "k1xRxAGC0",
-                           "k1xRx1BandClass",  "k1xRx1ChanNum",
-                           "k1xRxAGC1",        "k1xTxAGC",
-                           "k1xActiveSetInfo", "k1xTrafficFER",
-                           "k1xRoamingHome",   "kSystemId",
-                           "kNetworkId",       "kPacketZoneId",
-                           "kBaseId",          "kProtocolRevision",
-                           "kFLDataRate",      "kRLDataRate"})
-    leaves->set(name, name);
+  for (const std::string_view name : kelvasi::test::c2kLookupNames) leaves->set(name, name);
   return leaves;
 }
 
