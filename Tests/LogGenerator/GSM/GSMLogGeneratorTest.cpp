@@ -160,10 +160,9 @@ TEST(GSMLogGeneratorDeathTest, BothFailedAssertionsEndTheProcessWithTheirTexts) 
   EXPECT_EXIT(endWith({}), aborted,
               "^<2>Terminating: uncaught kelvasi::AssertionFailure: Could not deserialize the object "
               "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
-  EXPECT_EXIT(
-      endWith(one("A", PlistArray::make({"x", one("B", 7)}))), aborted,
-      "^<2>Terminating: uncaught kelvasi::AssertionFailure: Unknown object of type int encountered "
-      "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
+  EXPECT_EXIT(endWith(one("A", PlistArray::make({"x", one("B", 7)}))), aborted,
+              "^<2>Terminating: uncaught kelvasi::AssertionFailure: Unknown object of type int encountered "
+              "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
 }
 
 // Messages as they come, cut and changed at every byte: each is shown or fails as an assertion does.
