@@ -2,6 +2,7 @@
 // and what it asks of the radio.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <span>
 #include <string_view>
@@ -15,8 +16,8 @@ enum class Need { none, connecting, signalling, speech, data };
 
 // The number of a text in a decoder's table; does not compile when there is no such text.
 consteval std::uint8_t numberOf(std::span<const std::string_view> texts, std::string_view text) {
-  for (std::uint8_t number = 0; number < texts.size(); ++number) {
-    if (texts[number] == text) return number;
+  for (std::size_t number = 0; number < texts.size(); ++number) {
+    if (texts[number] == text) return static_cast<std::uint8_t>(number);
   }
   throw "no such text in this table";
 }
