@@ -4,6 +4,7 @@
 #include <cmath>
 
 #include "LogGenerator/C2K/DeviceStatus.h"
+#include "LogGenerator/C2K/FormattedText.h"
 #include "LogGenerator/C2K/PilotList.h"
 
 namespace kelvasi {
@@ -14,16 +15,12 @@ using namespace deviceStatus;
 
 constexpr double leastRatio = 0.00001;  // -50 dB
 
-std::int64_t field(RecordView subPacket, std::size_t place) {
-  return valueOf(subPacket, activeSetLayout[place]);
-}
-
 // Linear Ec/Io of a pilot's energy: energy * power / divisor - noise.
 struct EnergyScale {
   explicit EnergyScale(RecordView subPacket) {
-    const auto window = static_cast<double>(field(subPacket, indexIn(activeSetLayout, "window")));
-    const auto gain = static_cast<double>(field(subPacket, indexIn(activeSetLayout, "gain")));
-    const auto exponent = static_cast<int>(field(subPacket, indexIn(activeSetLayout, "energy exponent")));
+    const auto window = static_cast<double>(valueOf(subPacket, fieldIn(activeSetLayout, "window")));
+    const auto gain = static_cast<double>(valueOf(subPacket, fieldIn(activeSetLayout, "gain")));
+    const auto exponent = static_cast<int>(valueOf(subPacket, fieldIn(activeSetLayout, "energy exponent")));
     power = std::ldexp(1.0, 2 * exponent - 3);
     divisor = gain * 9 * window * window;
     noise = 1 / window;
@@ -41,16 +38,16 @@ struct EnergyScale {
 
 PlistValue activeSet1x(RecordView subPacket) {
   const EnergyScale scale(subPacket);
-  const std::int64_t count = field(subPacket, indexIn(activeSetLayout, "count"));
-  const std::int64_t fingers = field(subPacket, indexIn(activeSetLayout, "fingers"));
-  const std::int64_t reference = field(subPacket, indexIn(activeSetLayout, "reference PN offset"));
+  const std::int64_t count = valueOf(subPacket, fieldIn(activeSetLayout, "count"));
+  const std::int64_t fingers = valueOf(subPacket, fieldIn(activeSetLayout, "fingers"));
+  const std::int64_t reference = valueOf(subPacket, fieldIn(activeSetLayout, "reference PN offset"));
   PilotList pilots;
   for (std::size_t place = 0; place < static_cast<std::size_t>(count); ++place) {
     const RecordView pilot = subPacket.from(pilotStride(fingers) * place);
-    const std::int64_t offset = valueOf(pilot, pilotLayout[indexIn(pilotLayout, "PN offset")]);
+    const std::int64_t offset = valueOf(pilot, fieldIn(pilotLayout, "PN offset"));
     pilots.add(place, offset,
-               C2KText("%s%+.2f dB", offset == reference ? "(ref pilot) " : "",
-                       scale.decibels(pilot.u16(pilotEnergyAt(fingers)))));
+               FormattedText("%s%+.2f dB", offset == reference ? "(ref pilot) " : "",
+                             scale.decibels(pilot.u16(pilotEnergyAt(fingers)))));
   }
   return pilots.list();
 }

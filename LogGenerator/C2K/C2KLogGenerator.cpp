@@ -53,10 +53,10 @@ std::unique_ptr<LogGenerator> C2KLogGenerator::generator(const Platform& platfor
 }
 
 void C2KLogGenerator::updateState(PlistDictionary& state, std::span<const std::uint8_t> data) {
-  static const PlistDictionary nothing;
   getDisplayFromState(state, platform());
   const PlistValue lookup = state.get("Lookup");
-  updateFromLog(data, lookup.dictionary() ? *lookup.dictionary() : nothing, state);
+  if (lookup.dictionary()) return updateFromLog(data, *lookup.dictionary(), state);
+  updateFromLog(data, PlistDictionary(), state);
 }
 
 void C2KLogGenerator::updateFromLog(std::span<const std::uint8_t> data, const PlistDictionary& lookup,

@@ -2,8 +2,9 @@
 
 #include "LogGenerator/C2K/ActiveSet1x.h"
 #include "LogGenerator/C2K/C2KRecords.h"
-#include "LogGenerator/C2K/C2KTexts.h"
 #include "LogGenerator/C2K/SubPackets.h"
+#include "LogGenerator/C2K/TrafficFER.h"
+#include "LogGenerator/C2K/ValueTexts.h"
 
 namespace kelvasi {
 
@@ -11,12 +12,12 @@ namespace {
 
 using namespace deviceStatus;
 
-C2KText receivePowerText(std::int64_t value) {
-  return C2KText("%+.2f dBm", static_cast<double>(value) * 334 / 1000 - 63.248);
+FormattedText receivePowerText(std::int64_t value) {
+  return FormattedText("%+.2f dBm", static_cast<double>(value) * 334 / 1000 - 63.248);
 }
 
-C2KText transmitPowerText(std::int64_t value) {
-  return C2KText("%+.2f dBm", static_cast<double>(value) / 10);
+FormattedText transmitPowerText(std::int64_t value) {
+  return FormattedText("%+.2f dBm", static_cast<double>(value) / 10);
 }
 
 constexpr std::array receiverRows{
@@ -34,25 +35,23 @@ constexpr std::array trafficRows{
 void showRadio(const C2KUpdate& update, RecordView radio, bool isTraffic) {
   show(update, radio, radioLayout, receiverRows);
   if (isTraffic) return show(update, radio, radioLayout, trafficRows);
-  for (const C2KRow& row : trafficRows) update.set(row.name, C2KText("N/A"));
+  showNotAvailable(update, trafficRows);
 }
 
 // The error rate of a call that has ended is shown once more.
 void showOldErrorRate(const C2KUpdate& update) {
-  const PlistValue rate = update.state.get("TrafficFER");
-  if (!rate.real()) return;
-  update.set("k1xTrafficFER", C2KText("%.02f%% (old)", *rate.real() * 100));
+  const auto rate = trafficFER::rateOf(update.state);
+  if (!rate) return;
+  update.set("k1xTrafficFER", FormattedText("%.02f%% (old)", trafficFER::percent(*rate)));
   update.state.remove("TrafficFER");
 }
 
 }  // namespace
 
 void parseDeviceStatus(const C2KUpdate& update) {
-  if (update.record.size() < subPackets::minimumLength) {
-    update.log.print(LogPriority::error, "Log code 0x119c is %u bytes long but must be at least %lu bytes.",
-                     update.length(), static_cast<unsigned long>(subPackets::minimumLength));
+  if (!isLongEnough(update, subPackets::minimumLength,
+                    "Log code 0x119c is %u bytes long but must be at least %lu bytes."))
     return;
-  }
   const auto state = subPackets::find(update.record, stateId, update.log);
   const auto radio = subPackets::find(update.record, radioId, update.log);
   const auto activeSet = subPackets::find(update.record, activeSetId, update.log);
@@ -62,7 +61,7 @@ void parseDeviceStatus(const C2KUpdate& update) {
                      state.has_value(), radio.has_value(), activeSet.has_value(), fingers.has_value());
     return;
   }
-  const std::int64_t deviceState = valueOf(*state, stateLayout[indexIn(stateLayout, "state")]);
+  const std::int64_t deviceState = valueOf(*state, fieldIn(stateLayout, "state"));
   update.set("k1xDeviceState", deviceStateText(deviceState));
   showRadio(update, *radio, deviceState == trafficState);
   update.set("k1xActiveSetInfo", activeSet1x(*activeSet));

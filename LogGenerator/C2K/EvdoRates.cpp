@@ -54,12 +54,12 @@ void showRate(const C2KUpdate& update, const Link& link, std::uint32_t sequence,
         static_cast<std::int32_t>(sequence - static_cast<std::uint32_t>(*sequenceBefore.integer()));
     if (steps >= 1) {
       const auto bits = static_cast<double>(sent - *sentBefore.integer());
-      update.set(link.rateName, C2KText("%.2f kbps", bits / (steps * 1024.0)));
+      update.set(link.rateName, FormattedText("%.2f kbps", bits / (steps * 1024.0)));
     }
     update.setExtraInfo(link.sequenceKey + "2", sequenceBefore);
     update.setExtraInfo(link.sentKey + "2", sentBefore);
   } else {
-    update.set(link.rateName, C2KText("%s", ""));
+    update.set(link.rateName, "");
   }
   update.state.set(link.sequenceKey, sequence);
   update.state.set(link.sentKey, sent);
@@ -67,28 +67,25 @@ void showRate(const C2KUpdate& update, const Link& link, std::uint32_t sequence,
   update.setExtraInfo(link.sentKey + "1", sent);
 }
 
-bool isLongEnough(const C2KUpdate& update, unsigned logCode, std::size_t minimumLength) {
-  if (update.record.size() >= minimumLength) return true;
-  update.log.print(LogPriority::error, "Log code 0x%x is %d bytes long but must be at least %ld bytes.",
-                   logCode, static_cast<int>(update.length()), static_cast<long>(minimumLength));
-  return false;
-}
-
 }  // namespace
 
 void parseEvdoForwardRate(const C2KUpdate& update) {
   using namespace evdoForwardRate;
-  if (!isLongEnough(update, logCode, minimumLength)) return;
+  if (!isLongEnough(update, minimumLength,
+                    "Log code 0x1192 is %d bytes long but must be at least %ld bytes."))
+    return;
   const auto sequence =
-      static_cast<std::uint32_t>(valueOf(update.record, layout[indexIn(layout, "sequence number")]));
+      static_cast<std::uint32_t>(valueOf(update.record, fieldIn(layout, "sequence number")));
   showRate(update, {"kFLDataRate", "FLDataSeqNum", "FLDataSent"}, sequence, forwardSent(update.record));
 }
 
 void parseEvdoReverseRate(const C2KUpdate& update) {
   using namespace evdoReverseRate;
-  if (!isLongEnough(update, logCode, minimumLength)) return;
+  if (!isLongEnough(update, minimumLength,
+                    "Log code 0x127e is %d bytes long but must be at least %ld bytes."))
+    return;
   const auto sequence =
-      static_cast<std::uint32_t>(valueOf(update.record, layout[indexIn(layout, "sequence number")]));
+      static_cast<std::uint32_t>(valueOf(update.record, fieldIn(layout, "sequence number")));
   showRate(update, {"kRLDataRate", "RLDataSeqNum", "RLDataSent"}, sequence, reverseSent(update.record));
 }
 

@@ -1,7 +1,8 @@
 #include "LogGenerator/C2K/EvdoStatus.h"
 
 #include "LogGenerator/C2K/C2KRecords.h"
-#include "LogGenerator/C2K/C2KTexts.h"
+#include "LogGenerator/C2K/NoPilot.h"
+#include "LogGenerator/C2K/ValueTexts.h"
 
 namespace kelvasi {
 
@@ -9,17 +10,17 @@ namespace {
 
 using evdoStatus::layout;
 
-C2KText powerText(std::int64_t value) {
-  return C2KText("%+d dBm", static_cast<int>(value));
+FormattedText powerText(std::int64_t value) {
+  return FormattedText("%+d dBm", static_cast<int>(value));
 }
 
-C2KText pilotText(std::int64_t value) {
-  if (value == evdoStatus::invalidPilot) return C2KText("Invalid Value");
-  return C2KText("%d × 64chips", static_cast<int>(value));
+FormattedText pilotText(std::int64_t value) {
+  if (value == noPilot) return FormattedText("Invalid Value");
+  return FormattedText("%d × 64chips", static_cast<int>(value));
 }
 
-C2KText addressText(std::int64_t value) {
-  return C2KText("0x%06x", static_cast<unsigned>(value));
+FormattedText addressText(std::int64_t value) {
+  return FormattedText("0x%06x", static_cast<unsigned>(value));
 }
 
 constexpr std::array radioRows{
@@ -48,8 +49,8 @@ void parseEvdoStatus(const C2KUpdate& update) {
     return;
   }
   show(update, update.record, layout, radioRows);
-  if (valueOf(update.record, layout[indexIn(layout, "device state")]) < evdoStatus::accessState) {
-    for (const C2KRow& row : connectedRows) update.set(row.name, C2KText("N/A"));
+  if (valueOf(update.record, fieldIn(layout, "device state")) < evdoStatus::accessState) {
+    showNotAvailable(update, connectedRows);
   } else {
     show(update, update.record, layout, connectedRows);
   }

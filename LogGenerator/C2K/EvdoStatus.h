@@ -26,6 +26,5 @@ inline constexpr std::array layout{
 static_assert(inWireOrder(layout));
 
 inline constexpr std::int64_t accessState = 4;  // below it, the second receiver and the transmitter are off
-inline constexpr std::int64_t invalidPilot = 65535;
 
 }  // namespace kelvasi::evdoStatus

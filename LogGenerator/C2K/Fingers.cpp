@@ -1,19 +1,18 @@
 #include "LogGenerator/C2K/Fingers.h"
 
 #include "LogGenerator/C2K/C2KRecords.h"
-#include "LogGenerator/C2K/C2KTexts.h"
+#include "LogGenerator/C2K/NoPilot.h"
 #include "LogGenerator/C2K/PilotList.h"
+#include "LogGenerator/C2K/ValueTexts.h"
 
 namespace kelvasi {
 
 void parseFingers(const C2KUpdate& update) {
   using namespace fingers;
-  if (update.record.size() < minimumLength) {
-    update.log.print(LogPriority::error, "Log code 0x108a is %u bytes long but must be at least %lu bytes.",
-                     update.length(), static_cast<unsigned long>(minimumLength));
+  if (!isLongEnough(update, minimumLength,
+                    "Log code 0x108a is %u bytes long but must be at least %lu bytes."))
     return;
-  }
-  const auto count = static_cast<std::size_t>(valueOf(update.record, layout[indexIn(layout, "count")]));
+  const auto count = static_cast<std::size_t>(valueOf(update.record, fieldIn(layout, "count")));
   if (update.record.size() != firstFinger + fingerSize * count) {
     update.log.print(LogPriority::error,
                      "Log code 0x108a has bad length of %u bytes, but has %d substructs (size=%lu).",
@@ -23,9 +22,9 @@ void parseFingers(const C2KUpdate& update) {
   PilotList pilots;
   for (std::size_t place = 0; place < count; ++place) {
     const RecordView finger = update.record.from(firstFinger + fingerSize * place);
-    const std::int64_t pilot = valueOf(finger, fingerLayout[indexIn(fingerLayout, "PN offset")]);
-    if (pilot == unassigned) continue;
-    pilots.add(place, pilot, strengthText(valueOf(finger, fingerLayout[indexIn(fingerLayout, "C/I")])));
+    const std::int64_t pilot = valueOf(finger, fieldIn(fingerLayout, "PN offset"));
+    if (pilot == noPilot) continue;
+    pilots.add(place, pilot, strengthText(valueOf(finger, fieldIn(fingerLayout, "C/I"))));
   }
   update.set("kFingerC2I", pilots.listOrNone());
 }

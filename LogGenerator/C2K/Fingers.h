@@ -21,6 +21,4 @@ inline constexpr std::array fingerLayout{
 };
 static_assert(inWireOrder(fingerLayout));
 
-inline constexpr std::int64_t unassigned = 65535;
-
 }  // namespace kelvasi::fingers

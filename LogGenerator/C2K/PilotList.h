@@ -5,7 +5,7 @@
 #include <cstdint>
 #include <string_view>
 
-#include "LogGenerator/C2K/C2KText.h"
+#include "LogGenerator/C2K/FormattedText.h"
 #include "Plist/PlistValue.h"
 
 namespace kelvasi {
@@ -13,7 +13,7 @@ namespace kelvasi {
 class PilotList {
  public:
   void add(std::size_t place, std::int64_t pilot, std::string_view text) {
-    pilots_->set(C2KText("%d;%d", static_cast<int>(place), static_cast<int>(pilot)), text);
+    pilots_->set(FormattedText("%d;%d", static_cast<int>(place), static_cast<int>(pilot)), text);
   }
   // The list itself, even when it is empty.
   PlistValue list() const { return pilots_; }

@@ -1,7 +1,7 @@
 #include "LogGenerator/C2K/SystemParameters.h"
 
 #include "LogGenerator/C2K/C2KRecords.h"
-#include "LogGenerator/C2K/C2KTexts.h"
+#include "LogGenerator/C2K/ValueTexts.h"
 
 namespace kelvasi {
 
@@ -23,21 +23,19 @@ constexpr std::array cellRows{
 };
 
 void showIdentities(const C2KUpdate& update) {
-  const std::int64_t systemType = valueOf(update.record, layout[indexIn(layout, "system type")]);
+  const std::int64_t systemType = valueOf(update.record, fieldIn(layout, "system type"));
   if (systemType == cdmaSystem) return show(update, update.record, layout, identityRows);
-  const C2KText unknown("(unknown system type %d)", static_cast<int>(systemType));
+  const FormattedText unknown("(unknown system type %d)", static_cast<int>(systemType));
   for (const C2KRow& row : identityRows) update.set(row.name, unknown);
 }
 
 }  // namespace
 
 void parseSystemParameters(const C2KUpdate& update) {
-  if (update.record.size() < minimumLength) {
-    update.log.print(LogPriority::error, "Log code 0x134f is %d bytes long but must be at least %lu bytes.",
-                     static_cast<int>(update.length()), static_cast<unsigned long>(minimumLength));
+  if (!isLongEnough(update, minimumLength,
+                    "Log code 0x134f is %d bytes long but must be at least %lu bytes."))
     return;
-  }
-  const std::int64_t version = valueOf(update.record, layout[indexIn(layout, "version")]);
+  const std::int64_t version = valueOf(update.record, fieldIn(layout, "version"));
   if (version < minimumVersion) {
     update.log.print(LogPriority::error,
                      "Log code 0x134f has version=%d; only version 2 or higher expected; dropping.",

@@ -5,24 +5,28 @@
 
 namespace kelvasi {
 
+std::optional<double> trafficFER::rateOf(const PlistDictionary& state) {
+  const PlistValue rate = state.get("TrafficFER");
+  if (rate.real()) return *rate.real();
+  if (rate.integer()) return static_cast<double>(*rate.integer());
+  return std::nullopt;
+}
+
 void parseTrafficFER(const C2KUpdate& update) {
   using namespace trafficFER;
-  if (update.record.size() < subPackets::minimumLength) {
-    update.log.print(LogPriority::error, "Log code 0x119d is %d bytes long but must be at least %ld bytes.",
-                     static_cast<int>(update.length()), static_cast<long>(subPackets::minimumLength));
+  if (!isLongEnough(update, subPackets::minimumLength,
+                    "Log code 0x119d is %d bytes long but must be at least %ld bytes."))
     return;
-  }
   const auto demodulation = subPackets::find(update.record, demodulationId, update.log);
   if (!demodulation) {
     update.log.print(LogPriority::warning, "Log code 0x119d: missing traffic demod subpacket.");
     return;
   }
-  const std::size_t frameError = indexIn(demodulationLayout, "frame error");
-  float rate = valueOf(*demodulation, demodulationLayout[frameError]) != 0 ? newFrameWeight : 0.0F;
-  const PlistValue before = update.state.get("TrafficFER");
-  if (before.real()) rate += static_cast<float>(*before.real()) * oldRateWeight;
+  float rate =
+      valueOf(*demodulation, fieldIn(demodulationLayout, "frame error")) != 0 ? newFrameWeight : 0.0F;
+  if (const auto before = rateOf(update.state)) rate += static_cast<float>(*before) * oldRateWeight;
   update.state.set("TrafficFER", static_cast<double>(rate));
-  update.set("k1xTrafficFER", C2KText("%.02f%%", static_cast<double>(rate * 100)));
+  update.set("k1xTrafficFER", FormattedText("%.02f%%", percent(rate)));
 }
 
 }  // namespace kelvasi

@@ -2,9 +2,11 @@
 #pragma once
 
 #include <array>
+#include <optional>
 
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
+#include "Plist/PlistValue.h"
 
 namespace kelvasi::trafficFER {
 
@@ -15,5 +17,12 @@ inline constexpr std::array demodulationLayout{Field{.name = "frame error", .byt
 
 inline constexpr float newFrameWeight = 0.015625F;  // 1/64
 inline constexpr float oldRateWeight = 0.984375F;
+
+// The smoothed rate that the state keeps, 1 when every frame is in error; nothing before the first frame of
+// a call. Shown in percent.
+std::optional<double> rateOf(const PlistDictionary& state);
+constexpr double percent(double rate) {
+  return rate * 100;
+}
 
 }  // namespace kelvasi::trafficFER

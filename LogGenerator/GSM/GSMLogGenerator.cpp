@@ -13,9 +13,10 @@ constexpr const char* source = "LogGenerator/GSM/GSMLogGenerator";
 
 // What an object that does not belong into a display is called in the failure's text.
 const char* className(const PlistValue& object) {
-  if (object.integer() || object.real()) return "number";
-  if (object.boolean()) return "boolean";
-  if (object.data()) return "data";
+  if (object.integer()) return "int";
+  if (object.real()) return "double";
+  if (object.boolean()) return "bool";
+  if (object.data()) return "bytes";
   return object.date() ? "date" : "null";
 }
 

@@ -59,8 +59,7 @@ ReselectionCandidatesList::ReselectionCandidatesList(const Platform& platform)
 
 void ReselectionCandidatesList::addEntry(RecordView record, std::size_t place) {
   const RecordView candidate = entry(record, place);
-  const auto type =
-      static_cast<std::size_t>(valueOf(candidate, candidateLayout[indexIn(candidateLayout, "RAT type")]));
+  const auto type = static_cast<std::size_t>(valueOf(candidate, fieldIn(candidateLayout, "RAT type")));
   const RatType& rat = type < ratTypes.size() ? ratTypes[type] : otherRat;
   RowWriter row = addRows();
   show(candidate, candidateLayout, candidateRows, row);

@@ -1,6 +1,6 @@
 #include "Platform/Plist/LibplistSerialiser.h"
 
-#include <locale.h>
+#include <locale.h>  // NOLINT(modernize-deprecated-headers): for newlocale, which is POSIX and not C
 
 #include <memory>
 #include <string_view>

@@ -11,16 +11,15 @@ namespace {
 struct ForwardFormat {
   double needed;  // dB of carrier to interference, about
   int slots;
-  std::int64_t bits;
   std::size_t counter;
+  constexpr std::int64_t bits() const { return evdoForwardRate::weights.at(counter); }
 };
 constexpr std::array forwardFormats{
-    ForwardFormat{-12.5, 16, 1024, 8}, ForwardFormat{-9.5, 8, 1024, 13}, ForwardFormat{-6.5, 4, 1024, 18},
-    ForwardFormat{-4, 2, 1024, 23},    ForwardFormat{-1, 1, 1024, 32},   ForwardFormat{1.3, 2, 3072, 39},
-    ForwardFormat{3, 1, 2048, 43},     ForwardFormat{7.2, 1, 3072, 48},  ForwardFormat{9.5, 1, 4096, 50},
+    ForwardFormat{-12.5, 16, 8}, ForwardFormat{-9.5, 8, 13}, ForwardFormat{-6.5, 4, 18},
+    ForwardFormat{-4, 2, 23},    ForwardFormat{-1, 1, 32},   ForwardFormat{1.3, 2, 39},
+    ForwardFormat{3, 1, 43},     ForwardFormat{7.2, 1, 48},  ForwardFormat{9.5, 1, 50},
 };
-constexpr std::array<std::int64_t, 12> payloads{128,  256,  512,  768,  1024, 1536,
-                                                2048, 3072, 4096, 6144, 8192, 12288};
+constexpr const auto& payloads = evdoReverseRate::weights;
 
 constexpr double slotsPerSecond = 600;
 constexpr double subFramesPerSecond = 50;  // of each interlace
@@ -40,7 +39,7 @@ DataLink::DataLink(Random random) : random_(random) {
   for (const ForwardFormat& format : forwardFormats) {
     const std::uint32_t packets = before(random_);
     forwardNow_.counters[format.counter] = packets;
-    forwardNow_.bits += packets * format.bits;
+    forwardNow_.bits += packets * format.bits();
   }
   for (std::size_t rate = 0; rate < payloads.size(); ++rate) {
     const std::size_t interlace = random_.below(evdoReverseRate::subFrames);
@@ -72,7 +71,7 @@ void DataLink::receive(double carrierToInterference, double seconds) {
   const double slots = slotsPerSecond * seconds * random_.between(leastShare, mostShare);
   const auto packets = static_cast<std::uint32_t>(std::ceil(slots / best->slots));
   forwardNow_.counters[best->counter] += packets;
-  forwardNow_.bits += packets * best->bits;
+  forwardNow_.bits += packets * best->bits();
 }
 
 void DataLink::transmit(double headroom, double seconds) {

@@ -5,6 +5,7 @@
 #include "LogGenerator/C2K/EvdoActiveSet.h"
 #include "LogGenerator/C2K/EvdoRates.h"
 #include "LogGenerator/C2K/EvdoStatus.h"
+#include "LogGenerator/C2K/NoPilot.h"
 #include "LogGenerator/RecordWriter.h"
 #include "Simulator/C2K/Strength.h"
 
@@ -29,7 +30,7 @@ std::optional<Bytes> evdoStatusRecord(const World& world) {
       .set("Rx AGC 0", std::lround(world.receivedPower(0)))
       .set("Rx AGC 1", std::lround(world.receivedPower(1)))
       .set("Tx AGC", std::lround(world.evdoTransmitPower()))
-      .set("serving PN offset", evdo.serving() ? world.cell(*evdo.serving()).code : invalidPilot)
+      .set("serving PN offset", evdo.serving() ? world.cell(*evdo.serving()).code : noPilot)
       .set("device state", static_cast<std::int64_t>(evdo.state()))
       .set("session state", static_cast<std::int64_t>(evdo.session()))
       .set("UATI24", evdo.uati24())

@@ -67,7 +67,7 @@ void OneX::pass(std::span<const double> ratios, bool wantsCall, double seconds) 
     case Stage::idle:
       return passIdle(ratios, wantsCall, seconds);
     case Stage::accessing:
-      return passAccess();
+      return passAccess(wantsCall);
     case Stage::inCall:
       return passCall(ratios, wantsCall, seconds);
     default:
@@ -106,10 +106,10 @@ void OneX::passIdle(std::span<const double> ratios, bool wantsCall, double secon
   enter(Stage::accessing);
 }
 
-void OneX::passAccess() {
+void OneX::passAccess(bool wantsCall) {
   if (inStage_ < accessTime) return;
   registeredAt_ = pilots_.active().front();
-  enter(isForCall_ ? Stage::inCall : Stage::idle);
+  enter(isForCall_ && wantsCall ? Stage::inCall : Stage::idle);
 }
 
 void OneX::passCall(std::span<const double> ratios, bool wantsCall, double seconds) {

@@ -35,7 +35,8 @@ class OneX {
   State state() const;
   bool hasSystem() const { return stage_ >= Stage::idle; }
   bool isInCall() const { return stage_ == Stage::inCall; }
-  bool isSettingUpCall() const { return stage_ == Stage::accessing && isForCall_; }
+  // From EV-DO, to register as well as for a call.
+  bool takesRadio() const { return stage_ == Stage::accessing || isInCall(); }
   // Whether the last pass has lost the call.
   bool hasDroppedCall() const { return hasDroppedCall_; }
   const PilotSets& pilots() const { return pilots_; }
@@ -46,7 +47,7 @@ class OneX {
   void enter(Stage stage);
   void search(std::span<const double> ratios);
   void passIdle(std::span<const double> ratios, bool wantsCall, double seconds);
-  void passAccess();
+  void passAccess(bool wantsCall);
   void passCall(std::span<const double> ratios, bool wantsCall, double seconds);
   bool mustRegister() const;
 

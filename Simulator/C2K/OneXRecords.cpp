@@ -5,6 +5,7 @@
 
 #include "LogGenerator/C2K/DeviceStatus.h"
 #include "LogGenerator/C2K/Fingers.h"
+#include "LogGenerator/C2K/NoPilot.h"
 #include "LogGenerator/C2K/SubPackets.h"
 #include "LogGenerator/C2K/SystemParameters.h"
 #include "LogGenerator/C2K/TrafficFER.h"
@@ -22,7 +23,6 @@ constexpr std::int64_t exponent = 6;
 constexpr double energyPerRatio =
     static_cast<double>(gain * 9 * window * window) / static_cast<double>(1 << (2 * exponent - 3));
 
-constexpr std::int64_t noPilot = 65535;
 constexpr std::int64_t protocolRevision = 6;  // P_REV of IS-2000
 constexpr std::int64_t systemVersion = 2;
 // Numbers of the roaming indicator's table.
@@ -86,7 +86,7 @@ Bytes activeSetSubPacket(const World& world) {
     const std::size_t pilot = pilotStride(fingers) * place;
     const std::size_t energy = pilot + pilotEnergyAt(fingers);
     bytes.resize(energy + 4);
-    put16(bytes, pilot + pilotLayout[indexIn(pilotLayout, "PN offset")].byte, world.cell(active[place]).code);
+    put16(bytes, pilot + fieldIn(pilotLayout, "PN offset").byte, world.cell(active[place]).code);
     put16(bytes, energy, pilotEnergy(world.oneXRatios()[active[place]]));
   }
   return subPacket(activeSetId, std::move(bytes));
@@ -128,7 +128,7 @@ std::optional<Bytes> fingersRecord(const World& world) {
   record.set("count", static_cast<std::int64_t>(world.fingers().size()));
   for (const Finger& finger : world.fingers()) {
     RecordWriter entry(fingerLayout, fingerSize);
-    entry.set("PN offset", finger.cell ? world.cell(*finger.cell).code : unassigned)
+    entry.set("PN offset", finger.cell ? world.cell(*finger.cell).code : noPilot)
         .set("C/I", finger.cell ? strengthOf(finger.ratio) : 0);
     record.append(entry.bytes());
   }

@@ -65,7 +65,7 @@ void World::pass(double seconds) {
   if (oneX_.hasDroppedCall()) user_.giveUp();
   evdo_.pass({.ratios = evdoRatios_,
               .colorCodes = colorCodes_,
-              .isRadioTaken = oneX_.isInCall() || oneX_.isSettingUpCall(),
+              .isRadioTaken = oneX_.takesRadio(),
               .wantsData = user_.wish() == User::Wish::data},
              seconds);
   const bool isTransferring = evdo_.isTransferring();

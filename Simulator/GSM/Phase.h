@@ -2,6 +2,7 @@
 // and what it asks of the radio.
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <span>
 #include <string_view>

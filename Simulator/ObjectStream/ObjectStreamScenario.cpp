@@ -1,5 +1,6 @@
 #include "Simulator/ObjectStream/ObjectStreamScenario.h"
 
+#include <stdexcept>
 #include <utility>
 
 #include "Simulator/ObjectStream/HandsetObject.h"
@@ -21,7 +22,8 @@ void ObjectStreamScenario::greet(Messages& messages) {
   const PlistValue object = handsetObject(world_);
   const bool isBinary = std::exchange(isBinaryNext_, !isBinaryNext_);
   auto bytes = isBinary ? plists_.serialiseBinary(object) : plists_.serialiseXml(object);
-  if (bytes) messages.push_back({.bytes = std::move(*bytes), .logCode = std::nullopt});
+  if (!bytes) throw std::logic_error("The handset's object cannot be serialised");
+  messages.push_back({.bytes = std::move(*bytes), .logCode = std::nullopt});
 }
 
 }  // namespace kelvasi::sim::objectStream

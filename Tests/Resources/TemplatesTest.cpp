@@ -10,6 +10,7 @@
 #include "LogGenerator/UTRAN/UTRANClassIndex.h"
 #include "Model/KelvasiModelNode.h"
 #include "Platform/Plist/LibplistSerialiser.h"
+#include "Tests/Support/C2KLookupNames.h"
 #include "Tests/Support/TestPlatform.h"
 
 namespace kelvasi {
@@ -102,14 +103,8 @@ std::vector<std::string> lookupNames(const PlistValue& object) {
 }
 
 TEST(C2KTemplate, UsesEveryLookupNameOnce) {
-  EXPECT_THAT(
-      lookupNames(displayTemplate("C2KTemplate")),
-      testing::UnorderedElementsAre(
-          "kChannel", "k1xEVDODeviceState", "kBandClass", "kRxAGC0", "kRxAGC1", "kTxAGC", "kServingPNOffset",
-          "kSessionState", "kUATI24", "kColorCode", "kActiveSetPilots", "kFingerC2I", "k1xDeviceState",
-          "k1xRx0BandClass", "k1xRx0ChanNum", "k1xRxAGC0", "k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1",
-          "k1xTxAGC", "k1xActiveSetInfo", "k1xTrafficFER", "k1xRoamingHome", "kSystemId", "kNetworkId",
-          "kPacketZoneId", "kBaseId", "kProtocolRevision", "kFLDataRate", "kRLDataRate"));
+  EXPECT_THAT(lookupNames(displayTemplate("C2KTemplate")),
+              testing::UnorderedElementsAreArray(test::c2kLookupNames));
 }
 
 TEST(C2KTemplate, ShowsTheVoiceSystemBeforeTheDataSystem) {

@@ -1,10 +1,10 @@
 #!/usr/bin/env python3
 """Decodes every capture of one technology and compares the display and the error lines with what is expected.
 
-A capture TECH/NAME.pcap comes with NAME.expected.json, the display after its last message or {"crash": reason}, and
-NAME.log, the system-log lines of priority 3 in order ("<ptr>" stands for any address, "<n>" for any number). Captures
-in TECH/no-templates/ are decoded with an empty resource directory. Dictionaries must have their keys in the order of
-the expectation.
+A capture TECH/NAME.pcap comes with NAME.expected.json, the display after its last message or {"crash": reason}, where
+the reason is part of a log line, and NAME.log, the system-log lines of priority 3 in order ("<ptr>" stands for any
+address, "<n>" for any number). Captures in TECH/no-templates/ are decoded with an empty resource directory.
+Dictionaries must have their keys in the order of the expectation.
 """
 
 import argparse
@@ -58,12 +58,17 @@ def first_difference(expected, actual):
     return f"expected {len(expected)} lines, got {len(actual)}"
 
 
+def crash_fault(reason, result):
+    if result.returncode != -signal.SIGABRT:
+        return f"expected SIGABRT, got status {result.returncode}"
+    log = result.stderr.decode(errors="replace")
+    return None if reason in log else f"expected {reason!r}, got {log.strip()!r}"
+
+
 def display_fault(capture, result):
     expected = capture.with_suffix(".expected.json").read_text()
     if "crash" in (json.loads(expected) or {}):
-        if result.returncode == -signal.SIGABRT:
-            return None
-        return f"expected SIGABRT, got status {result.returncode}"
+        return crash_fault(json.loads(expected)["crash"], result)
     if result.returncode != 0:
         return f"status {result.returncode}"
     wanted, got = comparable(expected), comparable(result.stdout)

@@ -43,8 +43,8 @@ class Dlf(KelvasictlTest):
 
 
 class Snapshot(KelvasictlTest):
-    def snapshot(self, *arguments):
-        result = self.decode("--snapshot", self.path("a.kelvasi"), *arguments)
+    def snapshot(self, *arguments, **options):
+        result = self.decode("--snapshot", self.path("a.kelvasi"), *arguments, **options)
         self.assertEqual((result.returncode, result.stderr), (0, b""))
         return plistlib.loads(self.read("a.kelvasi"))
 
@@ -69,6 +69,23 @@ class Snapshot(KelvasictlTest):
     def test_of_nothing_holds_an_empty_history(self):
         (dlf,) = self.snapshot(self.write("a.pcap", pcap()))["Data"]
         self.assertEqual(len(dlf["DLF"]), 161)
+
+    def test_of_cdma_holds_both_readings_of_the_rate_counters(self):
+        # Sequence number and one counter each: of 1024 bits at byte 29, of 128 bits at byte 18.
+        def forward(sequence, packets):
+            return record(0x1192, bytes([sequence]) + bytes(15) + bytes([packets]) + bytes(211))
+
+        def reverse(sequence, packets):
+            return record(0x127E, bytes([0, sequence, 0, 0, 0, packets]) + bytes(1731))
+
+        capture = self.write("a.pcap", pcap((0.0, forward(5, 1)), (0.1, reverse(10, 2)),
+                                            (3.0, forward(7, 3)), (3.1, reverse(11, 6))))
+        first, second, _ = self.snapshot(capture, technology="Orvane_CDMA")["Data"]
+        before = {"FLDataSeqNum1": 5, "FLDataSent1": 1024, "RLDataSeqNum1": 10, "RLDataSent1": 256}
+        self.assertEqual(first["ExtraInfo"], before)
+        self.assertEqual(second["ExtraInfo"],
+                         {"FLDataSeqNum1": 7, "FLDataSent1": 3072, "RLDataSeqNum1": 11, "RLDataSent1": 768}
+                         | {key[:-1] + "2": value for key, value in before.items()})
 
     def test_is_written_of_what_precedes_a_fault(self):
         contents = pcap(MM_IDLE, GMM_REGISTERED)

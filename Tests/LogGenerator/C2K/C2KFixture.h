@@ -1,6 +1,8 @@
 // A CDMA generator with a template of one leaf per lookup name, each called after it.
 #pragma once
 
+#include <initializer_list>
+#include <span>
 #include <string>
 
 #include "LogGenerator/C2K/C2KLogGenerator.h"
@@ -9,7 +11,9 @@
 namespace kelvasi::test {
 
 struct C2KFixture {
-  explicit C2KFixture(std::initializer_list<std::string_view> names) {
+  explicit C2KFixture(std::initializer_list<std::string_view> names)
+      : C2KFixture(std::span(names.begin(), names.size())) {}
+  explicit C2KFixture(std::span<const std::string_view> names) {
     const auto leaves = PlistDictionary::make();
     for (const std::string_view name : names) leaves->set(name, name);
     useTemplate(leaves);

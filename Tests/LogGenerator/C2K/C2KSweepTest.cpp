@@ -4,7 +4,9 @@
 #include <array>
 #include <random>
 
+#include "Plist/Description.h"
 #include "Tests/LogGenerator/C2K/C2KFixture.h"
+#include "Tests/Support/C2KLookupNames.h"
 
 namespace kelvasi {
 namespace {
@@ -15,37 +17,27 @@ using test::record;
 struct SweptRecord {
   LogCode logCode;
   std::size_t minimumLength;
+  const char* row;  // that the second of two records of zeros fills; none where there is nothing to show
+  const char* text;
   bool isExact = false;  // longer ones are refused again
 };
 
 constexpr std::array swept{
-    SweptRecord{0x108A, 23, true}, SweptRecord{0x1183, 50, true}, SweptRecord{0x1192, 241},
-    SweptRecord{0x12B6, 25},       SweptRecord{0x119C, 17},       SweptRecord{0x119D, 17},
-    SweptRecord{0x127E, 1750},     SweptRecord{0x134F, 171},
+    SweptRecord{0x108A, 23, "kFingerC2I", "(none)", true},
+    SweptRecord{0x1183, 50, "kChannel", "259", true},
+    SweptRecord{0x1192, 241, "kFLDataRate", "0.00 kbps"},
+    SweptRecord{0x12B6, 25, "kActiveSetPilots", "(none)"},
+    SweptRecord{0x119C, 17, nullptr, nullptr},
+    SweptRecord{0x119D, 17, nullptr, nullptr},
+    SweptRecord{0x127E, 1750, "kRLDataRate", "0.00 kbps"},
+    SweptRecord{0x134F, 171, "kSystemId", "(unknown system type 0)"},
 };
 
 constexpr std::array<std::uint8_t, 2> fills{0x00, 0xFF};
 
 // Every lookup name has a leaf.
 struct AllRows : C2KFixture {
-  AllRows()
-      : C2KFixture({"kChannel",         "k1xEVDODeviceState",
-                    "kBandClass",       "kRxAGC0",
-                    "kRxAGC1",          "kTxAGC",
-                    "kServingPNOffset", "kSessionState",
-                    "kUATI24",          "kColorCode",
-                    "kActiveSetPilots", "kFingerC2I",
-                    "k1xDeviceState",   "k1xRx0BandClass",
-                    "k1xRx0ChanNum",    "k1xRxAGC0",
-                    "k1xRx1BandClass",  "k1xRx1ChanNum",
-                    "k1xRxAGC1",        "k1xTxAGC",
-                    "k1xActiveSetInfo", "k1xTrafficFER",
-                    "k1xRoamingHome",   "kSystemId",
-                    "kNetworkId",       "kPacketZoneId",
-                    "kBaseId",          "kProtocolRevision",
-                    "kFLDataRate",      "kRLDataRate"}) {
-    generator.generateLogUsingState(state);
-  }
+  AllRows() : C2KFixture(test::c2kLookupNames) { generator.generateLogUsingState(state); }
 };
 
 // In a buffer of exactly this size, so that a read past its end is seen. Every payload byte is `fill`.
@@ -56,20 +48,24 @@ Bytes filled(LogCode logCode, std::size_t length, std::uint8_t fill) {
   return bytes;
 }
 
-// Neither a row nor anything that is remembered for the next record.
+// Of zeros but for bytes 13 and 14: a version of the system parameters, a sequence number of a rate.
+Bytes zeros(const SweptRecord& each, std::size_t length, std::string_view digits) {
+  return test::with(filled(each.logCode, length, 0), 13, digits);
+}
+
+// Every row, and everything that is remembered for the next record.
 std::string everything(const C2KFixture& fixture) {
-  std::string text = fixture.display();
+  const auto remembered = PlistDictionary::make({{"ExtraInfo", *fixture.state.find("ExtraInfo")}});
   for (const char* key : {"TrafficFER", "FLDataSeqNum", "FLDataSent", "RLDataSeqNum", "RLDataSent"})
-    text += fixture.state.find(key) ? key : "";
-  return text;
+    remembered->set(key, fixture.state.get(key));
+  return fixture.display() + description(remembered);
 }
 
 TEST(C2KSweep, RecordsShorterThanTheirMinimumChangeNothing) {
   for (const auto& each : swept) {
     AllRows fixture;
-    Bytes whole = filled(each.logCode, each.minimumLength, 0);
-    whole[13] = 2;  // a version that the system parameters may have
-    fixture.take(whole);
+    for (const auto& other : swept) fixture.take(zeros(other, other.minimumLength, "02 01"));
+    fixture.state.set("TrafficFER", 0.25);
     const std::string before = everything(fixture);
     for (std::size_t length = 0; length < each.minimumLength; ++length) {
       for (const std::uint8_t fill : fills) fixture.take(filled(each.logCode, length, fill));
@@ -80,13 +76,17 @@ TEST(C2KSweep, RecordsShorterThanTheirMinimumChangeNothing) {
   }
 }
 
+// Two of them, for the rates.
 TEST(C2KSweep, RecordsOfTheirMinimumAreTaken) {
   for (const auto& each : swept) {
     for (std::size_t length = each.minimumLength; length <= each.minimumLength + 2; ++length) {
       AllRows fixture;
-      fixture.take(filled(each.logCode, length, 0));
-      const bool isRefused = (each.isExact && length > each.minimumLength) || each.logCode == 0x134F;
-      EXPECT_EQ(fixture.errors().size(), isRefused ? 1u : 0u) << each.logCode << " of " << length;
+      fixture.take(zeros(each, length, "02 00"));
+      fixture.take(zeros(each, length, "03 01"));
+      const bool isRefused = each.isExact && length > each.minimumLength;
+      EXPECT_EQ(fixture.errors().size(), isRefused ? 2u : 0u) << each.logCode << " of " << length;
+      if (!each.row) continue;
+      EXPECT_EQ(fixture.text(each.row), isRefused ? "" : each.text) << each.logCode << " of " << length;
     }
   }
 }

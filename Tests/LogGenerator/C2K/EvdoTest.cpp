@@ -298,6 +298,32 @@ TEST(EvdoReverseRate, TheFirstRecordPrimesAndAnEqualSequenceKeepsTheRate) {
   EXPECT_EQ(fixture.state.get("RLDataSent"), PlistValue(2048));
 }
 
+// Of every entry of the history, the extra information as its keys and numbers.
+std::vector<std::string> extraInfoOfHistory(C2KFixture& fixture) {
+  std::vector<std::string> texts;
+  for (const PlistValue& entry : *fixture.state.find("History")->array()) {
+    std::string text;
+    for (const auto& [key, value] : *entry.dictionary()->get("ExtraInfo").dictionary())
+      text += key + "=" + std::to_string(*value.integer()) + " ";
+    texts.push_back(text);
+  }
+  return texts;
+}
+
+TEST(EvdoRates, TheHistoryKeepsBothReadingsOfEachTick) {
+  C2KFixture fixture({});
+  fixture.take(forwardRate("05000000", 3, "01000000"));
+  fixture.take(with(record(0x127E, "", 1750), 14, "0A000000 02000000"));
+  fixture.generator.generateLogUsingState(fixture.state);
+  fixture.take(forwardRate("07000000", 3, "03000000"));
+  fixture.take(with(record(0x127E, "", 1750), 14, "0B000000 06000000"));
+  fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_THAT(extraInfoOfHistory(fixture),
+              ElementsAre("FLDataSeqNum1=5 FLDataSent1=1024 RLDataSeqNum1=10 RLDataSent1=256 ",
+                          "FLDataSeqNum1=7 FLDataSent1=3072 RLDataSeqNum1=11 RLDataSent1=768 "
+                          "FLDataSeqNum2=5 FLDataSent2=1024 RLDataSeqNum2=10 RLDataSent2=256 "));
+}
+
 TEST(EvdoReverseRate, NeedsAtLeast1750Bytes) {
   C2KFixture fixture({"kRLDataRate"});
   fixture.take(record(0x127E, "", 1749));

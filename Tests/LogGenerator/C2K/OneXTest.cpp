@@ -91,6 +91,18 @@ TEST(DeviceStatus, OutsideTrafficTheSecondReceiverAndTheTransmitterAreNotAvailab
   }
 }
 
+// Rx 0 -128, Rx 1 -1 and Tx -105: -128 * 0.334 - 63.248, -0.334 - 63.248, -10.5.
+TEST(DeviceStatus, PowersAreSigned) {
+  auto fixture = deviceFixture();
+  fixture.take(record(0x119C,
+                      "00 04 0000 01 00 0500 08"
+                      "02 00 0E00 00 00 0000 0000 80 FF 97FF" +
+                          noPilots + "04 00 0400"));
+  EXPECT_EQ(fixture.text("k1xRxAGC0"), "-106.00 dBm");
+  EXPECT_EQ(fixture.text("k1xRxAGC1"), "-63.58 dBm");
+  EXPECT_EQ(fixture.text("k1xTxAGC"), "-10.50 dBm");
+}
+
 TEST(DeviceStatus, HasATextForEachStateAndShowsTheValueItselfPastThem) {
   const char* texts[] = {"Inactive [0]",
                          "Deep sleep in start state [1]",
@@ -229,6 +241,19 @@ TEST(SubPackets, ASubPacketThatEndsPastTheRecordStopsTheSearchBeforeItsIdIsLooke
   EXPECT_EQ(fixture.text("k1xTrafficFER"), "0.00%");
 }
 
+// The record ends at 21 bytes; the second sub-packet starts at 30, before 17 + 21, and reads as zeros; or the
+// third one does.
+TEST(SubPackets, ASubPacketThatStartsPastTheRecordReadsAsZeros) {
+  C2KFixture fixture({"k1xTrafficFER"});
+  fixture.take(record(0x119D, "00 02 0000 01 00 0D00"));
+  EXPECT_THAT(fixture.errors(), IsEmpty());
+  EXPECT_EQ(fixture.warnings().back(), "Log code 0x119d: missing traffic demod subpacket.");
+  fixture.take(record(0x119D, "00 03 0000 01 00 1400"));
+  EXPECT_THAT(fixture.errors(), IsEmpty());
+  fixture.take(record(0x119D, "00 03 0000 01 00 0D00 0B 00 0400"));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "");
+}
+
 TEST(SubPackets, SizesOfZeroAndOf65535EndTheSearch) {
   C2KFixture fixture({"k1xTrafficFER"});
   fixture.take(record(0x119D, "00 FF 0000 01 00 0000"));
@@ -272,6 +297,43 @@ TEST(TrafficFER, IsAFirstOrderAverageOfWeightOneIn64) {
   EXPECT_EQ(*fixture.state.find("TrafficFER")->real(), 0.015380859375);
 }
 
+TEST(TrafficFER, IsComputedInSinglePrecision) {
+  C2KFixture fixture({"k1xTrafficFER"});
+  for (int count = 0; count < 5; ++count) fixture.take(frame(true));
+  // In double precision it would be 0.07572144363075495.
+  EXPECT_EQ(*fixture.state.find("TrafficFER")->real(), 0.07572144269943237);
+}
+
+// 9.8349995911 as a double of the stored rate; in single precision the product would be 9.835.
+TEST(TrafficFER, TheStoredRatePrintsTheSameDuringTheCallAndAfterIt) {
+  auto fixture = deviceFixture();
+  for (const char each : std::string_view("10100101101100")) fixture.take(frame(each == '1'));
+  EXPECT_EQ(*fixture.state.find("TrafficFER")->real(), 0.098349995911121368);
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "9.83%");
+  fixture.take(deviceStatus("06", noPilots));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "9.83% (old)");
+}
+
+TEST(TrafficFER, AnIntegerInTheStateCountsAsARate) {
+  auto fixture = deviceFixture();
+  fixture.state.set("TrafficFER", 1);
+  fixture.take(frame(false));
+  EXPECT_EQ(*fixture.state.find("TrafficFER")->real(), 0.984375);
+  fixture.state.set("TrafficFER", 1);
+  fixture.take(deviceStatus("06", noPilots));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "100.00% (old)");
+  EXPECT_EQ(fixture.state.find("TrafficFER"), nullptr);
+}
+
+TEST(TrafficFER, WhatIsNoNumberCountsAsNoRate) {
+  auto fixture = deviceFixture();
+  fixture.state.set("TrafficFER", "0.5");
+  fixture.take(deviceStatus("06", noPilots));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "");
+  fixture.take(frame(true));
+  EXPECT_EQ(fixture.text("k1xTrafficFER"), "1.56%");
+}
+
 TEST(TrafficFER, IsShownOnceMoreAsOldWhenTheCallHasEnded) {
   auto fixture = deviceFixture();
   fixture.take(frame(true));
@@ -290,6 +352,24 @@ TEST(TrafficFER, ADeviceStatusThatIsNotWholeKeepsIt) {
   fixture.take(record(0x119C, "00 01 0000 01 00 0500 06"));
   EXPECT_EQ(fixture.text("k1xTrafficFER"), "1.56%");
   EXPECT_NE(fixture.state.find("TrafficFER"), nullptr);
+}
+
+// Too short, without sub-packets, and with one that claims to end past the record.
+TEST(RefusedRecords, KeepEveryRowOf1x) {
+  auto fixture = deviceFixture();
+  fixture.take(deviceStatus("08", noPilots));
+  fixture.take(frame(true));
+  const std::string before = fixture.display();
+  ASSERT_THAT(before, testing::Not(testing::HasSubstr("=\n")));
+  for (const LogCode code : {0x119CU, 0x119DU}) {
+    for (const Bytes& refused :
+         {record(code, "", 16), record(code, "", 17), record(code, "00 04 0000 01 00 0500 06 02 00 FFFF"),
+          record(code, "00 01 0000 01 00 0500 06", 200)}) {
+      fixture.take(refused);
+      EXPECT_EQ(fixture.display(), before) << code << " of " << refused.size();
+    }
+  }
+  EXPECT_EQ(*fixture.state.find("TrafficFER")->real(), 0.015625);
 }
 
 TEST(TrafficFER, WithoutACallBeforeTheRowStays) {

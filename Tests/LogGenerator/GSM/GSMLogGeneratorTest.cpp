@@ -160,10 +160,9 @@ TEST(GSMLogGeneratorDeathTest, BothFailedAssertionsEndTheProcessWithTheirTexts) 
   EXPECT_EXIT(endWith({}), aborted,
               "^<2>Terminating: uncaught kelvasi::AssertionFailure: Could not deserialize the object "
               "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
-  EXPECT_EXIT(
-      endWith(one("A", PlistArray::make({"x", one("B", 7)}))), aborted,
-      "^<2>Terminating: uncaught kelvasi::AssertionFailure: Unknown object of type number encountered "
-      "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
+  EXPECT_EXIT(endWith(one("A", PlistArray::make({"x", one("B", 7)}))), aborted,
+              "^<2>Terminating: uncaught kelvasi::AssertionFailure: Unknown object of type int encountered "
+              "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
 }
 
 // Messages as they come, cut and changed at every byte: each is shown or fails as an assertion does.
@@ -240,10 +239,10 @@ TEST(GSMLogGenerator, AMessageThatIsNoPropertyListIsAFailedAssertion) {
 }
 
 TEST(GSMLogGenerator, AValueThatIsNeitherTextNorContainerIsAFailedAssertion) {
-  EXPECT_THAT(failureOf(one("A", 1)), HasSubstr("Unknown object of type number encountered"));
-  EXPECT_THAT(failureOf(one("A", 0.5)), HasSubstr("Unknown object of type number encountered"));
-  EXPECT_THAT(failureOf(PlistArray::make({true})), HasSubstr("Unknown object of type boolean encountered"));
-  EXPECT_THAT(failureOf(Bytes{1}), HasSubstr("Unknown object of type data encountered"));
+  EXPECT_THAT(failureOf(one("A", 1)), HasSubstr("Unknown object of type int encountered"));
+  EXPECT_THAT(failureOf(one("A", 0.5)), HasSubstr("Unknown object of type double encountered"));
+  EXPECT_THAT(failureOf(PlistArray::make({true})), HasSubstr("Unknown object of type bool encountered"));
+  EXPECT_THAT(failureOf(Bytes{1}), HasSubstr("Unknown object of type bytes encountered"));
   EXPECT_THAT(failureOf(PlistDate{}), HasSubstr("Unknown object of type date encountered"));
 }
 

@@ -37,10 +37,7 @@ TEST(GSMNeighbhorMeasurements, ACellPastTheCountIsOutOfBounds) {
   const Bytes bytes = record(0xD00E, threeCells);
   const auto& cells = utran::gsmNeighborCells::cells;
   const RecordView last = entryOf(RecordView(bytes), cells, 2);
-  EXPECT_EQ(
-      valueOf(last,
-              utran::gsmNeighborCells::cellLayout[indexIn(utran::gsmNeighborCells::cellLayout, "RSSI")]),
-      -58);
+  EXPECT_EQ(valueOf(last, fieldIn(utran::gsmNeighborCells::cellLayout, "RSSI")), -58);
   EXPECT_THROW(entryOf(RecordView(bytes), cells, 3), ArrayOutOfBoundsException);
 }
 

@@ -55,9 +55,8 @@ TEST(Serialise, WritesEveryKind) {
 // {"A": "x"}: a dictionary of one entry, its key, its value, and where each of them stands.
 TEST(Serialise, WritesABinaryPropertyList) {
   const auto bytes = serialiser.serialiseBinary(PlistDictionary::make({{"A", "x"}}));
-  EXPECT_EQ(*bytes,
-            test::hex("62706C6973743030 D1 01 02 51 41 51 78 08 0B 0D"
-                      "000000000000 01 01 0000000000000003 0000000000000000 000000000000000F"));
+  EXPECT_EQ(*bytes, test::hex("62706C6973743030 D1 01 02 51 41 51 78 08 0B 0D"
+                              "000000000000 01 01 0000000000000003 0000000000000000 000000000000000F"));
 }
 
 TEST(Serialise, NothingForWhatIsAbsentInTheBinaryFormatEither) {

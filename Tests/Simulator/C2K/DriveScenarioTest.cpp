@@ -8,11 +8,13 @@
 #include <cstdio>
 #include <cstdlib>
 #include <set>
+#include <utility>
 
 #include "Simulator/C2K/Frames.h"
 #include "Simulator/Subscription.h"
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/DecodingViewer.h"
+#include "Tests/Support/C2KLookupNames.h"
 
 namespace kelvasi::sim::c2k {
 namespace {
@@ -28,22 +30,7 @@ constexpr std::array<std::uint64_t, 4> seeds{1, 3, 11, 12345};
 // A leaf for each lookup name, called after it.
 PlistValue displayTemplate() {
   const auto leaves = PlistDictionary::make();
-  for (const char* name : {"kChannel",         "k1xEVDODeviceState",
-                           "kBandClass",       "kRxAGC0",
-                           "kRxAGC1",          "kTxAGC",
-                           "kServingPNOffset", "kSessionState",
-                           "kUATI24",          "kColorCode",
-                           "kActiveSetPilots", "kFingerC2I",
-                           "k1xDeviceState",   "k1xRx0BandClass",
-                           "k1xRx0ChanNum",    "k1xRxAGC0",
-                           "k1xRx1BandClass",  "k1xRx1ChanNum",
-                           "k1xRxAGC1",        "k1xTxAGC",
-                           "k1xActiveSetInfo", "k1xTrafficFER",
-                           "k1xRoamingHome",   "kSystemId",
-                           "kNetworkId",       "kPacketZoneId",
-                           "kBaseId",          "kProtocolRevision",
-                           "kFLDataRate",      "kRLDataRate"})
-    leaves->set(name, name);
+  for (const std::string_view name : kelvasi::test::c2kLookupNames) leaves->set(name, name);
   return leaves;
 }
 
@@ -134,6 +121,14 @@ void CdmaDrive::checkOneX() {
     ASSERT_EQ(pilot("k1xActiveSetInfo", key).starts_with("(ref pilot) "), key == wanted.front());
   for (const char* row : {"k1xRx1BandClass", "k1xRx1ChanNum", "k1xRxAGC1", "k1xTxAGC"})
     ASSERT_EQ(text(row) != "N/A", oneX.isInCall()) << row;
+  if (oneX.isInCall()) {
+    ASSERT_EQ(text("k1xRx1ChanNum"), std::to_string(oneXChannel));
+    ASSERT_EQ(text("k1xRx1BandClass"), "800 MHz cellular band [0]");
+  }
+  // Soft hand-off is for calls.
+  if (oneX.hasSystem() && !oneX.isInCall()) {
+    ASSERT_EQ(wanted.size(), 1u);
+  }
   ASSERT_EQ(text("k1xRx0ChanNum"), std::to_string(oneXChannel));
   ASSERT_EQ(text("k1xRx0BandClass"), "800 MHz cellular band [0]");
 }
@@ -169,8 +164,12 @@ void CdmaDrive::checkEvdo() {
   if (evdo.session() != Evdo::Session::ampSetup) {
     ASSERT_EQ(evdo.uati24() == 0, evdo.session() == Evdo::Session::closed);
   }
+  if (evdo.state() == Evdo::State::idle) {
+    ASSERT_EQ(evdo.pilots().active().size(), 1u);
+  }
   // There is one radio.
-  if (world().oneX().isInCall()) {
+  const OneX::Stage stage = world().oneX().stage();
+  if (stage == OneX::Stage::accessing || stage == OneX::Stage::inCall) {
     ASSERT_EQ(evdo.state(), Evdo::State::inactive);
   }
 }
@@ -185,21 +184,30 @@ TEST_P(CdmaDrive, EveryMomentIsCoherent) {
   EXPECT_THAT(viewer.warnings(), ElementsAre("Processing the template"));
 }
 
+// As the record holds it: in steps of 0.334 dB, of 8 bits.
+double shownPower(double dBm) {
+  return std::clamp(dBm, -106.0, -20.83);
+}
+
 void CdmaDrive::checkOneXValues() {
-  const double power = std::clamp(world().receivedPower(0), -106.0, -20.83);
-  ASSERT_NEAR(number(text("k1xRxAGC0")), power, 0.334 / 2 + 0.006);
+  constexpr double halfStep = 0.334 / 2 + 0.006;
+  ASSERT_NEAR(number(text("k1xRxAGC0")), shownPower(world().receivedPower(0)), halfStep);
   if (world().oneX().isInCall()) {
+    ASSERT_NEAR(number(text("k1xRxAGC1")), shownPower(world().receivedPower(1)), halfStep);
     ASSERT_NEAR(number(text("k1xTxAGC")), world().oneXTransmitPower(), 0.056);
   }
+  std::size_t matched = 0;
   for (const std::size_t cell : world().oneX().pilots().active()) {
     for (const std::string& key : keys("k1xActiveSetInfo")) {
       if (!key.ends_with(";" + std::to_string(world().cell(cell).code))) continue;
+      ++matched;
       const double shown = linear(number(pilot("k1xActiveSetInfo", key)));
       const double wanted = std::max(linear(world().oneXRatios()[cell]), 0.00001);
       // Half a step of the energy, and half a hundredth of a dB.
       ASSERT_NEAR(shown, wanted, 0.5 / 36864 + 0.0012 * wanted);
     }
   }
+  ASSERT_EQ(matched, world().oneX().pilots().active().size());
 }
 
 void CdmaDrive::checkFingers() {
@@ -208,6 +216,7 @@ void CdmaDrive::checkFingers() {
   for (const Finger& finger : world().fingers()) {
     const std::string position = std::to_string(place++) + ";";
     if (!finger.cell) continue;
+    ASSERT_TRUE(world().oneX().pilots().isActive(*finger.cell));
     ++assigned;
     const double shown =
         linear(number(pilot("kFingerC2I", position + std::to_string(world().cell(*finger.cell).code))));
@@ -266,7 +275,7 @@ TEST_P(CdmaDrive, TheFrameErrorRateFollowsTheFramesAndRisesInAFade) {
       rate = (isError ? 0.015625F : 0.0F) + (rate ? *rate * 0.984375F : 0.0F);
     if (!rate) return;
     char expected[32];
-    std::snprintf(expected, sizeof expected, "%.02f%%", static_cast<double>(*rate * 100));
+    std::snprintf(expected, sizeof expected, "%.02f%%", static_cast<double>(*rate) * 100);
     ASSERT_EQ(text("k1xTrafficFER"), expected);
     const double ratio = combinedRatio(oneX.pilots(), world().oneXRatios());
     goodSteps = ratio > -11 ? goodSteps + 1 : 0;
@@ -286,6 +295,15 @@ std::string kilobits(std::int64_t bits, std::int64_t before, std::uint32_t secon
   return text;
 }
 
+// Of the steps of this second, counted from 1, how many transferred something. A report may come later than
+// its second: none is sent while the radio is 1x's.
+std::ptrdiff_t stepsOfSecond(std::uint32_t second, const std::vector<bool>& transferring) {
+  constexpr std::ptrdiff_t steps = 5;
+  if (second == 0) return 0;
+  const auto end = transferring.begin() + steps * static_cast<std::ptrdiff_t>(second);
+  return std::count(end - steps, end, true);
+}
+
 // What the rates of one link have to be.
 struct LinkCheck {
   std::string_view rateName;
@@ -297,7 +315,8 @@ struct LinkCheck {
   int still = 0;
 
   template <typename Report>
-  void check(const Report& report, const DecodingViewer& viewer, int transferringSteps) {
+  void check(const Report& report, const DecodingViewer& viewer, const std::vector<bool>& transferring) {
+    const auto transferringSteps = stepsOfSecond(report.sequence, transferring);
     const std::string shown = *viewer.sectionOf(rateName).string();
     if (sequence != 0 && report.sequence > sequence) {
       ASSERT_EQ(shown, kilobits(report.bits, bits, report.sequence - sequence));
@@ -324,13 +343,11 @@ TEST_P(CdmaDrive, RatesAreThoseOfTheDataAndZeroWithoutThem) {
   std::vector<bool> transferring;
   play(manySteps, [&](const Messages& messages) {
     transferring.push_back(world().evdo().isTransferring());
-    if (transferring.size() < 5) return;
-    const auto steps = static_cast<int>(std::count(transferring.end() - 5, transferring.end(), true));
     if (has(messages, forward.logCode)) {
-      ASSERT_NO_FATAL_FAILURE(forward.check(world().dataLink().forward(), viewer, steps));
+      ASSERT_NO_FATAL_FAILURE(forward.check(world().dataLink().forward(), viewer, transferring));
     }
     if (has(messages, reverse.logCode)) {
-      ASSERT_NO_FATAL_FAILURE(reverse.check(world().dataLink().reverse(), viewer, steps));
+      ASSERT_NO_FATAL_FAILURE(reverse.check(world().dataLink().reverse(), viewer, transferring));
     }
     rates.insert(text("kFLDataRate"));
   });
@@ -356,11 +373,14 @@ TEST_P(CdmaDrive, SendsEveryCodeThatTheViewerSubscribesTo) {
 
 TEST_P(CdmaDrive, GoesThroughEveryStateOfBothAirInterfaces) {
   std::set<std::string> seen;
+  OneX::Stage before = world().oneX().stage();
   play(manySteps, [&](const Messages&) {
     for (const char* row : {"k1xDeviceState", "k1xEVDODeviceState", "kSessionState", "kSystemId"})
       seen.insert(text(row));
     const OneX& oneX = world().oneX();
-    if (oneX.stage() == OneX::Stage::accessing) seen.insert("access");
+    const bool wasAccess = std::exchange(before, oneX.stage()) == OneX::Stage::accessing;
+    if (wasAccess && oneX.stage() == OneX::Stage::idle) seen.insert("registration");
+    if (wasAccess && oneX.isInCall()) seen.insert("call set-up");
     if (oneX.hasDroppedCall()) seen.insert("dropped call");
     if (oneX.pilots().active().size() > 2) seen.insert("three-way hand-off");
     if (oneX.isInCall() && !oneX.pilots().candidates().empty()) seen.insert("candidates");
@@ -386,7 +406,8 @@ TEST_P(CdmaDrive, GoesThroughEveryStateOfBothAirInterfaces) {
                                   "Open [4]",
                                   "4139",
                                   "4206",
-                                  "access",
+                                  "registration",
+                                  "call set-up",
                                   "dropped call",
                                   "three-way hand-off",
                                   "candidates",

@@ -5,6 +5,7 @@
 
 #include <cmath>
 #include <set>
+#include <stdexcept>
 
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/DecodingViewer.h"
@@ -56,7 +57,9 @@ class ObjectStream : public testing::TestWithParam<std::uint64_t> {
   }
 
   void checkServingCell();
-  void checkNeighbours(std::string_view technology, const std::vector<std::size_t>& places);
+  void checkNeighbours();
+  void checkList(const PlistValue& list, const std::vector<std::size_t>& places);
+  void checkChains(const PlistValue& message);
 
   LibplistSerialiser plists;
   ObjectStreamScenario scenario{GetParam(), plists};
@@ -82,10 +85,33 @@ void ObjectStream::checkServingCell() {
 }
 
 // A technology's list alone among the neighbours collapses into their place.
-void ObjectStream::checkNeighbours(std::string_view technology, const std::vector<std::size_t>& places) {
-  PlistValue list = shown({"Neighbor Cells"});
-  if (list.dictionary()) list = list.dictionary()->get(technology);
-  if (places.empty()) return;
+void ObjectStream::checkNeighbours() {
+  const PlistValue lists = shown({"Neighbor Cells"});
+  const auto& gsm = world().gsmNeighbours();
+  const auto& umts = world().umtsNeighbours();
+  if (gsm.empty() && umts.empty()) {
+    ASSERT_EQ(kindOf(lists), "dictionary of 0");
+  } else if (gsm.empty() || umts.empty()) {
+    checkList(lists, gsm.empty() ? umts : gsm);
+  } else {
+    ASSERT_EQ(kindOf(lists), "dictionary of 2");
+    ASSERT_NO_FATAL_FAILURE(checkList(at(lists, {"GSM"}), gsm));
+    checkList(at(lists, {"UMTS"}), umts);
+  }
+}
+
+// What the display shows as one text is sent as dictionaries of one entry each.
+void ObjectStream::checkChains(const PlistValue& message) {
+  ASSERT_EQ(kindOf(at(message, {"Power"})), "dictionary of 1");
+  ASSERT_EQ(kindOf(at(message, {"Power", "Handset"})), "dictionary of 1");
+  ASSERT_EQ(at(message, {"Power", "Handset", "State"}), PlistValue(text({"Power"})));
+  if (world().connection().isConnected()) return;
+  ASSERT_EQ(kindOf(at(message, {"Connection"})), "dictionary of 1");
+  ASSERT_EQ(kindOf(at(message, {"Connection", "Radio Resources"})), "dictionary of 1");
+  ASSERT_EQ(at(message, {"Connection", "Radio Resources", "State"}), PlistValue(text({"Connection"})));
+}
+
+void ObjectStream::checkList(const PlistValue& list, const std::vector<std::size_t>& places) {
   ASSERT_TRUE(list.array());
   ASSERT_EQ(list.array()->size(), places.size());
   for (std::size_t place = 0; place < places.size(); ++place) {
@@ -96,10 +122,10 @@ void ObjectStream::checkNeighbours(std::string_view technology, const std::vecto
 }
 
 TEST_P(ObjectStream, EveryMomentIsTheWorlds) {
-  play(manySteps, [&](const Messages&) {
+  play(manySteps, [&](const Messages& messages) {
     ASSERT_NO_FATAL_FAILURE(checkServingCell());
-    ASSERT_NO_FATAL_FAILURE(checkNeighbours("GSM", world().gsmNeighbours()));
-    ASSERT_NO_FATAL_FAILURE(checkNeighbours("UMTS", world().umtsNeighbours()));
+    ASSERT_NO_FATAL_FAILURE(checkNeighbours());
+    ASSERT_NO_FATAL_FAILURE(checkChains(plists.parse(messages.at(0).bytes).value()));
     ASSERT_EQ(text({"Power"}), world().registration().isOn() ? "On" : "Off");
     ASSERT_EQ(kindOf(shown({"Connection"})) == "text", !world().connection().isConnected());
   });
@@ -147,6 +173,13 @@ Bytes allBytes(std::uint64_t seed, const PlistSerialiser& plists) {
   Bytes all;
   for (const Message& message : messages) all.insert(all.end(), message.bytes.begin(), message.bytes.end());
   return all;
+}
+
+TEST(ObjectStreamFailure, AnObjectThatCannotBeSerialisedIsNotDroppedInSilence) {
+  const kelvasi::test::FakeSerialiser serialisesNothing;
+  ObjectStreamScenario scenario(1, serialisesNothing);
+  Messages messages;
+  EXPECT_THROW(scenario.greet(messages), std::logic_error);
 }
 
 TEST(ObjectStreamSeed, TheSameGivesTheSameMessages) {

@@ -1,4 +1,4 @@
-#include "LogGenerator/C2K/C2KTexts.h"
+#include "LogGenerator/C2K/ValueTexts.h"
 
 #include <array>
 #include <cmath>
@@ -62,46 +62,45 @@ bool isIn(std::span<const char* const> texts, std::int64_t value) {
   return value >= 0 && static_cast<std::uint64_t>(value) < texts.size();
 }
 
-C2KText textOr(std::span<const char* const> texts, std::int64_t value, C2KText otherwise) {
-  return isIn(texts, value) ? C2KText("%s", texts[static_cast<std::size_t>(value)]) : otherwise;
+// The fallback is a format for the value itself.
+FormattedText textOr(std::span<const char* const> texts, std::int64_t value, const char* fallback)
+    __attribute__((format(printf, 3, 0)));
+FormattedText textOr(std::span<const char* const> texts, std::int64_t value, const char* fallback) {
+  if (isIn(texts, value)) return FormattedText("%s", texts[static_cast<std::size_t>(value)]);
+  return FormattedText(fallback, static_cast<int>(value));
 }
 
-C2KText badValue(std::int64_t value) {
-  return C2KText("[Bad Value %d]", static_cast<int>(value));
-}
-
-C2KText reserved(std::int64_t value) {
-  return C2KText("[Reserved %d]", static_cast<int>(value));
-}
+constexpr const char* badValue = "[Bad Value %d]";
+constexpr const char* reserved = "[Reserved %d]";
 
 }  // namespace
 
-C2KText decimalText(std::int64_t value) {
-  return C2KText("%d", static_cast<int>(value));
+FormattedText decimalText(std::int64_t value) {
+  return FormattedText("%d", static_cast<int>(value));
 }
 
-C2KText bandClassText(std::int64_t value) {
-  return textOr(bandClasses, value, badValue(value));
+FormattedText bandClassText(std::int64_t value) {
+  return textOr(bandClasses, value, badValue);
 }
 
-C2KText evdoDeviceStateText(std::int64_t value) {
-  return textOr(evdoDeviceStates, value, reserved(value));
+FormattedText evdoDeviceStateText(std::int64_t value) {
+  return textOr(evdoDeviceStates, value, reserved);
 }
 
-C2KText evdoSessionStateText(std::int64_t value) {
-  return textOr(evdoSessionStates, value, reserved(value));
+FormattedText evdoSessionStateText(std::int64_t value) {
+  return textOr(evdoSessionStates, value, reserved);
 }
 
-C2KText deviceStateText(std::int64_t value) {
-  return textOr(deviceStates, value, badValue(value));
+FormattedText deviceStateText(std::int64_t value) {
+  return textOr(deviceStates, value, badValue);
 }
 
-C2KText roamingIndicatorText(std::int64_t value) {
-  return textOr(roamingIndicators, value, C2KText("ERI - %d", static_cast<int>(value)));
+FormattedText roamingIndicatorText(std::int64_t value) {
+  return textOr(roamingIndicators, value, "ERI - %d");
 }
 
-C2KText strengthText(std::int64_t value) {
-  return C2KText("%+.2f dB", 10 * std::log10(static_cast<double>(value) / 512));
+FormattedText strengthText(std::int64_t value) {
+  return FormattedText("%+.2f dB", 10 * std::log10(static_cast<double>(value) / 512));
 }
 
 }  // namespace kelvasi

@@ -9,9 +9,10 @@
 namespace kelvasi {
 
 // At most 95 characters; longer results are cut.
-class C2KText {
+class FormattedText {
  public:
-  explicit C2KText(const char* format, ...) __attribute__((format(printf, 2, 3))) {
+  // NOLINTNEXTLINE(cert-dcl50-cpp): so that the compiler compares format and values
+  explicit FormattedText(const char* format, ...) __attribute__((format(printf, 2, 3))) {
     std::va_list arguments;
     va_start(arguments, format);
     std::vsnprintf(text_.data(), text_.size(), format, arguments);
