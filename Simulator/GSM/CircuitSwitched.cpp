@@ -94,7 +94,8 @@ void CircuitSwitched::finishPhase(const Cell* cell) {
     case Phase::connectingToUpdate:
       return enter(Phase::updating);
     case Phase::updating:
-      return finishUpdate(*cell);
+      if (cell) finishUpdate(*cell);
+      return;
     case Phase::rejected:
       return enter(Phase::limited);
     case Phase::idle:
