@@ -4,6 +4,7 @@
 
 #include "App/KelvasiApp.h"
 #include "Platform/Plist/LibplistSerialiser.h"
+#include "Platform/Posix/LargeBlocks.h"
 #include "Platform/Posix/PackageResources.h"
 #include "Platform/Posix/PosixClock.h"
 #include "Platform/Posix/PosixFiles.h"
@@ -55,6 +56,7 @@ bool run(QtApplicationFramework& framework, const Options& options) {
 }  // namespace kelvasi
 
 int main(int argumentCount, char** arguments) {
+  kelvasi::keepLargeBlocksApart();
   const kelvasi::CommandLine commandLine = kelvasi::parseCommandLine(argumentCount, arguments);
   if (!commandLine.options) return commandLine.exitStatus;
   if (!kelvasi::hasDisplay()) {
