@@ -42,7 +42,7 @@ void PcapReader::open() {
   capture_.reset(
       pcap_fopen_offline_with_tstamp_precision(stream.get(), PCAP_TSTAMP_PRECISION_NANO, error.data()));
   if (!capture_) return fail(0, error.data());
-  stream.release();  // the capture closes it from now on
+  static_cast<void>(stream.release());  // the capture closes it from now on
   const int linkType = pcap_datalink(capture_.get());
   if (linkType != DLT_USER0) fail(0, wrongLinkType(linkType));
 }
