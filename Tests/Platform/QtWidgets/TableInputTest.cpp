@@ -143,6 +143,15 @@ TEST_F(TableInputTest, ATapOpensARow) {
   EXPECT_EQ(pane.tableView().indexPathForSelectedRow(), (IndexPath{0, 2}));
 }
 
+TEST_F(TableInputTest, ASecondTapSoonAfterTheFirstOpensARowToo) {
+  const RowsController& pane = showRows(5);
+  QWidget* const viewport = tableOf(pane).viewport();
+  QTest::mouseClick(viewport, Qt::LeftButton, {}, middleOf(2));
+  QTest::mouseDClick(viewport, Qt::LeftButton, {}, middleOf(2));
+  QTest::mouseRelease(viewport, Qt::LeftButton, {}, middleOf(2));
+  EXPECT_THAT(pane.opened, ElementsAre(2, 2));
+}
+
 TEST_F(TableInputTest, ATapBelowTheLastRowOpensNone) {
   const RowsController& pane = showRows(2);
   QTest::mouseClick(tableOf(pane).viewport(), Qt::LeftButton, {}, middleOf(4));
