@@ -58,6 +58,10 @@ class Program(ViewerTest):
                 self.assertEqual(result.stderr, f"kelvasi: line 2 of the script: {why}\n")
                 self.assertEqual((result.returncode, result.stdout.count("\n")), (1, 1))
 
+    def test_the_last_line_of_a_script_counts_without_a_line_feed_too(self):
+        result = self.run_viewer("--script", "-", input="state\nstate")
+        self.assertEqual((result.returncode, result.stdout.count("\n")), (0, 2))
+
     def test_a_script_that_is_not_there_is_a_fault(self):
         result = self.run_viewer("--script", "/nowhere/script")
         self.assertEqual((result.returncode, result.stderr),
