@@ -67,6 +67,14 @@ class Program(ViewerTest):
         self.assertEqual((result.returncode, result.stderr),
                          (1, "kelvasi: /nowhere/script: No such file or directory\n"))
 
+    def test_without_a_place_for_snapshots_it_says_so(self):
+        for unset in ("HOME", "KELVASI_LOG_DIRECTORY", "XDG_STATE_HOME"):
+            self.environment.pop(unset, None)
+        result = self.run_viewer("--script", "-", input="state\n")
+        self.assertEqual((result.returncode, result.stderr),
+                         (1, "kelvasi: nowhere to save snapshots: none of KELVASI_LOG_DIRECTORY, XDG_STATE_HOME and "
+                             "HOME is set\n"))
+
     def test_a_picture_is_as_large_as_the_window_in_pixels(self):
         self.environment["QT_SCALE_FACTOR"] = "2"
         self.run_viewer("--script", "-", input=f"picture {self.path('window.png')}\n")
