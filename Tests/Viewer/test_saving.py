@@ -132,6 +132,13 @@ class Saving(ViewerTest):
         viewer.do("click Save")
         self.assertEqual((viewer.close(), viewer.said()), (0, ""))
 
+    def test_it_may_end_with_an_alert_over_the_panes(self):
+        self.environment["KELVASI_LOG_DIRECTORY"] = self.path("missing")
+        viewer = self.replay(MM_IDLE)
+        viewer.do("click Save", "click Save")
+        viewer.await_state(lambda state: state["alert"] is not None and state["saveView"] is None)
+        self.assertEqual((viewer.close(), viewer.said()), (0, ""))
+
     def assert_alert_and_life_after_it(self, viewer):
         """One alert over the panes, which go on."""
         viewer.do("press Ctrl+S", "click Save")
