@@ -76,7 +76,7 @@ void KelvasiApp::applicationWillTerminate() {
 }
 
 void KelvasiApp::showSaveView() {
-  if (saveViewController_) return;
+  if (saveViewController_ || !model_) return;
   saveViewController_ =
       std::make_unique<KelvasiSaveViewController>(platform_, *this, model_->getSaveContents());
   navController_->presentModalViewController(*saveViewController_, true);
@@ -109,6 +109,7 @@ void KelvasiApp::navigationControllerWillShowViewControllerAnimated(NavigationSt
 }
 
 void KelvasiApp::updateViewControllerFromModel() {
+  if (!model_) return;
   reloadPanes();
   if (model_->isConnected()) updateMessage_ = dateFormatter_->stringFromDate(platform_.core.clock.now());
   updateStatusForViewController(asPane(navController_->topViewController()));

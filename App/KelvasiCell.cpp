@@ -38,9 +38,9 @@ KelvasiCell::KelvasiCell(UserInterface& ui, TableView& table, StyleKey styleKey,
 KelvasiCell::KelvasiCell(UserInterface& ui, TableView& table, CellStyle style, std::string reuseIdentifier)
     : TableViewCell(table.makeCellBody(style), std::move(reuseIdentifier)),
       ui_(ui),
-      view_(ui.makeScrollView()),
       key_(makeLabel(ui, Font::boldSystem(fontSize))),
-      value_(makeLabel(ui, Font::system(fontSize))) {
+      value_(makeLabel(ui, Font::system(fontSize))),
+      view_(ui.makeScrollView()) {
   view_->addSubview(*key_);
   view_->addSubview(*value_);
   body().contentView().addSubview(*view_);

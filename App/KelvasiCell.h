@@ -34,10 +34,10 @@ class KelvasiCell : public TableViewCell {
   Size sizeOf(const Label& label) const;
 
   UserInterface& ui_;
-  // The view first: the labels in it go before it does.
-  std::unique_ptr<ScrollView> view_;
   std::unique_ptr<Label> key_;
-  std::unique_ptr<Label> value_;
+  std::unique_ptr<Label> value_;  // absent in a key cell
+  std::unique_ptr<ScrollView>
+      view_;  // holds both labels of a value cell, so that a long value can be scrolled
 };
 
 }  // namespace kelvasi

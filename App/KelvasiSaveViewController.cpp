@@ -56,6 +56,7 @@ KelvasiSaveViewController::~KelvasiSaveViewController() {
 }
 
 void KelvasiSaveViewController::viewDidLoad() {
+  takesField_ = true;
   saveDescription_->setDelegate(this);
   ViewController::viewDidLoad();
   saveContentTable_->sizeToFit();
@@ -74,8 +75,15 @@ void KelvasiSaveViewController::viewDidUnload() {
 }
 
 void KelvasiSaveViewController::setSaveContentTable(TableView& table) {
+  if (saveContentTable_) saveContentTable_->setDataSource(nullptr);
   saveContentTable_ = &table;
   table.setDataSource(this);
+}
+
+void KelvasiSaveViewController::setSaveDescription(TextField& field) {
+  if (saveDescription_) saveDescription_->setDelegate(nullptr);
+  saveDescription_ = &field;
+  if (takesField_) field.setDelegate(this);
 }
 
 void KelvasiSaveViewController::savePressed() {

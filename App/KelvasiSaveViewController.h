@@ -31,7 +31,7 @@ class KelvasiSaveViewController : public ViewController,
   TableView& saveContentTable() const { return *saveContentTable_; }
   void setSaveContentTable(TableView& table);
   TextField& saveDescription() const { return *saveDescription_; }
-  void setSaveDescription(TextField& field) { saveDescription_ = &field; }
+  void setSaveDescription(TextField& field);
 
  private:
   bool textFieldShouldReturn(TextField& textField) override;
@@ -54,6 +54,7 @@ class KelvasiSaveViewController : public ViewController,
   PlistValue saveHistory_;
   TableView* saveContentTable_ = nullptr;
   TextField* saveDescription_ = nullptr;
+  bool takesField_ = false;  // since the view was loaded this is the field's delegate
 };
 
 }  // namespace kelvasi

@@ -28,6 +28,11 @@ int openFile(const std::string& path, int flags) {
   return number;
 }
 
+bool isRegular(const FileDescriptor& file) {
+  struct stat status {};
+  return ::fstat(file.number(), &status) == 0 && S_ISREG(status.st_mode);
+}
+
 // A new file next to `path`, whose name is left in `temporary`. None, with errno set, when there cannot be
 // one.
 FileDescriptor createBeside(const std::string& path, std::string& temporary) {
@@ -77,8 +82,12 @@ FileContents readFile(const std::string& path, std::size_t limit) {
 
 FileError writeFile(const std::string& path, std::span<const std::uint8_t> bytes) {
   FileDescriptor file(openFile(path, O_WRONLY | O_CREAT | O_TRUNC));
-  if (!file || !writeAll(file.number(), bytes) || !file.close()) return lastError(path);
-  return std::nullopt;
+  if (!file) return lastError(path);
+  const bool isRemovable = isRegular(file);
+  if (writeAll(file.number(), bytes) && file.close()) return std::nullopt;
+  const std::string error = lastError(path);
+  if (isRemovable) ::unlink(path.c_str());
+  return error;
 }
 
 FileError replaceFile(const std::string& path, std::span<const std::uint8_t> bytes) {

@@ -23,7 +23,8 @@ struct FileContents {
 // Reads to the end of the file, which may be a pipe. A file of more than `limit` bytes is an error.
 FileContents readFile(const std::string& path, std::size_t limit = std::numeric_limits<std::size_t>::max());
 
-// Creates the file or overwrites what is there. After an error a part may have been written.
+// Creates the file or overwrites what is there, straight at its path. After an error while writing a regular
+// file is removed.
 FileError writeFile(const std::string& path, std::span<const std::uint8_t> bytes);
 
 // Puts a file in the place of the one of that name, if any, whose permissions it takes over. The name always

@@ -1,7 +1,6 @@
 #include "Platform/QtDesktop/QtPreferences.h"
 
 #include <QDBusMessage>
-#include <QSettings>
 #include <QStandardPaths>
 #include <array>
 
@@ -36,6 +35,7 @@ QString QtPreferences::fileOf(std::string_view domain) const {
   return directory_ + QLatin1Char('/') + text(domain) + QStringLiteral(".ini");
 }
 
+// Settings of one file share what was set in any of them and is not written yet.
 std::optional<bool> QtPreferences::boolean(std::string_view domain, std::string_view key) const {
   const QString value = QSettings(fileOf(domain), QSettings::IniFormat).value(text(key)).toString();
   for (const Word& word : words) {
@@ -44,13 +44,17 @@ std::optional<bool> QtPreferences::boolean(std::string_view domain, std::string_
   return std::nullopt;
 }
 
-// Objects of one file share what is set until it is written.
 void QtPreferences::setBoolean(std::string_view domain, std::string_view key, bool value) {
-  QSettings(fileOf(domain), QSettings::IniFormat).setValue(text(key), value);
+  const auto settings =
+      unwritten_.try_emplace(std::string(domain), fileOf(domain), QSettings::IniFormat).first;
+  settings->second.setValue(text(key), value);
 }
 
 void QtPreferences::flush(std::string_view domain) {
-  QSettings(fileOf(domain), QSettings::IniFormat).sync();
+  const auto settings = unwritten_.find(domain);
+  if (settings == unwritten_.end()) return;
+  settings->second.sync();
+  unwritten_.erase(settings);
 }
 
 void QtPreferences::postChangeNotice(std::string_view domain, std::string_view key) {

@@ -2,7 +2,11 @@
 // both are described in Docs/preferences.md.
 #pragma once
 
+#include <QSettings>
 #include <QString>
+#include <functional>
+#include <map>
+#include <string>
 
 #include "Platform/Preferences.h"
 
@@ -25,6 +29,7 @@ class QtPreferences : public Preferences {
   QString fileOf(std::string_view domain) const;
 
   QString directory_;
+  std::map<std::string, QSettings, std::less<>> unwritten_;  // what was set, by domain
 };
 
 }  // namespace kelvasi

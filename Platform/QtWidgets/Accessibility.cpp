@@ -17,13 +17,15 @@ TableWidget& tableOf(const CellWidget& cell) {
   return dynamic_cast<TableWidget&>(*cell.parentWidget()->parentWidget());
 }
 
-// A row: its texts as its name; pressing it opens it.
+// A row: its texts as its name, and whether it opens as its description; pressing it is a tap on it.
 class RowInterface : public QAccessibleWidget {
  public:
   explicit RowInterface(CellWidget& cell) : QAccessibleWidget(&cell, QAccessible::ListItem), cell_(cell) {}
 
   QString text(QAccessible::Text text) const override {
-    return text == QAccessible::Name ? cell_.spokenText() : QAccessibleWidget::text(text);
+    if (text == QAccessible::Name) return cell_.spokenText();
+    if (text == QAccessible::Description && cell_.opens()) return TableWidget::tr("Opens");
+    return QAccessibleWidget::text(text);
   }
   QAccessible::State state() const override {
     QAccessible::State state = QAccessibleWidget::state();

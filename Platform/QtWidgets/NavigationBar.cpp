@@ -26,13 +26,14 @@ NavigationBar::NavigationBar(QWidget* parent, std::function<void()> goBack)
   connect(back_, &QAbstractButton::clicked, this, [goBack = std::move(goBack)] { goBack(); });
 }
 
-void NavigationBar::show(const QString& title, const QString& back) {
-  if (title_ == title && back_->text() == back) return;
+void NavigationBar::show(const QString& title, const std::optional<QString>& back) {
+  const QString below = back.value_or(QString());
+  if (title_ == title && back_->text() == below && back_->isHidden() == !back) return;
   title_ = title;
   setAccessibleName(title);
-  back_->setVisible(!back.isEmpty());
-  back_->setText(back);
-  back_->setAccessibleName(tr("Back to %1").arg(back));
+  back_->setVisible(back.has_value());
+  back_->setText(below);
+  back_->setAccessibleName(below.isEmpty() ? tr("Back") : tr("Back to %1").arg(below));
   placeBackButton();
   update();
 }

@@ -4,6 +4,7 @@
 #include <QString>
 #include <QWidget>
 #include <functional>
+#include <optional>
 
 namespace kelvasi {
 
@@ -13,8 +14,8 @@ class NavigationBar : public QWidget {
  public:
   NavigationBar(QWidget* parent, std::function<void()> goBack);
 
-  // `back` names the pane below; empty where there is none.
-  void show(const QString& title, const QString& back);
+  // `back` is the title of the pane below, which may be empty; none without such a pane.
+  void show(const QString& title, const std::optional<QString>& back);
   const QString& title() const { return title_; }
   const BarButton& backButton() const { return *back_; }
 

@@ -1,5 +1,7 @@
 #include "Platform/QtWidgets/QtNavigationStack.h"
 
+#include <algorithm>
+
 #include "Platform/QtWidgets/AlertLayer.h"
 #include "Platform/QtWidgets/ModalLayer.h"
 #include "Platform/QtWidgets/NavigationBar.h"
@@ -21,6 +23,14 @@ void raiseAlerts(const QWidget& window) {
   for (QObject* const child : window.children()) {
     if (auto* const alert = dynamic_cast<AlertLayer*>(child)) alert->raise();
   }
+}
+
+// Whether a view or an alert lies over the panes; it then has the keyboard.
+bool isCovered(const QWidget& window) {
+  return std::ranges::any_of(window.children(), [](QObject* child) {
+    const auto* const layer = dynamic_cast<Layer*>(child);
+    return layer && !layer->isHidden();
+  });
 }
 
 }  // namespace
@@ -66,7 +76,7 @@ void QtNavigationStack::swapPage() {
   });
   widget_->showPage(page.widget());
   showBars();
-  if (!modalViewController()) page.firstFocus().setFocus();
+  if (!isCovered(*widget_->window())) page.firstFocus().setFocus();
 }
 
 void QtNavigationStack::showBars() {
@@ -74,9 +84,10 @@ void QtNavigationStack::showBars() {
   widget_->toolbar().setItems(shown_->toolbarItems());
 }
 
-QString QtNavigationStack::backTitle() const {
+std::optional<QString> QtNavigationStack::backTitle() const {
   const auto& controllers = viewControllers();
-  return controllers.size() < 2 ? QString() : pageOf(*controllers[controllers.size() - 2]).title();
+  if (controllers.size() < 2) return std::nullopt;
+  return pageOf(*controllers[controllers.size() - 2]).title();
 }
 
 void QtNavigationStack::showModal(ViewController& controller, bool animated) {

@@ -1,7 +1,9 @@
 // The stack of panes with the bars above and below it, and the view that may lie over it.
 #pragma once
 
+#include <QString>
 #include <memory>
+#include <optional>
 
 #include "Platform/QtWidgets/WidgetView.h"
 #include "Platform/UserInterface/NavigationStack.h"
@@ -27,7 +29,8 @@ class QtNavigationStack : public NavigationStack {
   void hideModal(ViewController& controller, bool animated) override;
   void swapPage();
   void showBars();
-  QString backTitle() const;
+  // The title of the pane below, which may be empty; none at the root.
+  std::optional<QString> backTitle() const;
 
   bool animates_;
   std::unique_ptr<StackWidget> widget_;

@@ -2,13 +2,22 @@
 
 #include <QGuiApplication>
 #include <QInputMethod>
+#include <QKeyEvent>
 
 namespace kelvasi {
 
 QtTextField::QtTextField(QLineEdit& edit) : edit_(edit) {
-  QObject::connect(&edit, &QLineEdit::returnPressed, &edit, [this] {
-    if (delegate_) delegate_->textFieldShouldReturn(*this);
-  });
+  edit.installEventFilter(this);
+}
+
+// The return key is the field's own only where the delegate lets it have it.
+bool QtTextField::eventFilter(QObject* watched, QEvent* event) {
+  if (event->type() == QEvent::KeyPress && delegate_) {
+    const int key = dynamic_cast<QKeyEvent&>(*event).key();
+    const bool isReturn = key == Qt::Key_Return || key == Qt::Key_Enter;
+    if (isReturn && !delegate_->textFieldShouldReturn(*this)) return true;
+  }
+  return QObject::eventFilter(watched, event);
 }
 
 Rect QtTextField::bounds() const {

@@ -8,7 +8,7 @@
 
 namespace kelvasi {
 
-class QtTextField : public TextField, public HasWidget {
+class QtTextField : public QObject, public TextField, public HasWidget {
  public:
   explicit QtTextField(QLineEdit& edit);
 
@@ -19,6 +19,9 @@ class QtTextField : public TextField, public HasWidget {
   // The keyboard then works the form around the field.
   void resignFirstResponder() override;
   QWidget& widget() override { return edit_; }
+
+ protected:
+  bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
   QLineEdit& edit_;

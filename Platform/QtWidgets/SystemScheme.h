@@ -1,12 +1,13 @@
 // Whether the desktop is light or dark, and when that changes.
 #pragma once
 
+// Whole, so that the meta-object knows the type: the bus connects no slot without it.
+#include <QDBusVariant>
 #include <QObject>
 #include <functional>
 
 #include "Platform/QtWidgets/Palettes.h"
 
-class QDBusVariant;
 class QVariant;
 
 namespace kelvasi {

@@ -143,6 +143,7 @@ std::optional<IndexPath> TableWidget::indexPathForSelectedRow() const {
 
 void TableWidget::deselectRowAtIndexPath(const IndexPath& indexPath, bool animated) {
   if (selected_ != indexPath.row) return;
+  fade_.stop();
   fading_ = *selected_;
   selected_.reset();
   if (animated) fade_.start();

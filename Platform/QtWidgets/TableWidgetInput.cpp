@@ -74,6 +74,11 @@ void TableWidget::mousePressEvent(QMouseEvent* event) {
   press(rowAt(event->position()));
 }
 
+// The press of a second tap that comes soon after the first.
+void TableWidget::mouseDoubleClickEvent(QMouseEvent* event) {
+  mousePressEvent(event);
+}
+
 void TableWidget::mouseMoveEvent(QMouseEvent* event) {
   if (pressed_ && rowAt(event->position()) != pressed_) press(std::nullopt);
 }

@@ -91,8 +91,10 @@ TEST_F(KelvasiAppTest, EveryPaneOfTheStackIsReloadedButOnlyTheTopOneGetsTheStatu
   openContext();
   surroundings.clock.time.secondsSince1970 += 60;
   const int rootReloads = ui.pane(0).tableView().reloads;
+  const int listReloads = ui.pane(1).tableView().reloads;
   showList(contexts("10.0.0.2"));
   EXPECT_EQ(ui.pane(0).tableView().reloads, rootReloads + 1);
+  EXPECT_EQ(ui.pane(1).tableView().reloads, listReloads + 1);
   EXPECT_EQ(firstCell(ui.pane(2)).value()->text(), "10.0.0.2");
   EXPECT_EQ(ui.pane(0).label().text, updated);
   EXPECT_EQ(ui.pane(1).label().text, updated);
@@ -104,8 +106,12 @@ TEST_F(KelvasiAppTest, EveryPaneOfTheStackIsReloadedButOnlyTheTopOneGetsTheStatu
 TEST_F(KelvasiAppTest, APaneWhoseBranchIsGonePopsToItsParentWhichWasReloaded) {
   launch();
   openContext();
+  const int rootReloads = ui.pane(0).tableView().reloads;
+  const int parentReloads = ui.pane(1).tableView().reloads;
   showList(PlistArray::make());
   EXPECT_EQ(depth(), 2U);
+  EXPECT_EQ(ui.pane(0).tableView().reloads, rootReloads + 1);
+  EXPECT_EQ(ui.pane(1).tableView().reloads, parentReloads + 1);
   EXPECT_EQ(ui.topPane().title, "PDP Context Info");
   EXPECT_EQ(ui.topPane().tableView().rows(), 0U);
   EXPECT_EQ(ui.journal.back(), "pop PDP Context Info (animated)");
@@ -117,8 +123,12 @@ TEST_F(KelvasiAppTest, PanesAboveTheOneThatIsGoneGoTooAndAreNotReloaded) {
   showList(deep);
   for (const std::size_t row : {listRow(), std::size_t{0}, std::size_t{0}}) ui.topPane().tableView().tap(row);
   ASSERT_EQ(depth(), 4U);
+  std::vector<std::size_t> reloaded;
+  for (std::size_t place = 0; place < depth(); ++place)
+    ui.pane(place).tableView().reloaded = [&reloaded, place] { reloaded.push_back(place); };
   showList(PlistArray::make());
   EXPECT_EQ(depth(), 2U);
+  EXPECT_THAT(reloaded, ElementsAre(0, 1));
 }
 
 TEST_F(KelvasiAppTest, ABranchThatBecameALeafStaysOpenWithoutRows) {
@@ -135,9 +145,14 @@ TEST_F(KelvasiAppTest, WhileDisconnectedARefreshReloadsAllPanesAndSaysConnecting
   receiveList(contexts("10.0.0.9"));
   *link.remoteValid = false;
   link.daemonIsThere = false;
+  std::vector<int> reloads;
+  for (std::size_t place = 0; place < depth(); ++place)
+    reloads.push_back(ui.pane(place).tableView().reloads + 1);
   tick();
   EXPECT_EQ(status(), "Connecting...");
   EXPECT_TRUE(isLoading());
+  for (std::size_t place = 0; place < depth(); ++place)
+    EXPECT_EQ(ui.pane(place).tableView().reloads, reloads.at(place)) << place;
   EXPECT_EQ(firstCell(ui.pane(2)).value()->text(), "10.0.0.9");
   EXPECT_EQ(application.updateMessage(), updated);
 }
@@ -194,13 +209,25 @@ TEST_F(KelvasiAppTest, ClosingTheSaveViewDismissesAndReleasesIt) {
   EXPECT_EQ(ui.journal.back(), "dismiss (animated)");
 }
 
-TEST_F(KelvasiAppTest, DataThatArrivesWhileTheSaveViewIsOpenIsNotSaved) {
+// Only the lists are copied: the displays in them are those that go on being shown.
+TEST_F(KelvasiAppTest, DataThatArrivesWhileTheSaveViewIsOpenChangesNeitherEntriesNorRawMessagesNorDLF) {
   launch();
   showList(PlistArray::make());
   application.showSaveView();
+  ui.interface->use("savePressed");
+  const PlistArray& before = *plists.last.dictionary()->get("Data").array();
+  ASSERT_EQ(before.size(), 2U);  // one interval and its raw records
+  const Bytes messages = *before.at(0).dictionary()->get("DisplayState").data();
+  const Bytes dlf = *before.at(1).dictionary()->get("DLF").data();
+  EXPECT_FALSE(messages.empty());
+  queue.runPosted();
+  application.showSaveView();
   showList(PlistArray::make({"later"}));
   ui.interface->use("savePressed");
-  EXPECT_EQ(plists.last.dictionary()->get("Data").array()->size(), 2U);  // one interval and its raw records
+  const PlistArray& after = *plists.last.dictionary()->get("Data").array();
+  ASSERT_EQ(after.size(), 2U);
+  EXPECT_EQ(*after.at(0).dictionary()->get("DisplayState").data(), messages);
+  EXPECT_EQ(*after.at(1).dictionary()->get("DLF").data(), dlf);
 }
 
 TEST_F(KelvasiAppTest, WithoutAGeneratorOnlyTheTimestampIsSaved) {

@@ -211,6 +211,36 @@ TEST_F(KelvasiSaveViewControllerTest, TheTableAndTheFieldCanBeReplaced) {
   EXPECT_FALSE(table.hasSource());
 }
 
+TEST_F(KelvasiSaveViewControllerTest, ATableOrFieldThatIsReplacedAsksNoMore) {
+  open(PlistArray::make({entry("first")}));
+  test::MemoryTable table;
+  test::MemoryTextField otherField;
+  controller->setSaveContentTable(table);
+  controller->setSaveDescription(otherField);
+  EXPECT_FALSE(interface().table.hasSource());
+  EXPECT_EQ(field().delegate, nullptr);
+  controller.reset();
+}
+
+TEST_F(KelvasiSaveViewControllerTest, ATableOrFieldThatIsPutInItsOwnPlaceGoesOnAsking) {
+  open(PlistArray::make({entry("first")}));
+  controller->setSaveContentTable(interface().table);
+  controller->setSaveDescription(field());
+  EXPECT_TRUE(interface().table.hasSource());
+  EXPECT_NE(field().delegate, nullptr);
+}
+
+TEST_F(KelvasiSaveViewControllerTest, AFieldThatReplacesOneAfterLoadingAsksItsReturnKeyHere) {
+  open(PlistArray::make());
+  test::MemoryTextField otherField;
+  controller->setSaveDescription(otherField);
+  ASSERT_NE(otherField.delegate, nullptr);
+  EXPECT_TRUE(otherField.pressReturn());
+  EXPECT_FALSE(otherField.hasKeyboard);
+  controller.reset();
+  EXPECT_EQ(otherField.delegate, nullptr);
+}
+
 TEST_F(KelvasiSaveViewControllerTest, AMissingInterfaceResourceIsAnError) {
   ui.resource = "another";
   EXPECT_THROW(open(PlistValue()), std::runtime_error);

@@ -72,6 +72,16 @@ TEST_F(PreferencesTest, TheCleanUpLeavesAloneADisplayThatThisRunDidNotSwitch) {
   EXPECT_THAT(preferences.journal, IsEmpty());
 }
 
+TEST_F(PreferencesTest, AfterTheCleanUpThereIsNothingToRefreshOrToSave) {
+  launch();
+  application.applicationWillTerminate();
+  const auto journal = ui.journal;
+  application.updateViewControllerFromModel();
+  application.showSaveView();
+  EXPECT_EQ(application.saveViewController(), nullptr);
+  EXPECT_EQ(ui.journal, journal);
+}
+
 TEST_F(PreferencesTest, AnEndBeforeTheFirstConnectionConnectsNoMore) {
   application.applicationDidFinishLaunching(application);
   application.applicationWillTerminate();

@@ -103,6 +103,23 @@ class Demo(LiveTest):
         os.kill(self.viewer(), signal.SIGTERM)
         self.check_ended(demo, errors="")
 
+    def test_full_screen_is_handed_on_to_the_window(self):
+        self.environment |= {"DISPLAY": ":nowhere", "QT_QPA_PLATFORM": "offscreen"}
+        demo = self.start_demo("--seconds", "1000", "--fullscreen")
+        for _ in range(3):
+            demo.stdout.readline()
+        arguments = pathlib.Path(f"/proc/{self.viewer()}/cmdline").read_bytes().split(b"\0")
+        self.assertEqual(arguments[1:-1], [b"--fullscreen"])
+        demo.terminate()
+        self.check_ended(demo, errors="")
+
+    def test_help_names_the_options(self):
+        help = self.start_demo("--help").communicate(timeout=PATIENCE)[0].decode()
+        self.assertTrue(help.startswith("Sets up, builds"), help)
+        for option in ("--technology", "--seconds", "--fullscreen"):
+            self.assertIn(option, help)
+        self.assertNotIn("set -euo", help)
+
     def viewer(self):
         """The process of the viewer that the demo started."""
         for process in self.rest():

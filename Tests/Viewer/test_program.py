@@ -58,10 +58,22 @@ class Program(ViewerTest):
                 self.assertEqual(result.stderr, f"kelvasi: line 2 of the script: {why}\n")
                 self.assertEqual((result.returncode, result.stdout.count("\n")), (1, 1))
 
+    def test_the_last_line_of_a_script_counts_without_a_line_feed_too(self):
+        result = self.run_viewer("--script", "-", input="state\nstate")
+        self.assertEqual((result.returncode, result.stdout.count("\n")), (0, 2))
+
     def test_a_script_that_is_not_there_is_a_fault(self):
         result = self.run_viewer("--script", "/nowhere/script")
         self.assertEqual((result.returncode, result.stderr),
                          (1, "kelvasi: /nowhere/script: No such file or directory\n"))
+
+    def test_without_a_place_for_snapshots_it_says_so(self):
+        for unset in ("HOME", "KELVASI_LOG_DIRECTORY", "XDG_STATE_HOME"):
+            self.environment.pop(unset, None)
+        result = self.run_viewer("--script", "-", input="state\n")
+        self.assertEqual((result.returncode, result.stderr),
+                         (1, "kelvasi: nowhere to save snapshots: none of KELVASI_LOG_DIRECTORY, XDG_STATE_HOME and "
+                             "HOME is set\n"))
 
     def test_a_picture_is_as_large_as_the_window_in_pixels(self):
         self.environment["QT_SCALE_FACTOR"] = "2"

@@ -11,7 +11,7 @@ import time
 import unittest
 
 from support import GMM_REGISTERED, MM_IDLE, pcap
-from viewer_support import ViewerTest
+from viewer_support import COPY, ViewerTest
 
 ALERT = {"title": "File Error", "message": "Unable to write file to disk", "button": "Close"}
 BUILD_TEXT = re.compile(rb"[A-Z][a-z]{2} [ \d]\d \d{4} \d\d:\d\d")
@@ -132,6 +132,13 @@ class Saving(ViewerTest):
         viewer.do("click Save")
         self.assertEqual((viewer.close(), viewer.said()), (0, ""))
 
+    def test_it_may_end_with_an_alert_over_the_panes(self):
+        self.environment["KELVASI_LOG_DIRECTORY"] = self.path("missing")
+        viewer = self.replay(MM_IDLE)
+        viewer.do("click Save", "click Save")
+        viewer.await_state(lambda state: state["alert"] is not None and state["saveView"] is None)
+        self.assertEqual((viewer.close(), viewer.said()), (0, ""))
+
     def assert_alert_and_life_after_it(self, viewer):
         """One alert over the panes, which go on."""
         viewer.do("press Ctrl+S", "click Save")
@@ -149,9 +156,31 @@ class Saving(ViewerTest):
         self.assert_alert_and_life_after_it(self.start_world("--scenario", "drive"))
         self.assertFalse(os.path.exists(self.path("missing")))
 
-    def test_a_directory_that_cannot_be_written_gives_one_alert(self):
-        self.environment["KELVASI_LOG_DIRECTORY"] = "/proc/self"  # not even root can
-        self.assert_alert_and_life_after_it(self.start_world("--scenario", "drive"))
+    def start_copy(self):
+        return self.start_viewer(program=COPY, cwd=self.directory.name)
+
+    def test_a_directory_that_cannot_be_written_gives_one_line_and_one_alert(self):
+        self.environment |= {"KELVASI_LOG_DIRECTORY": "/proc/self", "KELVASI_LOG_LEVEL": "err"}  # not even root can
+        self.write("internal-install", b"")
+        self.start_daemon("--scenario", "drive")
+        viewer = self.start_copy()
+        viewer.await_updated()
+        self.assert_alert_and_life_after_it(viewer)
+        viewer.close()
+        lines = [line for line in viewer.said().splitlines() if "snapshot" in line.lower()]
+        self.assertEqual(len(lines), 1, lines)
+        self.assertRegex(lines[0], r"^<3>Unable to write snapshot to /proc/self/KelvasiSnapshot-\d+\.kelvasi$")
+
+    def test_without_the_marker_there_is_nothing_to_save_with(self):
+        self.start_daemon("--scenario", "drive")
+        viewer = self.start_copy()
+        self.assertEqual(viewer.await_updated()["buttons"], [])
+        viewer.do("press Ctrl+S")
+        self.assertIsNone(viewer.state()["saveView"])
+
+    def test_with_the_marker_there_is_a_save_button(self):
+        self.write("internal-install", b"")
+        self.assertEqual(self.start_copy().state()["buttons"], ["Save"])
 
     def test_a_full_disk_gives_one_alert(self):
         self.start_daemon("--scenario", "drive")

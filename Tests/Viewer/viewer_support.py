@@ -10,17 +10,18 @@ from live_support import PATIENCE, LiveTest
 from support import TEMPLATES
 
 VIEWER = os.environ["KELVASI"]
+COPY = os.environ["KELVASI_COPY"]  # its marker is a file in its working directory, its log the standard error
 SCREEN = json.dumps({"screens": [{"name": "desk", "x": 0, "y": 0, "width": 2560, "height": 2048}]}).encode()
 
 
 class Viewer:
     """A running viewer. Commands are done one after the other; state() waits for those before it."""
 
-    def __init__(self, test, environment, **options):
+    def __init__(self, test, environment, program=VIEWER, **options):
         self.test = test
         self.errors = open(test.path("viewer-errors"), "wb")
         test.addCleanup(self.errors.close)
-        self.process = test.start([VIEWER, "--script", "-"], env=environment, stdin=subprocess.PIPE,
+        self.process = test.start([program, "--script", "-"], env=environment, stdin=subprocess.PIPE,
                                   stderr=self.errors, **options)
         test.addCleanup(self.process.stdin.close)
 

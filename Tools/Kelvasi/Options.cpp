@@ -4,6 +4,7 @@
 #include <cstdlib>
 #include <filesystem>
 #include <map>
+#include <stdexcept>
 
 namespace kelvasi {
 
@@ -53,13 +54,16 @@ bool hasDisplay() {
   return isSet("QT_QPA_PLATFORM") || isSet("WAYLAND_DISPLAY") || isSet("DISPLAY");
 }
 
-std::string logDirectory() {
+std::string makeLogDirectory() {
   const std::string configured = environment("KELVASI_LOG_DIRECTORY");
   if (!configured.empty()) return configured;
   const std::string state = environment("XDG_STATE_HOME");
-  const std::filesystem::path directory =
-      state.empty() ? std::filesystem::path(environment("HOME")) / ".local/state/kelvasi"
-                    : std::filesystem::path(state) / "kelvasi";
+  const std::string home = environment("HOME");
+  if (state.empty() && home.empty())
+    throw std::runtime_error(
+        "nowhere to save snapshots: none of KELVASI_LOG_DIRECTORY, XDG_STATE_HOME and HOME is set");
+  const std::filesystem::path directory = state.empty() ? std::filesystem::path(home) / ".local/state/kelvasi"
+                                                        : std::filesystem::path(state) / "kelvasi";
   std::error_code fault;  // told when a snapshot is saved
   std::filesystem::create_directories(directory, fault);
   return directory;

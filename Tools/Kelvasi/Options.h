@@ -26,7 +26,7 @@ CommandLine parseCommandLine(int argumentCount, const char* const* arguments);
 bool hasDisplay();
 
 // Where snapshots go: $KELVASI_LOG_DIRECTORY; else kelvasi in $XDG_STATE_HOME or ~/.local/state, which is
-// made.
-std::string logDirectory();
+// made. Throws std::runtime_error when none of the variables says where.
+std::string makeLogDirectory();
 
 }  // namespace kelvasi

@@ -50,6 +50,7 @@ void Script::readMore() {
 }
 
 bool Script::takeLine() {
+  if (isAtEnd_ && !unread_.isEmpty() && !unread_.endsWith('\n')) unread_.append('\n');
   const qsizetype end = unread_.indexOf('\n');
   if (end < 0) {
     if (isAtEnd_) this->end();

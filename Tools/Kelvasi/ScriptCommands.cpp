@@ -132,7 +132,7 @@ ScriptStep goBack(const QString&) {
 
 ScriptStep goToRoot(const QString&) {
   return [] {
-    if (shownState()["back"].toString().isEmpty()) return done();
+    if (isAtRoot()) return done();
     press(Qt::Key_Escape);
     return notYet();
   };

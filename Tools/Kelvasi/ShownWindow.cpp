@@ -147,6 +147,10 @@ QJsonObject shownState() {
           {"alert", alertState()}};
 }
 
+bool isAtRoot() {
+  return findInWindow<NavigationBar>()->backButton().isHidden();
+}
+
 bool showsWideValue() {
   return wideCell() != nullptr;
 }

@@ -17,6 +17,8 @@ bool isWindowStill();
 // "alert" (both null where there is none). A row is the list of its texts; only rows in sight are listed.
 QJsonObject shownState();
 QString shownStatus();
+// Whether there is no way back.
+bool isAtRoot();
 
 // The table of the top pane, or of the save view where it is open.
 TableWidget* shownTable();

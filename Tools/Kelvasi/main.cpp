@@ -1,6 +1,6 @@
 // kelvasi: wires the viewer to its surroundings.
 #include <cstdio>
-#include <system_error>
+#include <stdexcept>
 
 #include "App/KelvasiApp.h"
 #include "Platform/Plist/LibplistSerialiser.h"
@@ -40,11 +40,11 @@ bool run(QtApplicationFramework& framework, const Options& options) {
   QtPreferences preferences;
   const QtDateFormatters dateFormatters;
   PosixFiles files;
-  const AppPlatform platform{
-      .core = {log, trace, plists, resources, clock},
-      .link = {queue, ports, daemon},
-      .shell = {ui, preferences, dateFormatters, files},
-      .paths = {.logDirectory = logDirectory(), .internalInstallMarker = KELVASI_INTERNAL_INSTALL_MARKER}};
+  const AppPlatform platform{.core = {log, trace, plists, resources, clock},
+                             .link = {queue, ports, daemon},
+                             .shell = {ui, preferences, dateFormatters, files},
+                             .paths = {.logDirectory = makeLogDirectory(),
+                                       .internalInstallMarker = KELVASI_INTERNAL_INSTALL_MARKER}};
   const ApplicationClasses classes{{"KelvasiApp", [&] { return std::make_unique<KelvasiApp>(platform); }}};
   const Script script(options.script);
   framework.run(classes, "KelvasiApp", "KelvasiApp");
@@ -67,7 +67,7 @@ int main(int argumentCount, char** arguments) {
   kelvasi::QtApplicationFramework framework(own, arguments);
   try {
     return kelvasi::run(framework, *commandLine.options) ? 0 : 1;
-  } catch (const std::system_error& fault) {
+  } catch (const std::runtime_error& fault) {
     std::fprintf(stderr, "kelvasi: %s\n", fault.what());
     return 1;
   }

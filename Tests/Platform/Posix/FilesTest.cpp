@@ -17,6 +17,7 @@ namespace kelvasi {
 namespace {
 
 using ::testing::ElementsAre;
+using ::testing::IsEmpty;
 using testing::TemporaryDirectory;
 
 Bytes manyBytes(std::size_t count) {
@@ -84,9 +85,23 @@ TEST_F(FilesTest, ReadsUpToTheLimit) {
   EXPECT_EQ(readFile(path, 99).bytes, Bytes());
 }
 
-TEST_F(FilesTest, AWriteCutShortIsAnError) {
+TEST_F(FilesTest, AWriteCutShortIsAnErrorAndLeavesNothing) {
   const FileSizeLimit limit(1000);
   EXPECT_EQ(writeFile(path, manyBytes(2000)), path + ": File too large");
+  EXPECT_THAT(namesIn(directory), IsEmpty());
+}
+
+TEST_F(FilesTest, AWriteOverAFileThatIsCutShortLeavesNeither) {
+  writeFile(path, manyBytes(10));
+  const FileSizeLimit limit(1000);
+  EXPECT_EQ(writeFile(path, manyBytes(2000)), path + ": File too large");
+  EXPECT_THAT(namesIn(directory), IsEmpty());
+}
+
+TEST_F(FilesTest, WhatIsNoRegularFileStaysAfterAnError) {
+  ASSERT_EQ(::symlink("/dev/full", path.c_str()), 0);
+  EXPECT_EQ(writeFile(path, Bytes{1}), path + ": No space left on device");
+  EXPECT_THAT(namesIn(directory), ElementsAre("file"));
 }
 
 TEST_F(FilesTest, SignalsNeitherCutAWriteShortNorFailIt) {

@@ -55,6 +55,8 @@ TEST_F(QtPreferencesTest, ReadsWhatAUserWrites) {
 
 TEST_F(QtPreferencesTest, FlushingWritesTheFileOfTheDomainAndNoOther) {
   preferences.setBoolean(shell, key, true);
+  preferences.setBoolean(own, key, true);
+  EXPECT_EQ(read(shell), "(no file)");
   preferences.flush(shell);
   EXPECT_EQ(read(shell), "[General]\nHomerailShowGSMRSSI=true\n");
   EXPECT_EQ(read(own), "(no file)");

@@ -56,6 +56,16 @@ TEST_F(AccessibilityTest, ACheckedRowAndTheRowOfTheKeyboardSaySo) {
   EXPECT_TRUE(second.focused);
 }
 
+TEST_F(AccessibilityTest, ARowThatOpensSaysSoAndALeafDoesNot) {
+  const RowsController& pane = showRows(2, [](std::size_t row) {
+    return RowContents{.text = "Name",
+                       .accessory = row == 0 ? CellAccessory::disclosureIndicator : CellAccessory::none};
+  });
+  EXPECT_EQ(of(tableOf(pane).cellAt(0)).text(QAccessible::Description), "Opens");
+  EXPECT_EQ(of(tableOf(pane).cellAt(1)).text(QAccessible::Description), "");
+  EXPECT_EQ(nameOf(tableOf(pane).cellAt(0)), nameOf(tableOf(pane).cellAt(1)));
+}
+
 TEST_F(AccessibilityTest, BarsNameTheirTitleAndButtons) {
   RowsController& root = showRows(1);
   root.setToolbarItems({ActivitySpinner{.isAnimating = true}, SaveButton{[] {}}}, true);

@@ -39,6 +39,16 @@ TEST_F(NavigationTest, APushedPaneHasItsTitleAndABackButtonNamedAfterTheOneBelow
   EXPECT_EQ(bar().backButton().text(), "Root");
 }
 
+TEST_F(NavigationTest, APaneOverOneWithoutATitleHasABackButtonToo) {
+  showRows(3).setTitle("");
+  push(3, "");
+  EXPECT_TRUE(bar().backButton().isVisible());
+  EXPECT_EQ(bar().backButton().accessibleName(), "Back");
+  QTest::mouseClick(the<BarButton>(), Qt::LeftButton);
+  EXPECT_EQ(stack->viewControllers().size(), 1U);
+  EXPECT_TRUE(bar().backButton().isHidden());
+}
+
 TEST_F(NavigationTest, OnlyTheTopPaneIsSeenAndItFillsTheRoomBetweenTheBars) {
   const RowsController& root = showRows(3);
   const RowsController& next = push(3, "Next");

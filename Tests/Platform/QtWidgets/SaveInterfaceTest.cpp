@@ -1,6 +1,7 @@
 // The interface resource of the save view, the view over the panes, and alerts over both.
 #include <QLineEdit>
 #include <QPointer>
+#include <QSignalSpy>
 
 #include "Platform/QtWidgets/AlertLayer.h"
 #include "Platform/QtWidgets/BarButton.h"
@@ -11,6 +12,7 @@
 namespace kelvasi {
 namespace {
 
+using test::RowsController;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
@@ -28,10 +30,11 @@ class Form : public ViewController, public TextFieldDelegate {
   ~Form() override { field().setDelegate(nullptr); }
   bool textFieldShouldReturn(TextField&) override {
     used.emplace_back("return");
-    return true;
+    return letsFieldReturn;
   }
   TextField& field() const { return *static_cast<InterfaceBody&>(body()).textField("saveDescription"); }
   std::vector<std::string> used;
+  bool letsFieldReturn = true;
 };
 
 class SaveInterfaceTest : public test::QtFixture {
@@ -109,6 +112,26 @@ TEST_F(SaveInterfaceTest, ReturnAsksTheDelegate) {
   const Form& shown = present();
   key(Qt::Key_Return);
   EXPECT_THAT(shown.used, ElementsAre("return"));
+}
+
+TEST_F(SaveInterfaceTest, TheDelegatesAnswerDecidesWhetherTheFieldHandlesReturn) {
+  Form& shown = present();
+  const QSignalSpy handled(&edit(), &QLineEdit::returnPressed);
+  shown.letsFieldReturn = false;
+  key(Qt::Key_Return);
+  EXPECT_EQ(handled.count(), 0);
+  shown.letsFieldReturn = true;
+  key(Qt::Key_Enter);
+  EXPECT_EQ(handled.count(), 1);
+  EXPECT_THAT(shown.used, ElementsAre("return", "return"));
+}
+
+TEST_F(SaveInterfaceTest, WithoutADelegateTheFieldHandlesReturn) {
+  Form& shown = present();
+  const QSignalSpy handled(&edit(), &QLineEdit::returnPressed);
+  shown.field().setDelegate(nullptr);
+  key(Qt::Key_Return);
+  EXPECT_EQ(handled.count(), 1);
 }
 
 TEST_F(SaveInterfaceTest, AFieldGivesUpTheKeyboard) {
@@ -226,6 +249,22 @@ TEST_F(AlertTest, NothingBeneathIsReachedByKeyboardOrMouse) {
   EXPECT_TRUE(button("Close")->hasFocus());
   QTest::mouseClick(QApplication::widgetAt(windowWidget().mapToGlobal(QPoint(100, 70))), Qt::LeftButton);
   EXPECT_THAT(pane.opened, IsEmpty());
+}
+
+TEST_F(AlertTest, KeepsTheKeyboardWhileThePaneBelowItGoesAndComes) {
+  showRows(3);
+  push(3, "Next");
+  alert();
+  stack->popViewController(true);
+  settle();
+  EXPECT_TRUE(button("Close")->hasFocus());
+  push(3, "Another");
+  EXPECT_TRUE(button("Close")->hasFocus());
+  key(Qt::Key_Return);
+  settle();
+  EXPECT_EQ(the<AlertLayer>(), nullptr);
+  EXPECT_EQ(stack->viewControllers().size(), 2U);
+  EXPECT_EQ(QApplication::focusWidget(), &tableOf(static_cast<RowsController&>(stack->topViewController())));
 }
 
 TEST_F(AlertTest, ItGoesWithItsWindow) {

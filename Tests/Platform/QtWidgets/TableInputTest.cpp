@@ -1,5 +1,6 @@
 // Keyboard, mouse and wheel on a table.
 #include <QScrollBar>
+#include <QScroller>
 #include <QWheelEvent>
 
 #include "Tests/Platform/QtWidgets/QtFixture.h"
@@ -143,6 +144,15 @@ TEST_F(TableInputTest, ATapOpensARow) {
   EXPECT_EQ(pane.tableView().indexPathForSelectedRow(), (IndexPath{0, 2}));
 }
 
+TEST_F(TableInputTest, ASecondTapSoonAfterTheFirstOpensARowToo) {
+  const RowsController& pane = showRows(5);
+  QWidget* const viewport = tableOf(pane).viewport();
+  QTest::mouseClick(viewport, Qt::LeftButton, {}, middleOf(2));
+  QTest::mouseDClick(viewport, Qt::LeftButton, {}, middleOf(2));
+  QTest::mouseRelease(viewport, Qt::LeftButton, {}, middleOf(2));
+  EXPECT_THAT(pane.opened, ElementsAre(2, 2));
+}
+
 TEST_F(TableInputTest, ATapBelowTheLastRowOpensNone) {
   const RowsController& pane = showRows(2);
   QTest::mouseClick(tableOf(pane).viewport(), Qt::LeftButton, {}, middleOf(4));
@@ -162,6 +172,23 @@ TEST_F(TableInputTest, OtherButtonsOpenNone) {
   const RowsController& pane = showRows(5);
   QTest::mouseClick(tableOf(pane).viewport(), Qt::RightButton, {}, middleOf(2));
   EXPECT_THAT(pane.opened, IsEmpty());
+}
+
+TEST_F(TableInputTest, AFingerScrollsTheTableAndItsSpeedScrollsItOn) {
+  const RowsController& pane = showRows(1000);
+  QWidget* const viewport = tableOf(pane).viewport();
+  const QScrollBar& bar = *tableOf(pane).verticalScrollBar();
+  ASSERT_TRUE(QScroller::hasScroller(viewport));
+  EXPECT_NE(QScroller::grabbedGesture(viewport), Qt::GestureType());
+  QScroller& scroller = *QScroller::scroller(viewport);
+  scroller.handleInput(QScroller::InputPress, {100, 600}, 0);
+  for (int step = 1; step <= 5; ++step)
+    scroller.handleInput(QScroller::InputMove, {100, 600.0 - 60 * step}, 20 * step);
+  ASSERT_TRUE(QTest::qWaitFor([&] { return bar.value() > 0; }, 60'000));
+  const int dragged = bar.value();
+  scroller.handleInput(QScroller::InputRelease, {100, 300}, 110);
+  EXPECT_TRUE(QTest::qWaitFor([&] { return bar.value() > dragged; }, 60'000));
+  scroller.stop();
 }
 
 TEST_F(TableInputTest, TheWheelScrollsTheTable) {

@@ -170,6 +170,22 @@ TEST_F(TableRowsTest, DeselectingTakesTheMarkOff) {
   EXPECT_FALSE(pane.tableView().indexPathForSelectedRow());
 }
 
+TEST_F(TableRowsTest, DeselectingWithoutAnimationStopsTheFadeOfTheRowBefore) {
+  const RowsController& pane = showRows(3);
+  const auto groundOf = [&](std::size_t row) {
+    return tableOf(pane).cellAt(row)->grab().toImage().pixelColor(300, 25);
+  };
+  const QColor ground = groundOf(2);
+  tableOf(pane).open(0);
+  pane.tableView().deselectRowAtIndexPath({0, 0}, true);
+  ASSERT_NE(groundOf(0), ground);
+  tableOf(pane).open(1);
+  ASSERT_NE(groundOf(1), ground);
+  pane.tableView().deselectRowAtIndexPath({0, 1}, false);
+  EXPECT_EQ(groundOf(0), ground);
+  EXPECT_EQ(groundOf(1), ground);
+}
+
 TEST_F(TableRowsTest, FittedToItsRowsTheTableIsNoHigher) {
   const RowsController& pane = showRows(3);
   tableOf(pane).sizeToFit();

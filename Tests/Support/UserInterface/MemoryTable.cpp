@@ -6,6 +6,7 @@ namespace kelvasi::test {
 
 void MemoryTable::reloadData() {
   ++reloads;
+  if (reloaded) reloaded();
   cells_.reload(rowsInSight(), [this](std::size_t row) { return askFor(row); });
 }
 

@@ -1,6 +1,7 @@
 // A table that is never drawn: rows come into sight when the test says so.
 #pragma once
 
+#include <functional>
 #include <memory>
 #include <optional>
 #include <vector>
@@ -73,6 +74,7 @@ class MemoryTable : public MemoryView<TableView> {
   RowRange inSight{0, 20};
   int cellsMade = 0;
   int reloads = 0;
+  std::function<void()> reloaded;  // for tables that may go before they can be asked
   int fittings = 0;
   std::optional<IndexPath> selected;
   std::vector<Deselection> deselections;

@@ -1,0 +1,70 @@
+// Texts have the room that they need, at whichever scale of the screen the tests are run.
+#include <QLabel>
+
+#include "Platform/QtWidgets/BarButton.h"
+#include "Tests/Platform/QtWidgets/QtFixture.h"
+
+namespace kelvasi {
+namespace {
+
+class TextFitTest : public test::QtFixture {
+ protected:
+  // Everything in sight.
+  void expectRoomForTexts(std::size_t buttons, std::size_t labels) {
+    settle();
+    std::size_t buttonsSeen = 0;
+    std::size_t labelsSeen = 0;
+    for (const BarButton* const button : all<BarButton>()) {
+      if (!button->isVisible()) continue;
+      ++buttonsSeen;
+      EXPECT_GE(button->width(), button->sizeHint().width()) << button->text().toStdString();
+      EXPECT_GE(button->height(), button->fontMetrics().height()) << button->text().toStdString();
+    }
+    for (const QLabel* const label : all<QLabel>()) {
+      if (!label->isVisible()) continue;
+      ++labelsSeen;
+      if (!label->wordWrap()) {
+        EXPECT_GE(label->width(), widthOf(*label)) << label->text().toStdString();
+      }
+      const int high = label->wordWrap() ? label->heightForWidth(label->width()) : label->sizeHint().height();
+      EXPECT_GE(label->height(), high) << label->text().toStdString();
+    }
+    EXPECT_EQ(buttonsSeen, buttons);
+    EXPECT_EQ(labelsSeen, labels);
+  }
+
+ private:
+  static double widthOf(const QLabel& label) {
+    return QFontMetricsF(label.font()).horizontalAdvance(label.text());
+  }
+};
+
+TEST_F(TextFitTest, BarsShowTitleWayBackStatusAndSave) {
+  showRows(3).setTitle("Kelvasi");
+  test::RowsController& pane = push(3, "Registration");
+  const std::string status = "Updated 2024-03-05 at 14:07:09";
+  const Font font = Font::system(14);
+  stack->setToolbarHidden(false, false);
+  pane.setToolbarItems({ActivitySpinner{.isAnimating = false, .hidesWhenStopped = true},
+                        ToolbarLabel{.text = status, .font = font, .size = ui->sizeOfText(status, font)},
+                        FlexibleSpace{}, SaveButton{[] {}}},
+                       true);
+  expectRoomForTexts(2, 1);
+}
+
+TEST_F(TextFitTest, TheSaveFormShowsItsTexts) {
+  showRows(3);
+  ViewController form(ui->loadInterface("KelvasiSaveViewController"));
+  stack->presentModalViewController(form, false);
+  expectRoomForTexts(2, 3);
+  stack->dismissModalViewController(false);
+}
+
+TEST_F(TextFitTest, AnAlertShowsItsTexts) {
+  showRows(3);
+  ui->showAlert("File Error", "Unable to write file to disk", "Close");
+  expectRoomForTexts(1, 2);
+}
+
+}  // namespace
+}  // namespace kelvasi
