@@ -11,15 +11,15 @@
 #include <utility>
 
 #include "Simulator/C2K/Frames.h"
-#include "Simulator/Subscription.h"
 #include "Telvon/Technology.h"
-#include "Tests/Simulator/DecodingViewer.h"
+#include "Tests/Simulator/PlayedScenario.h"
 #include "Tests/Support/C2KLookupNames.h"
 
 namespace kelvasi::sim::c2k {
 namespace {
 
 using test::DecodingViewer;
+using test::has;
 using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::IsSupersetOf;
@@ -32,10 +32,6 @@ PlistValue displayTemplate() {
   const auto leaves = PlistDictionary::make();
   for (const std::string_view name : kelvasi::test::c2kLookupNames) leaves->set(name, name);
   return leaves;
-}
-
-bool has(const Messages& messages, LogCode code) {
-  return std::ranges::any_of(messages, [code](const Message& message) { return message.logCode == code; });
 }
 
 // The number behind an optional mark; printf's form, with its sign.
@@ -52,13 +48,10 @@ class CdmaDrive : public testing::TestWithParam<std::uint64_t> {
  protected:
   template <typename Look>
   void play(int steps, Look look) {
-    for (int turn = 0; turn < steps && !HasFailure(); ++turn) {
-      Messages messages;
-      scenario.step(messages);
-      SCOPED_TRACE("step " + std::to_string(turn));
+    test::play(scenario, steps, [&](const Messages& messages) {
       viewer.take(messages);
       look(messages);
-    }
+    });
   }
   const World& world() const { return scenario.world(); }
   std::string text(std::string_view name) const {
@@ -359,16 +352,7 @@ TEST_P(CdmaDrive, RatesAreThoseOfTheDataAndZeroWithoutThem) {
 }
 
 TEST_P(CdmaDrive, SendsEveryCodeThatTheViewerSubscribesTo) {
-  const PlistValue command = viewer.generator().getStartCommand();
-  const auto wanted = Subscription::fromStartCommand(*command.dictionary());
-  std::set<LogCode> seen;
-  play(2000, [&](const Messages& messages) {
-    for (const Message& message : messages) {
-      ASSERT_TRUE(wanted.wants(message));
-      seen.insert(*message.logCode);
-    }
-  });
-  EXPECT_EQ(seen.size(), wanted.size());
+  test::expectEveryWantedCode(scenario, 2000, viewer.generator());
 }
 
 TEST_P(CdmaDrive, GoesThroughEveryStateOfBothAirInterfaces) {
@@ -425,19 +409,8 @@ TEST_P(CdmaDrive, ANewStreamIsToldThePresentState) {
     EXPECT_EQ(late.sectionOf(row), viewer.sectionOf(row)) << row;
 }
 
-Bytes allBytes(std::uint64_t seed, const PlistSerialiser& plists) {
-  DriveScenario scenario(seed, plists);
-  Messages messages;
-  for (int turn = 0; turn < 1000; ++turn) scenario.step(messages);
-  Bytes all;
-  for (const Message& message : messages) all.insert(all.end(), message.bytes.begin(), message.bytes.end());
-  return all;
-}
-
 TEST(CdmaDriveSeed, TheSameGivesTheSameMessages) {
-  const LibplistSerialiser plists;
-  EXPECT_EQ(allBytes(1, plists), allBytes(1, plists));
-  EXPECT_NE(allBytes(1, plists), allBytes(2, plists));
+  test::expectTheSeedToDecide<DriveScenario>();
 }
 
 }  // namespace

@@ -7,14 +7,14 @@
 #include <map>
 #include <set>
 
-#include "Simulator/Subscription.h"
 #include "Telvon/Technology.h"
-#include "Tests/Simulator/DecodingViewer.h"
+#include "Tests/Simulator/PlayedScenario.h"
 
 namespace kelvasi::sim::gsm {
 namespace {
 
 using test::DecodingViewer;
+using test::has;
 using testing::AnyOf;
 using testing::Contains;
 using testing::IsEmpty;
@@ -48,31 +48,13 @@ DecodingViewer viewer() {
   return DecodingViewer(kTelvonLogChannelTechnology_Orvane_GSM, "Orvane_GSM", sections);
 }
 
-bool has(const Messages& messages, LogCode code) {
-  return std::ranges::any_of(messages, [code](const Message& message) { return message.logCode == code; });
-}
-
-// What one of two ways of telling is told alone: the baseband's records, and the telephony daemon's own.
 class Drive : public testing::Test {
  protected:
   template <typename Look>
   void play(int steps, Look look) {
-    for (int turn = 0; turn < steps && !HasFailure(); ++turn) {
-      Messages messages;
-      scenario.step(messages);
-      SCOPED_TRACE("step " + std::to_string(turn));
-      look(messages);
-    }
+    test::play(scenario, steps, look);
   }
-  // Each viewer takes only its own way's records.
-  void decode(const Messages& messages) {
-    Messages ofBaseband;
-    Messages ofDaemon;
-    for (const Message& message : messages)
-      (*message.logCode >= extraLogCodes ? ofDaemon : ofBaseband).push_back(message);
-    baseband.take(ofBaseband);
-    daemon.take(ofDaemon);
-  }
+  void decode(const Messages& messages) { displays.take(messages); }
   const World& world() const { return scenario.world(); }
   std::string rrcState() const { return baseband.text("UMTS RR Info", "RRC State"); }
   std::string rrState() const { return baseband.text("GSM RR Info", "RR State"); }
@@ -92,8 +74,9 @@ class Drive : public testing::Test {
 
   LibplistSerialiser plists;
   DriveScenario scenario{11, plists};
-  DecodingViewer baseband = viewer();
-  DecodingViewer daemon = viewer();
+  test::ViewerOfEachWay displays{viewer};
+  DecodingViewer& baseband = displays.baseband;
+  DecodingViewer& daemon = displays.daemon;
 };
 
 void Drive::checkUmtsCell() {
@@ -255,16 +238,7 @@ TEST_F(Drive, MeasurementsAreThoseOfTheRadioModel) {
 }
 
 TEST_F(Drive, SendsEveryCodeThatTheViewerSubscribesTo) {
-  const PlistValue command = baseband.generator().getStartCommand();
-  const auto wanted = Subscription::fromStartCommand(*command.dictionary());
-  std::set<LogCode> seen;
-  play(manySteps, [&](const Messages& messages) {
-    for (const Message& message : messages) {
-      ASSERT_TRUE(wanted.wants(message));
-      seen.insert(*message.logCode);
-    }
-  });
-  EXPECT_EQ(seen.size(), wanted.size());
+  test::expectEveryWantedCode(scenario, manySteps, baseband.generator());
 }
 
 TEST_F(Drive, SendsTheSimFilesOnceAndTellsThemToEveryNewStream) {
@@ -311,18 +285,8 @@ TEST_F(Drive, SecondaryProcessesStandWhereTheirDecoderLooks) {
   EXPECT_TRUE(hasTwoCarriers);
 }
 
-Bytes allBytes(std::uint64_t seed, const PlistSerialiser& plists) {
-  DriveScenario scenario(seed, plists);
-  Messages messages;
-  for (int turn = 0; turn < 1000; ++turn) scenario.step(messages);
-  Bytes all;
-  for (const Message& message : messages) all.insert(all.end(), message.bytes.begin(), message.bytes.end());
-  return all;
-}
-
 TEST_F(Drive, TheSameSeedGivesTheSameMessages) {
-  EXPECT_EQ(allBytes(1, plists), allBytes(1, plists));
-  EXPECT_NE(allBytes(1, plists), allBytes(2, plists));
+  test::expectTheSeedToDecide<DriveScenario>();
 }
 
 TEST_F(Drive, GoesThroughEveryStateOfAConnection) {

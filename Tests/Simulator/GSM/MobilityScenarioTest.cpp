@@ -7,7 +7,7 @@
 #include <set>
 
 #include "Telvon/Technology.h"
-#include "Tests/Simulator/DecodingViewer.h"
+#include "Tests/Simulator/PlayedScenario.h"
 
 namespace kelvasi::sim::gsm {
 namespace {
@@ -36,29 +36,15 @@ class Mobility : public testing::Test {
   // Plays many steps; `look` is called after each with what was sent.
   template <typename Look>
   void play(Look look) {
-    for (int turn = 0; turn < manySteps && !HasFailure(); ++turn) {
-      Messages messages;
-      scenario.step(messages);
-      look(messages);
-    }
+    test::play(scenario, manySteps, look);
   }
 
   LibplistSerialiser plists;
   MobilityScenario scenario{7, plists};
 };
 
-Bytes allBytes(std::uint64_t seed, const PlistSerialiser& plists) {
-  MobilityScenario scenario(seed, plists);
-  Messages messages;
-  for (int turn = 0; turn < 2000; ++turn) scenario.step(messages);
-  Bytes all;
-  for (const Message& message : messages) all.insert(all.end(), message.bytes.begin(), message.bytes.end());
-  return all;
-}
-
 TEST_F(Mobility, TheSameSeedGivesTheSameMessages) {
-  EXPECT_EQ(allBytes(1, plists), allBytes(1, plists));
-  EXPECT_NE(allBytes(1, plists), allBytes(2, plists));
+  test::expectTheSeedToDecide<MobilityScenario>();
 }
 
 TEST_F(Mobility, SendsEveryRecordOfTheMobilityManagement) {

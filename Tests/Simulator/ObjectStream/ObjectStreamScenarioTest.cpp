@@ -8,7 +8,7 @@
 #include <stdexcept>
 
 #include "Telvon/Technology.h"
-#include "Tests/Simulator/DecodingViewer.h"
+#include "Tests/Simulator/PlayedScenario.h"
 
 namespace kelvasi::sim::objectStream {
 namespace {
@@ -41,13 +41,10 @@ class ObjectStream : public testing::TestWithParam<std::uint64_t> {
  protected:
   template <typename Look>
   void play(int steps, Look look) {
-    for (int turn = 0; turn < steps && !HasFailure(); ++turn) {
-      Messages messages;
-      scenario.step(messages);
-      SCOPED_TRACE("step " + std::to_string(turn));
+    test::play(scenario, steps, [&](const Messages& messages) {
       viewer.take(messages);
       look(messages);
-    }
+    });
   }
   const gsm::World& world() const { return scenario.world(); }
   PlistValue shown(std::initializer_list<std::string_view> keys) const { return at(viewer.display(), keys); }
@@ -166,15 +163,6 @@ TEST_P(ObjectStream, ANewStreamIsToldThePresentStateAtOnce) {
   EXPECT_EQ(viewer.display(), before);
 }
 
-Bytes allBytes(std::uint64_t seed, const PlistSerialiser& plists) {
-  ObjectStreamScenario scenario(seed, plists);
-  Messages messages;
-  for (int turn = 0; turn < 300; ++turn) scenario.step(messages);
-  Bytes all;
-  for (const Message& message : messages) all.insert(all.end(), message.bytes.begin(), message.bytes.end());
-  return all;
-}
-
 TEST(ObjectStreamFailure, AnObjectThatCannotBeSerialisedIsNotDroppedInSilence) {
   const kelvasi::test::FakeSerialiser serialisesNothing;
   ObjectStreamScenario scenario(1, serialisesNothing);
@@ -183,9 +171,7 @@ TEST(ObjectStreamFailure, AnObjectThatCannotBeSerialisedIsNotDroppedInSilence) {
 }
 
 TEST(ObjectStreamSeed, TheSameGivesTheSameMessages) {
-  const LibplistSerialiser plists;
-  EXPECT_EQ(allBytes(1, plists), allBytes(1, plists));
-  EXPECT_NE(allBytes(1, plists), allBytes(2, plists));
+  test::expectTheSeedToDecide<ObjectStreamScenario>();
 }
 
 }  // namespace

@@ -7,16 +7,16 @@
 #include <cmath>
 #include <set>
 
-#include "Simulator/Subscription.h"
 #include "Simulator/UTRAN/UtranRecords.h"
 #include "Telvon/Technology.h"
-#include "Tests/Simulator/DecodingViewer.h"
+#include "Tests/Simulator/PlayedScenario.h"
 #include "Tests/Simulator/RivalWatch.h"
 
 namespace kelvasi::sim::utran {
 namespace {
 
 using test::DecodingViewer;
+using test::has;
 using test::RivalWatch;
 using testing::Contains;
 using testing::IsEmpty;
@@ -39,31 +39,13 @@ DecodingViewer viewer() {
   return DecodingViewer(kTelvonLogChannelTechnology_Orvane_UTRAN2, "UTRAN", sections);
 }
 
-bool has(const Messages& messages, LogCode code) {
-  return std::ranges::any_of(messages, [code](const Message& message) { return message.logCode == code; });
-}
-
-// What one of two ways of telling is told alone: the baseband's records, and the telephony daemon's own.
 class UtranDrive : public testing::TestWithParam<int> {
  protected:
   template <typename Look>
   void play(int steps, Look look) {
-    for (int turn = 0; turn < steps && !HasFailure(); ++turn) {
-      Messages messages;
-      scenario.step(messages);
-      SCOPED_TRACE("step " + std::to_string(turn));
-      look(messages);
-    }
+    test::play(scenario, steps, look);
   }
-  // Each viewer takes only its own way's records.
-  void decode(const Messages& messages) {
-    Messages ofBaseband;
-    Messages ofDaemon;
-    for (const Message& message : messages)
-      (*message.logCode >= extraLogCodes ? ofDaemon : ofBaseband).push_back(message);
-    baseband.take(ofBaseband);
-    daemon.take(ofDaemon);
-  }
+  void decode(const Messages& messages) { displays.take(messages); }
 
   const World& world() const { return scenario.world(); }
   std::string rrcState() const { return baseband.text("RRC Info", "State"); }
@@ -74,8 +56,9 @@ class UtranDrive : public testing::TestWithParam<int> {
 
   LibplistSerialiser plists;
   DriveScenario scenario{static_cast<std::uint64_t>(GetParam()), plists};
-  DecodingViewer baseband = viewer();
-  DecodingViewer daemon = viewer();
+  test::ViewerOfEachWay displays{viewer};
+  DecodingViewer& baseband = displays.baseband;
+  DecodingViewer& daemon = displays.daemon;
 };
 
 INSTANTIATE_TEST_SUITE_P(Seeds, UtranDrive, testing::ValuesIn(seeds));
@@ -206,31 +189,11 @@ TEST_P(UtranDrive, GoesThroughTheStatesOfAConnectionAndBothTechnologies) {
 }
 
 TEST_P(UtranDrive, SendsEveryCodeThatTheViewerSubscribesToWithinAMinute) {
-  const PlistValue command = baseband.generator().getStartCommand();
-  const auto wanted = Subscription::fromStartCommand(*command.dictionary());
-  std::set<LogCode> seen;
-  play(300, [&](const Messages& messages) {
-    for (const Message& message : messages) {
-      ASSERT_TRUE(wanted.wants(message));
-      seen.insert(*message.logCode);
-    }
-  });
-  EXPECT_EQ(seen.size(), wanted.size());
-}
-
-Bytes allBytes(std::uint64_t seed, const PlistSerialiser& plists) {
-  DriveScenario scenario(seed, plists);
-  Messages messages;
-  for (int turn = 0; turn < 1000; ++turn) scenario.step(messages);
-  Bytes all;
-  for (const Message& message : messages) all.insert(all.end(), message.bytes.begin(), message.bytes.end());
-  return all;
+  test::expectEveryWantedCode(scenario, 300, baseband.generator());
 }
 
 TEST(UtranDriveSeed, TheSameSeedGivesTheSameMessages) {
-  const LibplistSerialiser plists;
-  EXPECT_EQ(allBytes(1, plists), allBytes(1, plists));
-  EXPECT_NE(allBytes(1, plists), allBytes(2, plists));
+  test::expectTheSeedToDecide<DriveScenario>();
 }
 
 // 3GPP TS 25.123, 9.1.1.4: level 0 is a rate of 0, 1 begins at 10^-4.03, each level has 0.065 of the
