@@ -41,7 +41,8 @@ double meanPower(RecordView record) {
     const RecordView sample = entryOf(record, transmitPower::samples, place);
     const std::int64_t agc = valueOf(sample, fieldIn(transmitPower::sampleLayout, "transmit AGC"));
     if (agc == 0) continue;
-    sum += static_cast<double>((agc + 512) / 10 - 70);
+    const std::int64_t wholeDbm = (agc + 512) / 10 - 70;
+    sum += static_cast<double>(wholeDbm);
     ++count;
   }
   return count == 0 ? std::numeric_limits<double>::quiet_NaN() : sum / count;
