@@ -124,6 +124,21 @@ class Files(KelvasictlTest):
                 self.assertTrue(os.path.islink(self.path("link" + option)))
                 self.assertEqual(len(self.read("target" + option)), len(self.plain_output(option)))
 
+    def test_an_output_that_is_an_input_is_refused_before_anything_is_written(self):
+        os.link(self.capture, self.path("hard"))
+        os.symlink("a.pcap", self.path("soft"))
+        for option in self.OPTIONS:
+            for name in ("a.pcap", "hard", "soft"):
+                with self.subTest((option, name)):
+                    other = self.write("b.pcap", pcap())
+                    result = self.decode(other, self.capture, option, self.path(name))
+                    self.assert_fault(result, f"{option}: {self.path(name)} is an input", status=2)
+                    self.assertEqual((result.stdout, self.read("a.pcap")), (b"", pcap(MM_IDLE)))
+            with open(self.capture, "rb") as file:
+                result = self.decode("-", option, self.capture, stdin=file)
+            self.assert_fault(result, f"{option}: {self.capture} is an input", status=2)
+            self.assertEqual(self.read("a.pcap"), pcap(MM_IDLE))
+
     def test_a_pipe_is_written_into(self):
         for option in self.OPTIONS:
             with self.subTest(option):
