@@ -102,6 +102,18 @@ class Decode(KelvasictlTest):
         self.assertEqual((result.returncode, result.stdout), (-signal.SIGABRT, b""))
         self.assertIn(b"<2>Terminating: uncaught kelvasi::LogCode_0xFF000020::UnknownDataException\n", result.stderr)
 
+    def test_an_assertion_is_told_once_wherever_the_log_goes(self):
+        crash = CAPTURES / "IFX" / "ifx_crash_garbage.pcap"
+        logged = self.decode("--log-stderr", crash, technology="IFX")
+        self.assertEqual(logged.returncode, -signal.SIGABRT)
+        lines = [line for line in logged.stderr.decode().splitlines() if "Terminating" in line]
+        self.assertEqual(len(lines), 1)
+        self.assertTrue(lines[0].startswith("<2>Terminating: uncaught "), lines)
+        silent = self.decode(crash, technology="IFX")
+        self.assert_fault(silent, status=-signal.SIGABRT)
+        self.assertEqual(silent.stderr.decode(), "kelvasictl: " + lines[0].removeprefix("<2>") + "\n")
+        self.assertEqual(silent.stdout, b"")
+
 
 class Files(KelvasictlTest):
     OPTIONS = ("--dlf", "--snapshot")

@@ -83,6 +83,13 @@ class Monitor(LiveTest):
             self.skipTest("the SIM decoder does not exist yet")
         self.assertEqual(monitor.returncode, -signal.SIGABRT)
 
+    def test_the_end_by_an_assertion_is_told(self):
+        self.start_daemon("--replay", self.write("world.pcap", pcap(b"no property list")), technology="IFX")
+        monitor = self.start_live("monitor")
+        out, error = monitor.communicate(timeout=PATIENCE)
+        self.assertEqual((monitor.returncode, out), (-signal.SIGABRT, b""))
+        self.assertRegex(error.decode(), r"\Akelvasictl: Terminating: uncaught .+\n\Z")
+
 
 class MonitorOnATerminal(LiveTest):
     def setUp(self):
