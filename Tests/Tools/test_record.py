@@ -77,7 +77,12 @@ class Record(LiveTest):
     def test_the_file_is_a_capture_from_the_start(self):
         recorder = self.start_record("--seconds", "0.2")
         _, error = recorder.communicate(timeout=PATIENCE)
-        self.assertEqual(error.decode(), f"kelvasictl: 0 messages recorded in {self.path('a.pcap')}\n")
+        self.assertEqual(recorder.returncode, 1)
+        self.assertEqual(error.decode().splitlines(), [
+            f"kelvasictl: waiting for a telephony daemon in {self.path('run')}",
+            f"kelvasictl: 0 messages recorded in {self.path('a.pcap')}",
+            f"kelvasictl: nothing came from a telephony daemon in {self.path('run')}",
+        ])
         self.assertEqual(self.decode(self.path("a.pcap")).stdout, b"null\n")
 
     def test_a_place_that_cannot_be_written_is_named(self):
