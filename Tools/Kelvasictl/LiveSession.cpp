@@ -25,7 +25,7 @@ std::string aDaemonThere() {
 }  // namespace
 
 void LiveOptions::addTo(CLI::App& verb) {
-  verb.add_option("--seconds", seconds, "end after so many seconds; otherwise at SIGINT or SIGTERM")
+  verb.add_option("--seconds", seconds, "end after so many seconds; otherwise at SIGINT, SIGTERM or SIGHUP")
       ->type_name("N")
       ->check(CLI::Range(0.0, 1e9));
   surroundings.addTo(verb);
