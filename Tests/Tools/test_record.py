@@ -85,6 +85,29 @@ class Record(LiveTest):
         ])
         self.assertEqual(self.decode(self.path("a.pcap")).stdout, b"null\n")
 
+    def replayed(self, contents):
+        """What the daemon says of a capture that it plays to its end; the path of that is left out."""
+        world = self.write("world.pcap", contents)
+        daemon = self.start_daemon("--replay", world, "--speed", "max", "--leave")
+        self.start_record()
+        error = daemon.communicate(timeout=PATIENCE)[1].decode()
+        self.assertEqual(daemon.returncode, 0, error)
+        return [line.replace(world, "FILE") for line in error.splitlines() if line.startswith("telvon-sim: ")]
+
+    def test_a_daemon_tells_of_a_capture_cut_inside_a_packet(self):
+        said, end = self.replayed(pcap(MM_IDLE, MM_IDLE)[:-1])
+        self.assertTrue(said.startswith("telvon-sim: FILE: byte 56: truncated"), said)
+        self.assertEqual(end, "telvon-sim: the capture has been played")
+
+    def test_a_daemon_tells_of_packets_that_were_captured_in_part(self):
+        in_part = bytearray(pcap(MM_IDLE, MM_IDLE, MM_IDLE))
+        for number in (1, 2):  # the length that the packet had before it was captured
+            in_part[24 + number * (16 + len(MM_IDLE)) + 12] += 1
+        self.assertEqual(self.replayed(bytes(in_part)), [
+            "telvon-sim: FILE: 2 messages are not in the capture as a whole",
+            "telvon-sim: the capture has been played",
+        ])
+
     def test_a_place_that_cannot_be_written_is_named(self):
         self.assert_fault(self.run_program("record", self.path("missing/a.pcap")), "missing/a.pcap: No such file")
         self.assert_fault(self.run_program("record", "/dev/full"), "/dev/full: No space left on device")
