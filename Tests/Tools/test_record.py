@@ -179,6 +179,14 @@ class RecordFromTheWire(LiveTest):
         recorder.send_signal(signal.SIGCONT)
         self.check(recorder, sent)
 
+    def test_a_malformed_frame_costs_its_connection_only(self):
+        recorder, messages = self.start_record()
+        messages.send(bytes(16))  # version 0
+        self.daemon.connect().send(wire.frame(wire.MESSAGE, MM_IDLE))
+        self.wait_for_size(24 + 2 * (16 + len(MM_IDLE)))
+        self.assertEqual(self.end(recorder)[0], 0)
+        self.assertEqual([message for _, message in packets(self.read("a.pcap"))], [MM_IDLE, MM_IDLE])
+
     def test_a_message_that_no_capture_takes_is_cut_and_reported(self):
         recorder, messages = self.start_record()
         large = bytes(300_000)
