@@ -24,6 +24,11 @@ std::string wrongLinkType(int linkType) {
          " instead of " + std::to_string(DLT_USER0) + " (USER0)";
 }
 
+// The library knows of DLF files as little as it says what it reads.
+std::string whyNotOpened(const std::string& error) {
+  return error == "unknown file format" ? error + "; pcap, pcapng and DLF files are read" : error;
+}
+
 }  // namespace
 
 void PcapReader::Close::operator()(pcap* capture) const {
@@ -41,7 +46,7 @@ void PcapReader::open() {
   std::array<char, PCAP_ERRBUF_SIZE> error{};
   capture_.reset(
       pcap_fopen_offline_with_tstamp_precision(stream.get(), PCAP_TSTAMP_PRECISION_NANO, error.data()));
-  if (!capture_) return fail(0, error.data());
+  if (!capture_) return fail(0, whyNotOpened(error.data()));
   static_cast<void>(stream.release());  // the capture closes it from now on
   const int linkType = pcap_datalink(capture_.get());
   if (linkType != DLT_USER0) fail(0, wrongLinkType(linkType));

@@ -9,8 +9,8 @@ namespace {
 constexpr WorldTime pauseBetweenRounds = std::chrono::seconds(1);
 }
 
-ReplaySource::ReplaySource(Opener open, bool isLooping, FaultHandler onFault)
-    : open_(std::move(open)), isLooping_(isLooping), onFault_(std::move(onFault)) {
+ReplaySource::ReplaySource(Opener open, bool isLooping, EndHandler onEnd)
+    : open_(std::move(open)), isLooping_(isLooping), onEnd_(std::move(onEnd)) {
   readFirst();
 }
 
@@ -28,10 +28,7 @@ void ReplaySource::readFirst() {
   capture_ = open_();
   due_.reset();
   const auto message = capture_->next();
-  if (!message) {
-    if (capture_->fault()) onFault_(*capture_->fault());
-    return;
-  }
+  if (!message) return onEnd_(*capture_);
   firstArrival_ = message->arrival;
   due_ = begin_;
   keep(*message);
@@ -39,7 +36,7 @@ void ReplaySource::readFirst() {
 
 void ReplaySource::readNext() {
   if (const auto message = capture_->next()) return keep(*message);
-  if (capture_->fault()) onFault_(*capture_->fault());
+  onEnd_(*capture_);
   begin_ = *due_ + pauseBetweenRounds;
   if (isLooping_) {
     readFirst();

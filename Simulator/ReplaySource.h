@@ -13,11 +13,11 @@ namespace kelvasi::sim {
 class ReplaySource : public MessageSource {
  public:
   using Opener = std::function<std::unique_ptr<CaptureReader>()>;
-  using FaultHandler = std::function<void(const CaptureFault&)>;
+  using EndHandler = std::function<void(const CaptureReader& capture)>;
 
   // `open` gives the capture from its beginning, each time anew. A source that loops begins again a second
-  // after the last message. `onFault` is called when a capture ends before its end.
-  ReplaySource(Opener open, bool isLooping, FaultHandler onFault);
+  // after the last message. `onEnd` is called each time that a capture was read to its end or fault.
+  ReplaySource(Opener open, bool isLooping, EndHandler onEnd);
 
   std::optional<WorldTime> nextAt() const override { return due_; }
   void take(Messages& messages) override;
@@ -30,7 +30,7 @@ class ReplaySource : public MessageSource {
 
   Opener open_;
   bool isLooping_;
-  FaultHandler onFault_;
+  EndHandler onEnd_;
   std::unique_ptr<CaptureReader> capture_;
   std::chrono::nanoseconds firstArrival_{0};
   WorldTime begin_{0};  // of this round

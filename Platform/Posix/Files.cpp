@@ -7,6 +7,7 @@
 #include <array>
 #include <cerrno>
 #include <cstdio>
+#include <filesystem>
 #include <system_error>
 
 #include "Platform/Posix/FileDescriptor.h"
@@ -33,6 +34,25 @@ bool isRegular(const FileDescriptor& file) {
   return ::fstat(file.number(), &status) == 0 && S_ISREG(status.st_mode);
 }
 
+// Where the symbolic links lead, to a file that is yet to be made perhaps. The last link after too many.
+std::string targetOf(const std::string& path) {
+  constexpr int mostLinks = 40;
+  std::filesystem::path target = path;
+  for (int count = 0; count < mostLinks; ++count) {
+    std::error_code error;
+    const std::filesystem::path next = std::filesystem::read_symlink(target, error);
+    if (error) break;
+    target = target.parent_path() / next;
+  }
+  return target;
+}
+
+FileError writeInto(const std::string& path, std::span<const std::uint8_t> bytes) {
+  FileDescriptor file(openFile(path, O_WRONLY));
+  if (file && writeAll(file.number(), bytes) && file.close()) return std::nullopt;
+  return lastError(path);
+}
+
 // A new file next to `path`, whose name is left in `temporary`. None, with errno set, when there cannot be
 // one.
 FileDescriptor createBeside(const std::string& path, std::string& temporary) {
@@ -44,12 +64,6 @@ FileDescriptor createBeside(const std::string& path, std::string& temporary) {
     if (number < 0 && errno != EEXIST) break;
   }
   return FileDescriptor(number);
-}
-
-bool takeOverPermissions(const FileDescriptor& file, const std::string& path) {
-  struct stat status {};
-  if (::lstat(path.c_str(), &status) != 0 || !S_ISREG(status.st_mode)) return true;
-  return ::fchmod(file.number(), status.st_mode & 07777) == 0;
 }
 
 // The rename itself must reach the disk too; where a directory cannot be synchronised nothing is lost but
@@ -91,18 +105,23 @@ FileError writeFile(const std::string& path, std::span<const std::uint8_t> bytes
 }
 
 FileError replaceFile(const std::string& path, std::span<const std::uint8_t> bytes) {
+  struct stat old {};
+  const bool exists = ::stat(path.c_str(), &old) == 0;
+  if (!exists && errno != ENOENT) return lastError(path);
+  if (exists && !S_ISREG(old.st_mode)) return writeInto(path, bytes);
+  const std::string target = targetOf(path);
   std::string temporary;
-  FileDescriptor file = createBeside(path, temporary);
+  FileDescriptor file = createBeside(target, temporary);
   if (!file) return lastError(path);
-  const bool replaced = takeOverPermissions(file, path) && writeAll(file.number(), bytes) &&
-                        ::fsync(file.number()) == 0 && file.close() &&
-                        std::rename(temporary.c_str(), path.c_str()) == 0;
+  const bool keepsPermissions = !exists || ::fchmod(file.number(), old.st_mode & 07777) == 0;
+  const bool replaced = keepsPermissions && writeAll(file.number(), bytes) && ::fsync(file.number()) == 0 &&
+                        file.close() && std::rename(temporary.c_str(), target.c_str()) == 0;
   if (!replaced) {
     const std::string error = lastError(path);
     ::unlink(temporary.c_str());
     return error;
   }
-  synchroniseDirectoryOf(path);
+  synchroniseDirectoryOf(target);
   return std::nullopt;
 }
 

@@ -28,8 +28,9 @@ FileContents readFile(const std::string& path, std::size_t limit = std::numeric_
 FileError writeFile(const std::string& path, std::span<const std::uint8_t> bytes);
 
 // Puts a file in the place of the one of that name, if any, whose permissions it takes over. The name always
-// has a whole file, the old or the new, even if the machine stops; after an error it is the old. A symbolic
-// link is replaced, not followed.
+// has a whole file, the old or the new, even if the machine stops; after an error it is the old. Symbolic
+// links are followed. What exists and is no regular file, such as a pipe or a device, is written into and
+// stays.
 FileError replaceFile(const std::string& path, std::span<const std::uint8_t> bytes);
 
 }  // namespace kelvasi

@@ -1,22 +1,32 @@
 #include "Platform/Posix/TerminateHandler.h"
 
 #include <cxxabi.h>
+#include <unistd.h>
 
+#include <algorithm>
 #include <atomic>
 #include <cstdlib>
 #include <exception>
 #include <memory>
+#include <optional>
 #include <string>
 #include <typeinfo>
+
+#include "Platform/Posix/FileDescriptor.h"
 
 namespace kelvasi {
 
 namespace {
 
-// The runtime's hook takes a function and nothing else, so the log has to be reached this way.
-std::atomic<SystemLog*>& lastLog() {
-  static std::atomic<SystemLog*> log = nullptr;
-  return log;
+struct LastWords {
+  SystemLog& log;
+  std::string program;  // empty: they go to the log only
+};
+
+// The runtime's hook takes a function and nothing else, so they have to be reached this way.
+std::atomic<const LastWords*>& lastWords() {
+  static std::atomic<const LastWords*> words = nullptr;
+  return words;
 }
 
 struct Free {
@@ -46,16 +56,29 @@ std::string reason() {
   return "Terminating: uncaught " + nameOf(*type) + messageOf(exception);
 }
 
+void tellUser(const std::string& program, std::string text) {
+  std::ranges::replace(text, '\n', ' ');
+  const std::string line = program + ": " + text + "\n";
+  // There is nowhere left to report a failure to.
+  writeAll(STDERR_FILENO, {reinterpret_cast<const std::uint8_t*>(line.data()), line.size()});
+}
+
 [[noreturn]] void terminate() {
   // Taken away first: should the log itself fail, the second call ends at once.
-  if (SystemLog* log = lastLog().exchange(nullptr)) log->print(LogPriority::critical, "%s", reason().c_str());
+  if (const LastWords* words = lastWords().exchange(nullptr)) {
+    const std::string text = reason();
+    if (!words->program.empty()) tellUser(words->program, text);
+    words->log.print(LogPriority::critical, "%s", text.c_str());
+  }
   std::abort();
 }
 
 }  // namespace
 
-void installTerminateHandler(SystemLog& log) {
-  lastLog() = &log;
+void installTerminateHandler(SystemLog& log, const std::string& program) {
+  static std::optional<LastWords> words;
+  lastWords() = nullptr;
+  lastWords() = &words.emplace(LastWords{log, program});
   std::set_terminate(terminate);
 }
 

@@ -14,12 +14,23 @@
 
 namespace kelvasi {
 
-// SIGINT and SIGTERM as something to read: no handler, no global.
+namespace {
+
+// Asked for by nohup(1). Held back it would arrive all the same.
+bool isHangUpIgnored() {
+  struct sigaction action {};
+  return ::sigaction(SIGHUP, nullptr, &action) == 0 && action.sa_handler == SIG_IGN;
+}
+
+}  // namespace
+
+// The ending signals as something to read: no handler, no global.
 class QtEventLoop::Signals {
  public:
   Signals() {
     ::sigemptyset(&ending_);
     for (const int signal : {SIGINT, SIGTERM}) ::sigaddset(&ending_, signal);
+    if (!isHangUpIgnored()) ::sigaddset(&ending_, SIGHUP);
     ::pthread_sigmask(SIG_BLOCK, &ending_, &before_);
     source_ = FileDescriptor(::signalfd(-1, &ending_, SFD_NONBLOCK | SFD_CLOEXEC));
     if (!source_) {

@@ -11,8 +11,9 @@ namespace kelvasi {
 
 class QtEventLoop {
  public:
-  // Made before anything else of this folder, and before any other thread: SIGINT and SIGTERM are held back
-  // from this thread and those it starts, and end run() instead. A second one then ends the process as usual.
+  // Made before anything else of this folder, and before any other thread: SIGINT, SIGTERM and SIGHUP (unless
+  // that is ignored) are held back from this thread and those it starts, and end run() instead. A second one
+  // then ends the process as usual.
   QtEventLoop();
   // Hands the signals back.
   ~QtEventLoop();

@@ -12,6 +12,7 @@
 #include <cstdlib>
 #include <cstring>
 #include <thread>
+#include <utility>
 
 #include "Platform/SystemLog.h"
 
@@ -81,14 +82,21 @@ std::string printable(std::string_view name) {
 
 }  // namespace
 
-std::optional<RuntimeDirectory> RuntimeDirectory::open(SystemLog& log) {
+RuntimeDirectory::Place RuntimeDirectory::look() {
   std::string path = pathFromEnvironment();
   while (path.size() > 1 && path.back() == '/') path.pop_back();  // a link with a slash would be followed
-  if (const std::string fault = faultOf(path); !fault.empty()) {
-    log.print(LogPriority::error, "Runtime directory \"%s\" refused: %s", path.c_str(), fault.c_str());
+  std::string fault = faultOf(path);
+  return {.path = std::move(path), .fault = std::move(fault)};
+}
+
+std::optional<RuntimeDirectory> RuntimeDirectory::open(SystemLog& log) {
+  Place place = look();
+  if (!place.fault.empty()) {
+    log.print(LogPriority::error, "Runtime directory \"%s\" refused: %s", place.path.c_str(),
+              place.fault.c_str());
     return std::nullopt;
   }
-  return RuntimeDirectory(std::move(path));
+  return RuntimeDirectory(std::move(place.path));
 }
 
 std::optional<sockaddr_un> RuntimeDirectory::addressOf(std::string_view name, SystemLog& log) const {

@@ -20,6 +20,13 @@ class RuntimeDirectory {
   // directory, not a symbolic link, of the current user's, with mode 0700.
   static std::optional<RuntimeDirectory> open(SystemLog& log);
 
+  // Where open() looks, and why it would refuse that, in words that follow the path; empty when it would not.
+  struct Place {
+    std::string path;
+    std::string fault;
+  };
+  static Place look();
+
   const std::string& path() const { return path_; }
 
   // Where the socket of this name is. Nothing, and one error line, when the name is empty, begins with a dot,

@@ -40,7 +40,10 @@ class Replay : public testing::Test {
  protected:
   void play(std::vector<std::chrono::nanoseconds> arrivals, bool isLooping = false, std::string fault = "") {
     source.emplace([=] { return std::make_unique<FakeCapture>(arrivals, fault); }, isLooping,
-                   [this](const CaptureFault& found) { faults.push_back(found.text()); });
+                   [this](const CaptureReader& capture) {
+                     ++ends;
+                     if (capture.fault()) faults.push_back(capture.fault()->text());
+                   });
   }
   // The times at which the next `count` messages are due, in ms, each with its number.
   std::vector<std::pair<long, int>> next(int count) {
@@ -58,6 +61,7 @@ class Replay : public testing::Test {
 
   std::optional<ReplaySource> source;
   std::vector<std::string> faults;
+  int ends = 0;
 };
 
 using testing::Pair;
@@ -76,6 +80,7 @@ TEST_F(Replay, TimeNeverGoesBack) {
 TEST_F(Replay, LoopsWithAPauseOfASecond) {
   play({10s, 12s}, true);
   EXPECT_THAT(next(5), ElementsAre(Pair(0, 0), Pair(2000, 1), Pair(3000, 0), Pair(5000, 1), Pair(6000, 0)));
+  EXPECT_EQ(ends, 2);
 }
 
 TEST_F(Replay, BeginsAnew) {

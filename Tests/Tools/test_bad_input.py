@@ -16,6 +16,10 @@ class BadCaptures(KelvasictlTest):
                 self.assert_fault(result, f"{self.path(name)}: byte 0: ")
                 self.assertEqual(result.stdout, b"null\n")
 
+    def test_an_unknown_format_is_told_with_those_that_are_read(self):
+        result = self.decode(self.write("text.pcap", b"this is no capture at all"))
+        self.assert_fault(result, "byte 0: unknown file format; pcap, pcapng and DLF files are read")
+
     def test_a_cut_capture_is_decoded_up_to_the_cut(self):
         contents = pcap(MM_IDLE, GMM_REGISTERED)
         result = self.decode(self.write("a.pcap", contents[:-1]))

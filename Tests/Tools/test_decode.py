@@ -1,8 +1,10 @@
 """kelvasictl decode: what it prints."""
 
 import json
+import os
 import plistlib
 import signal
+import stat
 import unittest
 
 from support import CAPTURES, GMM_DEREGISTERED, GMM_REGISTERED, MM_IDLE, START, TEMPLATES, KelvasictlTest, pcap, pcapng
@@ -99,6 +101,66 @@ class Decode(KelvasictlTest):
             self.skipTest("the SIM decoder does not exist yet")
         self.assertEqual((result.returncode, result.stdout), (-signal.SIGABRT, b""))
         self.assertIn(b"<2>Terminating: uncaught kelvasi::LogCode_0xFF000020::UnknownDataException\n", result.stderr)
+
+    def test_an_assertion_is_told_once_wherever_the_log_goes(self):
+        crash = CAPTURES / "IFX" / "ifx_crash_garbage.pcap"
+        logged = self.decode("--log-stderr", crash, technology="IFX")
+        self.assertEqual(logged.returncode, -signal.SIGABRT)
+        lines = [line for line in logged.stderr.decode().splitlines() if "Terminating" in line]
+        self.assertEqual(len(lines), 1)
+        self.assertTrue(lines[0].startswith("<2>Terminating: uncaught "), lines)
+        silent = self.decode(crash, technology="IFX")
+        self.assert_fault(silent, status=-signal.SIGABRT)
+        self.assertEqual(silent.stderr.decode(), "kelvasictl: " + lines[0].removeprefix("<2>") + "\n")
+        self.assertEqual(silent.stdout, b"")
+
+
+class Files(KelvasictlTest):
+    OPTIONS = ("--dlf", "--snapshot")
+
+    def setUp(self):
+        super().setUp()
+        self.capture = self.write("a.pcap", pcap(MM_IDLE))
+
+    def plain_output(self, option):
+        self.assertEqual(self.decode(self.capture, option, self.path("plain")).returncode, 0)
+        return self.read("plain")
+
+    def test_a_symbolic_link_is_followed(self):
+        for option in self.OPTIONS:
+            with self.subTest(option):
+                target = self.write("target" + option, b"old")
+                os.symlink(os.path.basename(target), self.path("link" + option))
+                result = self.decode(self.capture, option, self.path("link" + option))
+                self.assertEqual((result.returncode, result.stderr), (0, b""))
+                self.assertTrue(os.path.islink(self.path("link" + option)))
+                self.assertEqual(len(self.read("target" + option)), len(self.plain_output(option)))
+
+    def test_an_output_that_is_an_input_is_refused_before_anything_is_written(self):
+        os.link(self.capture, self.path("hard"))
+        os.symlink("a.pcap", self.path("soft"))
+        for option in self.OPTIONS:
+            for name in ("a.pcap", "hard", "soft"):
+                with self.subTest((option, name)):
+                    other = self.write("b.pcap", pcap())
+                    result = self.decode(other, self.capture, option, self.path(name))
+                    self.assert_fault(result, f"{option}: {self.path(name)} is an input", status=2)
+                    self.assertEqual((result.stdout, self.read("a.pcap")), (b"", pcap(MM_IDLE)))
+            with open(self.capture, "rb") as file:
+                result = self.decode("-", option, self.capture, stdin=file)
+            self.assert_fault(result, f"{option}: {self.capture} is an input", status=2)
+            self.assertEqual(self.read("a.pcap"), pcap(MM_IDLE))
+
+    def test_a_pipe_is_written_into(self):
+        for option in self.OPTIONS:
+            with self.subTest(option):
+                pipe = self.path("pipe" + option)
+                os.mkfifo(pipe)
+                reader = os.open(pipe, os.O_RDONLY | os.O_NONBLOCK)
+                self.addCleanup(os.close, reader)
+                self.assertEqual(self.decode(self.capture, option, pipe).returncode, 0)
+                self.assertTrue(stat.S_ISFIFO(os.stat(pipe).st_mode))
+                self.assertEqual(len(os.read(reader, 65536)), len(self.plain_output(option)))
 
 
 class EveryTick(KelvasictlTest):

@@ -60,10 +60,41 @@ class Monitor(LiveTest):
                 self.doCleanups()
                 self.setUp()
 
-    def test_seconds_end_it_well_without_a_daemon(self):
+    def test_it_says_that_it_waits_and_fails_when_nothing_came_by_the_stated_time(self):
         monitor = self.start_live("monitor", "--seconds", "0.2")
-        self.assertEqual(monitor.communicate(timeout=PATIENCE), (b"", b""))
-        self.assertEqual(monitor.returncode, 0)
+        out, error = monitor.communicate(timeout=PATIENCE)
+        self.assertEqual((monitor.returncode, out), (1, b""))
+        self.assertEqual(error.decode().splitlines(), [
+            f"kelvasictl: waiting for a telephony daemon in {self.path('run')}",
+            f"kelvasictl: nothing came from a telephony daemon in {self.path('run')}",
+        ])
+
+    def test_a_signal_is_no_failure_without_a_daemon(self):
+        monitor = self.start_live("monitor", "--seconds", "60")
+        self.assertIn(b"waiting", monitor.stderr.readline())
+        self.assertEqual(self.end(monitor), (0, b"", ""))
+
+    def test_a_runtime_directory_that_is_refused_is_named_with_the_reason(self):
+        os.mkdir(self.path("run"))
+        os.chmod(self.path("run"), 0o755)
+        monitor = self.start_live("monitor", "--seconds", "0.2")
+        _, error = monitor.communicate(timeout=PATIENCE)
+        reason = f"the runtime directory {self.path('run')} is refused: its mode is not 0700"
+        self.assertEqual(monitor.returncode, 1)
+        self.assertEqual(error.decode().splitlines()[0], f"kelvasictl: waiting for a telephony daemon; {reason}")
+
+    def test_a_runtime_directory_that_nothing_names_is_told(self):
+        for variable in ("TELVON_RUNTIME_DIR", "XDG_RUNTIME_DIR"):
+            self.environment[variable] = ""
+        monitor = self.start_live("monitor", "--seconds", "0.2")
+        error = monitor.communicate(timeout=PATIENCE)[1].decode()
+        self.assertIn("neither TELVON_RUNTIME_DIR nor XDG_RUNTIME_DIR is set", error.splitlines()[0])
+
+    def test_a_daemon_that_was_reached_is_enough(self):
+        self.start_daemon("--replay", self.write("world.pcap", pcap(MM_IDLE)))
+        monitor = self.start_live("monitor", "--seconds", "1")
+        _, error = monitor.communicate(timeout=PATIENCE)
+        self.assertEqual((monitor.returncode, error), (0, b""))
 
     def test_a_reader_that_leaves_ends_it(self):
         self.replay(MM_IDLE)
@@ -82,6 +113,13 @@ class Monitor(LiveTest):
         if b"SIM File dictionary data" not in error:
             self.skipTest("the SIM decoder does not exist yet")
         self.assertEqual(monitor.returncode, -signal.SIGABRT)
+
+    def test_the_end_by_an_assertion_is_told(self):
+        self.start_daemon("--replay", self.write("world.pcap", pcap(b"no property list")), technology="IFX")
+        monitor = self.start_live("monitor")
+        out, error = monitor.communicate(timeout=PATIENCE)
+        self.assertEqual((monitor.returncode, out), (-signal.SIGABRT, b""))
+        self.assertRegex(error.decode(), r"\Akelvasictl: Terminating: uncaught .+\n\Z")
 
 
 class MonitorOnATerminal(LiveTest):
@@ -106,6 +144,11 @@ class MonitorOnATerminal(LiveTest):
         self.start_daemon("--replay", self.write("world.pcap", pcap(MM_IDLE)))
         self.see(b"Connecting...\r\x1b[K")
         self.see(b"/Process CS/MM State\tMM_IDLE\x1b[K")
+
+    def test_what_it_ends_with_is_a_line_of_its_own(self):
+        self.start_monitor("--seconds", "1")
+        self.see(b"waiting for a telephony daemon in " + self.path("run").encode() + b"\r\n\r\x1b[KConnecting...")
+        self.see(b"Connecting...\r\x1b[Kkelvasictl: nothing came")
 
     def test_updates_are_drawn_over_one_another_without_clearing_in_between(self):
         self.start_daemon("--replay", self.write("world.pcap", pcap((0.0, MM_IDLE), (2.5, GMM_REGISTERED))))

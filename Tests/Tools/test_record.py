@@ -77,8 +77,36 @@ class Record(LiveTest):
     def test_the_file_is_a_capture_from_the_start(self):
         recorder = self.start_record("--seconds", "0.2")
         _, error = recorder.communicate(timeout=PATIENCE)
-        self.assertEqual(error.decode(), f"kelvasictl: 0 messages recorded in {self.path('a.pcap')}\n")
+        self.assertEqual(recorder.returncode, 1)
+        self.assertEqual(error.decode().splitlines(), [
+            f"kelvasictl: waiting for a telephony daemon in {self.path('run')}",
+            f"kelvasictl: 0 messages recorded in {self.path('a.pcap')}",
+            f"kelvasictl: nothing came from a telephony daemon in {self.path('run')}",
+        ])
         self.assertEqual(self.decode(self.path("a.pcap")).stdout, b"null\n")
+
+    def replayed(self, contents):
+        """What the daemon says of a capture that it plays to its end; the path of that is left out."""
+        world = self.write("world.pcap", contents)
+        daemon = self.start_daemon("--replay", world, "--speed", "max", "--leave")
+        self.start_record()
+        error = daemon.communicate(timeout=PATIENCE)[1].decode()
+        self.assertEqual(daemon.returncode, 0, error)
+        return [line.replace(world, "FILE") for line in error.splitlines() if line.startswith("telvon-sim: ")]
+
+    def test_a_daemon_tells_of_a_capture_cut_inside_a_packet(self):
+        said, end = self.replayed(pcap(MM_IDLE, MM_IDLE)[:-1])
+        self.assertTrue(said.startswith("telvon-sim: FILE: byte 56: truncated"), said)
+        self.assertEqual(end, "telvon-sim: the capture has been played")
+
+    def test_a_daemon_tells_of_packets_that_were_captured_in_part(self):
+        in_part = bytearray(pcap(MM_IDLE, MM_IDLE, MM_IDLE))
+        for number in (1, 2):  # the length that the packet had before it was captured
+            in_part[24 + number * (16 + len(MM_IDLE)) + 12] += 1
+        self.assertEqual(self.replayed(bytes(in_part)), [
+            "telvon-sim: FILE: 2 messages are not in the capture as a whole",
+            "telvon-sim: the capture has been played",
+        ])
 
     def test_a_place_that_cannot_be_written_is_named(self):
         self.assert_fault(self.run_program("record", self.path("missing/a.pcap")), "missing/a.pcap: No such file")
@@ -150,6 +178,14 @@ class RecordFromTheWire(LiveTest):
         time.sleep(max(0.0, started + 11 - time.monotonic()))
         recorder.send_signal(signal.SIGCONT)
         self.check(recorder, sent)
+
+    def test_a_malformed_frame_costs_its_connection_only(self):
+        recorder, messages = self.start_record()
+        messages.send(bytes(16))  # version 0
+        self.daemon.connect().send(wire.frame(wire.MESSAGE, MM_IDLE))
+        self.wait_for_size(24 + 2 * (16 + len(MM_IDLE)))
+        self.assertEqual(self.end(recorder)[0], 0)
+        self.assertEqual([message for _, message in packets(self.read("a.pcap"))], [MM_IDLE, MM_IDLE])
 
     def test_a_message_that_no_capture_takes_is_cut_and_reported(self):
         recorder, messages = self.start_record()

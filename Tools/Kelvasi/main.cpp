@@ -28,7 +28,7 @@ namespace {
 // False when the script that led the window failed.
 bool run(QtApplicationFramework& framework, const Options& options) {
   SyslogSystemLog log;
-  installTerminateHandler(log);
+  installTerminateHandler(log, "kelvasi");
   StandardOutputTrace trace;
   const LibplistSerialiser plists;
   const PackageResources resources;

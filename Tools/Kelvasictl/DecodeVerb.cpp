@@ -1,6 +1,8 @@
 // kelvasictl decode: captures in, the display out.
 #include <CLI/CLI.hpp>
 #include <array>
+#include <filesystem>
+#include <system_error>
 #include <vector>
 
 #include "Model/SnapshotFile.h"
@@ -133,6 +135,18 @@ std::string readTechnology(std::string& text) {
   return {};
 }
 
+// By whatever names; pipes and devices are not compared.
+bool isSameFile(const std::string& capture, const std::string& output) {
+  std::error_code error;
+  return std::filesystem::equivalent(capture == "-" ? "/dev/stdin" : capture, output, error);
+}
+
+void refuseInput(const DecodeOptions& options, const char* option, const std::string& output) {
+  for (const std::string& capture : options.captures) {
+    if (isSameFile(capture, output)) throw CLI::ValidationError(option, output + " is an input too");
+  }
+}
+
 void addOptions(CLI::App& verb, DecodeOptions& options) {
   verb.add_option("--technology", options.technology,
                   "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
@@ -164,6 +178,8 @@ Action declareDecode(CLI::App& verb) {
     if (!options->startCommand && options->captures.empty()) throw CLI::RequiredError("CAPTURE");
     if (options->everyTick && options->format != "json")
       throw CLI::ValidationError("--every-tick", "gives JSON only");
+    refuseInput(*options, "--dlf", options->dlf);
+    refuseInput(*options, "--snapshot", options->snapshot);
   });
   return [options] { return DecodeVerb(*options).run(); };
 }

@@ -2,6 +2,8 @@
 
 #include <CLI/CLI.hpp>
 
+#include "Platform/Qt/RuntimeDirectory.h"
+#include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
 
 namespace kelvasi {
@@ -13,10 +15,17 @@ using namespace std::chrono_literals;
 // A daemon that goes on sending is not waited for longer.
 constexpr auto drainLimit = 1000ms;
 
+std::string aDaemonThere() {
+  const RuntimeDirectory::Place place = RuntimeDirectory::look();
+  if (place.fault.empty()) return "a telephony daemon in " + place.path;
+  const std::string path = place.path.empty() ? "" : place.path + " ";
+  return "a telephony daemon; the runtime directory " + path + "is refused: " + place.fault;
+}
+
 }  // namespace
 
 void LiveOptions::addTo(CLI::App& verb) {
-  verb.add_option("--seconds", seconds, "end after so many seconds; otherwise at SIGINT or SIGTERM")
+  verb.add_option("--seconds", seconds, "end after so many seconds; otherwise at SIGINT, SIGTERM or SIGHUP")
       ->type_name("N")
       ->check(CLI::Range(0.0, 1e9));
   surroundings.addTo(verb);
@@ -29,15 +38,23 @@ LiveSession::LiveSession(const LiveOptions& options, KelvasiModel::ViewControlle
       daemon_(*surroundings_.log),
       model_(surroundings_.platform(), {queue_, ports_, daemon_}, std::move(onUpdate)) {}
 
+void LiveSession::connect() {
+  model_.restartMonitor();
+  if (!model_.isConnected()) complain("waiting for " + aDaemonThere());
+}
+
 void LiveSession::run() {
-  queue_.post([this] { model_.restartMonitor(); });
+  queue_.post([this] { connect(); });
+  int signal = 0;
   if (seconds_) {
-    loop_.runFor(std::chrono::milliseconds(static_cast<std::int64_t>(*seconds_ * 1000)));
+    signal = loop_.runFor(std::chrono::milliseconds(static_cast<std::int64_t>(*seconds_ * 1000)));
   } else {
-    loop_.run();
+    signal = loop_.run();
   }
   if (!hasEnded_) loop_.drain(drainLimit);
   if (error_) throw ToolError(*error_);
+  const bool timeIsOver = signal == 0 && !hasEnded_;
+  if (timeIsOver && !model_.logGenerator()) throw ToolError("nothing came from " + aDaemonThere());
 }
 
 void LiveSession::end(std::optional<std::string> error) {

@@ -30,13 +30,17 @@ class LiveSession {
   MainQueue& queue() { return queue_; }
   const Clock& clock() const { return surroundings_.clock; }
 
-  // Connects and runs until SIGINT, SIGTERM, the stated time or end(). What the sockets hold by a signal or
-  // by the end of that time is still taken in. Throws ToolError with what end() was given.
+  // Connects and runs until SIGINT, SIGTERM, SIGHUP, the stated time or end(). What the sockets hold by a
+  // signal or by the end of that time is still taken in. Says once where it waits when the first attempt
+  // reaches no daemon. Throws ToolError with what end() was given, and when the time has passed without a
+  // daemon that told its technology.
   void run();
   // From within run() only.
   void end(std::optional<std::string> error = std::nullopt);
 
  private:
+  void connect();
+
   QtEventLoop loop_;  // first: it wants to be made before all else
   std::optional<double> seconds_;
   Surroundings surroundings_;

@@ -50,7 +50,12 @@ class MonitorVerb {
     std::unique_ptr<Timer> statusTimer;
     if (::isatty(STDERR_FILENO) == 1)
       statusTimer = session_.queue().repeat(200ms, [this] { status_.show(session_.model().isConnected()); });
-    session_.run();
+    try {
+      session_.run();
+    } catch (const ToolError&) {
+      status_.show(true);  // so that the error has a line of its own
+      throw;
+    }
     status_.show(true);
     return exitSuccess;
   }

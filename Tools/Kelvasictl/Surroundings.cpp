@@ -50,7 +50,7 @@ Surroundings::Surroundings(const SurroundingsOptions& options)
     : log(makeLog(options.logsToStderr)),
       trace(makeTrace(options.logsToStderr)),
       resources(resourcesDirectory(options)) {
-  installTerminateHandler(*log);
+  installTerminateHandler(*log, options.logsToStderr ? "" : "kelvasictl");
 }
 
 }  // namespace kelvasi

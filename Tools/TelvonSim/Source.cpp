@@ -27,11 +27,18 @@ SourceResult scenarioSource(const Options& options, const PlistSerialiser& plist
               [kind, seed = options.seed, &plists] { return kind->make(seed, plists); })};
 }
 
+void tellFaults(const std::string& path, const CaptureReader& capture) {
+  if (capture.cutMessages() > 0)
+    std::fprintf(stderr, "telvon-sim: %s: %llu messages are not in the capture as a whole\n", path.c_str(),
+                 static_cast<unsigned long long>(capture.cutMessages()));
+  if (capture.fault()) std::fprintf(stderr, "telvon-sim: %s\n", capture.fault()->text().c_str());
+}
+
 SourceResult replaySource(const Options& options) {
   SourceResult result;
   result.source = std::make_unique<sim::ReplaySource>(
       [path = options.replay] { return openCapture(path); }, options.isLooping,
-      [](const CaptureFault& fault) { std::fprintf(stderr, "telvon-sim: %s\n", fault.text().c_str()); });
+      [path = options.replay](const CaptureReader& capture) { tellFaults(path, capture); });
   if (!result.source->nextAt())
     return {.source = nullptr, .failure = options.replay + ": no messages to play", .exitStatus = 1};
   return result;

@@ -1,16 +1,19 @@
 #include "Platform/Posix/Files.h"
 
+#include <fcntl.h>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <pthread.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
 #include <csignal>
 #include <fstream>
 #include <numeric>
 #include <thread>
 
+#include "Platform/Posix/FileDescriptor.h"
 #include "Tests/Platform/Posix/Surroundings.h"
 
 namespace kelvasi {
@@ -19,6 +22,7 @@ namespace {
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 using testing::TemporaryDirectory;
+using ::testing::UnorderedElementsAre;
 
 Bytes manyBytes(std::size_t count) {
   Bytes bytes(count);
@@ -160,6 +164,36 @@ TEST_F(FilesTest, AFileLeftOverUnderTheTemporaryNameIsNotTouched) {
   writeFile(leftOver, Bytes{9});
   EXPECT_EQ(replaceFile(path, Bytes{1}), std::nullopt);
   EXPECT_EQ(readFile(leftOver).bytes, Bytes{9});
+}
+
+TEST_F(FilesTest, AReplacementFollowsSymbolicLinks) {
+  std::filesystem::create_directory(directory.file("other"));
+  const std::string target = directory.file("other/target");
+  ASSERT_EQ(::symlink("second", path.c_str()), 0);
+  ASSERT_EQ(::symlink("other/target", directory.file("second").c_str()), 0);
+  EXPECT_EQ(replaceFile(path, Bytes{1}), std::nullopt);  // makes the target
+  EXPECT_EQ(readFile(target).bytes, Bytes{1});
+  EXPECT_EQ(replaceFile(path, Bytes{2, 3}), std::nullopt);
+  EXPECT_EQ(readFile(target).bytes, (Bytes{2, 3}));
+  EXPECT_TRUE(std::filesystem::is_symlink(path));
+  EXPECT_TRUE(std::filesystem::is_symlink(directory.file("second")));
+  EXPECT_THAT(namesIn(directory), UnorderedElementsAre("file", "second", "other"));
+}
+
+TEST_F(FilesTest, ALinkToItselfIsAnErrorAndStays) {
+  ASSERT_EQ(::symlink("file", path.c_str()), 0);
+  EXPECT_EQ(replaceFile(path, Bytes{1}), path + ": Too many levels of symbolic links");
+  EXPECT_TRUE(std::filesystem::is_symlink(path));
+}
+
+TEST_F(FilesTest, AReplacementIsWrittenIntoAPipe) {
+  ASSERT_EQ(::mkfifo(path.c_str(), 0600), 0);
+  const FileDescriptor reader(::open(path.c_str(), O_RDONLY | O_NONBLOCK));
+  EXPECT_EQ(replaceFile(path, Bytes{1, 2}), std::nullopt);
+  Bytes received(3);
+  EXPECT_EQ(::read(reader.number(), received.data(), received.size()), 2);
+  EXPECT_THAT(received, ElementsAre(1, 2, 0));
+  EXPECT_TRUE(std::filesystem::is_fifo(path));
 }
 
 }  // namespace

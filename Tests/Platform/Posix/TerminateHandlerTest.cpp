@@ -57,6 +57,31 @@ TEST(TerminateHandlerDeathTest, AMaskedLogStillAborts) {
   EXPECT_EXIT(endWith(SilentException(), LogLevel("emerg")), aborted, "^$");
 }
 
+// One that goes elsewhere.
+class SilentLog : public SystemLog {
+ public:
+  bool wants(LogPriority) const override { return true; }
+  void write(LogPriority, std::string_view) override {}
+};
+
+TEST(TerminateHandlerDeathTest, TellsTheUserTooWhereTheLogGoesElsewhere) {
+  static SilentLog log;
+  const auto end = [](const auto& exception) {
+    installTerminateHandler(log, "program");
+    [&]() noexcept { raise(exception); }();
+  };
+  EXPECT_EXIT(end(SpokenException("index 7 of 3")), aborted,
+              "^program: Terminating: uncaught kelvasi::SpokenException: index 7 of 3\n$");
+  EXPECT_EXIT(end(SpokenException("two\nlines")), aborted,
+              "^program: Terminating: uncaught kelvasi::SpokenException: two lines\n$");
+}
+
+TEST(TerminateHandlerDeathTest, TellsTheUserBeforeALogThatFails) {
+  static BrokenLog log;
+  EXPECT_EXIT((installTerminateHandler(log, "program"), std::terminate()), aborted,
+              "^program: Terminating: no exception is under way\n$");
+}
+
 TEST(TerminateHandlerDeathTest, ALogThatFailsItselfStillAborts) {
   static BrokenLog log;
   EXPECT_EXIT((installTerminateHandler(log), std::terminate()), aborted, "^$");
