@@ -8,6 +8,7 @@ namespace kelvasi {
 namespace {
 
 struct Free {
+  // NOLINTNEXTLINE(cppcoreguidelines-no-malloc): this is the RAII of what a library allocated
   void operator()(void* memory) const { std::free(memory); }
 };
 

@@ -39,7 +39,7 @@ PlistDate dateFromLibplist(plist_t node) {
 
 LibplistNode dateToLibplist(PlistDate date) {
   std::array<std::uint8_t, emptyDate.size()> document = emptyDate;
-  std::uint64_t bits = std::bit_cast<std::uint64_t>(date.secondsSince1970 - from1970To2001);
+  auto bits = std::bit_cast<std::uint64_t>(date.secondsSince1970 - from1970To2001);
   for (std::size_t place = datePlace + 8; place > datePlace; --place, bits >>= 8) {
     document[place] = static_cast<std::uint8_t>(bits & 0xff);
   }

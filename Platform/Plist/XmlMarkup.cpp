@@ -16,10 +16,10 @@ bool hasClosedQuotes(std::string_view text) {
 
 }  // namespace
 
-bool isPlistVersion(std::string_view text) {
+bool isPlistVersion(std::string_view attributes) {
   constexpr std::array<std::string_view, 5> known{"", "version=\"1.0\"", "version='1.0'", "version=\"0.9\"",
                                                   "version='0.9'"};
-  return std::ranges::find(known, text) != known.end();
+  return std::ranges::find(known, attributes) != known.end();
 }
 
 bool isPlainComment(std::string_view text) {

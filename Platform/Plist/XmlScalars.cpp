@@ -33,7 +33,7 @@ bool takeSign(std::string_view& text) {
 }
 
 std::size_t takeDigits(std::string_view& text) {
-  const std::size_t count = static_cast<std::size_t>(std::ranges::find_if_not(text, isDigit) - text.begin());
+  const auto count = static_cast<std::size_t>(std::ranges::find_if_not(text, isDigit) - text.begin());
   text.remove_prefix(count);
   return count;
 }

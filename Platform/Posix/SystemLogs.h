@@ -12,7 +12,7 @@
 namespace kelvasi {
 
 // Safe to use from several threads. One at a time: the connection to syslog is the process's.
-class SyslogSystemLog : public SystemLog {
+class SyslogSystemLog final : public SystemLog {
  public:
   explicit SyslogSystemLog(std::string identity = "kelvasi", LogLevel level = LogLevel::fromEnvironment());
   ~SyslogSystemLog() override;
@@ -29,7 +29,7 @@ class SyslogSystemLog : public SystemLog {
 };
 
 // Lines "<N>text", N the priority's number, each in one write. Safe to use from several threads.
-class StderrSystemLog : public SystemLog {
+class StderrSystemLog final : public SystemLog {
  public:
   explicit StderrSystemLog(LogLevel level = LogLevel::fromEnvironment());
 

@@ -30,6 +30,7 @@ std::atomic<const LastWords*>& lastWords() {
 }
 
 struct Free {
+  // NOLINTNEXTLINE(cppcoreguidelines-no-malloc): this is the RAII of what a library allocated
   void operator()(char* memory) const { std::free(memory); }
 };
 
