@@ -45,6 +45,7 @@ SystemScheme::SystemScheme(Changed changed) : changed_(std::move(changed)), sche
 void SystemScheme::askPortal() {
   auto bus = sessionBus();
   if (!bus) return;
+  qRegisterMetaType<QDBusVariant>();  // the bus finds no slot with a type that it has not met by its name
   bus->connect(service, path, settings, QStringLiteral("SettingChanged"), this,
                SLOT(portalSettingChanged(QString, QString, QDBusVariant)));
   auto question = QDBusMessage::createMethodCall(service, path, settings, QStringLiteral("Read"));

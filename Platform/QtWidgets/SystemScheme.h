@@ -1,7 +1,6 @@
 // Whether the desktop is light or dark, and when that changes.
 #pragma once
 
-// Whole, so that the meta-object knows the type: the bus connects no slot without it.
 #include <QDBusVariant>
 #include <QObject>
 #include <functional>

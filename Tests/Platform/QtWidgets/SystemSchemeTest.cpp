@@ -6,6 +6,7 @@
 
 #include <QApplication>
 #include <QDBusConnection>
+#include <QDBusMessage>
 #include <QDBusVariant>
 #include <QProcess>
 #include <QTest>
@@ -34,7 +35,7 @@ class Portal : public QObject {
   }
 };
 
-TEST(SystemScheme, AsksThePortal) {
+TEST(SystemScheme, AsksThePortalAndFollowsIt) {
   QProcess bus;
   bus.start("dbus-daemon", {"--session", "--nofork", "--nopidfile", "--print-address"});
   ASSERT_TRUE(bus.waitForStarted() && bus.waitForReadyRead()) << "there is no dbus-daemon";
@@ -53,6 +54,13 @@ TEST(SystemScheme, AsksThePortal) {
   EXPECT_EQ(scheme.scheme(), ColourScheme::light);
   ASSERT_TRUE(QTest::qWaitFor([&] { return changes.size() == 1; }, 60'000));
   EXPECT_THAT(changes, ElementsAre(ColourScheme::dark));
+
+  auto changed = QDBusMessage::createSignal("/org/freedesktop/portal/desktop",
+                                            "org.freedesktop.portal.Settings", "SettingChanged");
+  changed << QString(space) << QString(key) << QVariant::fromValue(QDBusVariant(2U));
+  ASSERT_TRUE(desk.send(changed));
+  ASSERT_TRUE(QTest::qWaitFor([&] { return changes.size() == 2; }, 60'000));
+  EXPECT_THAT(changes, ElementsAre(ColourScheme::dark, ColourScheme::light));
   QDBusConnection::disconnectFromBus("desk");
   bus.terminate();
   bus.waitForFinished();
