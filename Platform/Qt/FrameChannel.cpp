@@ -53,6 +53,8 @@ void FrameChannel::start(FrameHandler onFrame, EndHandler onEnd) {
   onFrame_ = std::move(onFrame);
   onEnd_ = std::move(onEnd);
   readNotifier_ = std::make_unique<QSocketNotifier>(socket_.get(), QSocketNotifier::Read);
+  // What a handler throws ends the program here, ahead of Qt, which must not be unwound.
+  // NOLINTNEXTLINE(bugprone-exception-escape)
   QObject::connect(readNotifier_.get(), &QSocketNotifier::activated, [this]() noexcept { readable(); });
   writeNotifier_ = std::make_unique<QSocketNotifier>(socket_.get(), QSocketNotifier::Write);
   writeNotifier_->setEnabled(false);
