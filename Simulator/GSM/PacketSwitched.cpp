@@ -99,7 +99,8 @@ void PacketSwitched::finishPhase(const Cell* cell) {
       return enter(Phase::attaching);
     case Phase::attaching:
     case Phase::updating:
-      return finishUpdate(*cell);
+      if (cell) finishUpdate(*cell);
+      return;
     case Phase::registered:
       return beginSomething();
     case Phase::requestingService:

@@ -38,7 +38,7 @@ class RadioConnection {
 
   static constexpr double securityModeSeconds = 0.6;
 
-  void follow(Need circuitSwitched, double seconds);
+  void follow(Need need, double seconds);
   void release(double seconds);
   void passBursts(double seconds);
   void enter(Stage stage);
