@@ -19,6 +19,12 @@ struct RecordRule {
   std::chrono::milliseconds atLeastEvery{10000};  // repeated although nothing changed
 };
 
+// An encoder that needs no property lists, as a rule takes it.
+template <auto encode, typename World>
+std::optional<Bytes> recordOf(const World& world, const PlistSerialiser&) {
+  return encode(world);
+}
+
 template <typename World>
 class RecordFeed {
  public:

@@ -3,28 +3,18 @@
 #pragma once
 
 #include "Simulator/C2K/World.h"
-#include "Simulator/RecordFeed.h"
-#include "Simulator/Scenario.h"
+#include "Simulator/Drive.h"
 
 namespace kelvasi::sim::c2k {
 
-class DriveScenario : public Scenario {
+class DriveScenario : public Drive<World> {
  public:
   // `plists` outlives the scenario.
   DriveScenario(std::uint64_t seed, const PlistSerialiser& plists);
 
-  WorldTime stepLength() const override { return std::chrono::milliseconds(200); }
-  void step(Messages& messages) override;
-  void greet(Messages& messages) override { feed_.all(now_, world_, messages); }
-
-  const World& world() const { return world_; }
-
  private:
-  void sendFrames(Messages& messages) const;
-
-  World world_;
-  RecordFeed<World> feed_;
-  WorldTime now_{0};
+  // The frames of the step, of which a record each tells.
+  void tellOfTheStep(Messages& messages) const override;
 };
 
 }  // namespace kelvasi::sim::c2k

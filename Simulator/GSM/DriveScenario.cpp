@@ -17,10 +17,6 @@ using namespace std::chrono_literals;
 using Rule = RecordRule<World>;
 using Record = std::optional<Bytes>;
 
-template <Record (*encode)(const World&)>
-Record of(const World& world, const PlistSerialiser&) {
-  return encode(world);
-}
 template <Bytes (*encode)(const Registration&)>
 Record ofRegistration(const World& world, const PlistSerialiser&) {
   return encode(world.registration());
@@ -45,38 +41,31 @@ constexpr std::array rules{
     Rule{.encode = ofRegistration<gmmStateRecord>},
     Rule{.encode = ofRegistration<registeredPlmnRecord>},
     Rule{.encode = ofRegistration<equivalentPlmnRecord>},
-    Rule{.encode = of<rrcStateRecord>},
-    Rule{.encode = of<umtsServingCellRecord>},
-    Rule{.encode = of<cipheringRecord>},
-    Rule{.encode = of<transmitPowerRecord>, .atMostEvery = 400ms},
-    Rule{.encode = of<cellSetsRecord>, .atMostEvery = 400ms},
-    Rule{.encode = of<neighbourSetsRecord>, .atMostEvery = 400ms},
-    Rule{.encode = of<hsdpaRecord>},
-    Rule{.encode = of<blockErrorRecord>},
-    Rule{.encode = of<rrStateRecord>},
-    Rule{.encode = of<gsmCellIdentityRecord>},
-    Rule{.encode = of<bsicListRecord>},
-    Rule{.encode = of<gsmMeasurementsRecord>, .atMostEvery = 400ms},
-    Rule{.encode = of<dedicatedChannelRecord>},
-    Rule{.encode = of<mobileAllocationRecord>},
-    Rule{.encode = of<dtxRecord>},
-    Rule{.encode = of<si13Record>},
-    Rule{.encode = of<packetAccessRecord>},
-    Rule{.encode = of<gprsCellOptionsRecord>},
-    Rule{.encode = of<pbcchRecord>},
-    Rule{.encode = of<packetStatusRecord>},
+    Rule{.encode = recordOf<rrcStateRecord>},
+    Rule{.encode = recordOf<umtsServingCellRecord>},
+    Rule{.encode = recordOf<cipheringRecord>},
+    Rule{.encode = recordOf<transmitPowerRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<cellSetsRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<neighbourSetsRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<hsdpaRecord>},
+    Rule{.encode = recordOf<blockErrorRecord>},
+    Rule{.encode = recordOf<rrStateRecord>},
+    Rule{.encode = recordOf<gsmCellIdentityRecord>},
+    Rule{.encode = recordOf<bsicListRecord>},
+    Rule{.encode = recordOf<gsmMeasurementsRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<dedicatedChannelRecord>},
+    Rule{.encode = recordOf<mobileAllocationRecord>},
+    Rule{.encode = recordOf<dtxRecord>},
+    Rule{.encode = recordOf<si13Record>},
+    Rule{.encode = recordOf<packetAccessRecord>},
+    Rule{.encode = recordOf<gprsCellOptionsRecord>},
+    Rule{.encode = recordOf<pbcchRecord>},
+    Rule{.encode = recordOf<packetStatusRecord>},
 };
 
 }  // namespace
 
 DriveScenario::DriveScenario(std::uint64_t seed, const PlistSerialiser& plists)
-    : world_(Random(seed)), feed_(rules, plists) {}
-
-void DriveScenario::step(Messages& messages) {
-  const auto before = world_.situation();
-  now_ += stepLength();
-  world_.pass(std::chrono::duration<double>(stepLength()).count());
-  feed_.advance(now_, world_, world_.situation() != before, messages);
-}
+    : Drive(rules, plists, Random(seed)) {}
 
 }  // namespace kelvasi::sim::gsm

@@ -2,27 +2,15 @@
 // technology.
 #pragma once
 
+#include "Simulator/Drive.h"
 #include "Simulator/GSM/World.h"
-#include "Simulator/RecordFeed.h"
-#include "Simulator/Scenario.h"
 
 namespace kelvasi::sim::gsm {
 
-class DriveScenario : public Scenario {
+class DriveScenario : public Drive<World> {
  public:
   // `plists` outlives the scenario.
   DriveScenario(std::uint64_t seed, const PlistSerialiser& plists);
-
-  WorldTime stepLength() const override { return std::chrono::milliseconds(200); }
-  void step(Messages& messages) override;
-  void greet(Messages& messages) override { feed_.all(now_, world_, messages); }
-
-  const World& world() const { return world_; }
-
- private:
-  World world_;
-  RecordFeed<World> feed_;
-  WorldTime now_{0};
 };
 
 }  // namespace kelvasi::sim::gsm

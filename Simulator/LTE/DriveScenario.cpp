@@ -14,10 +14,6 @@ using namespace std::chrono_literals;
 using Rule = RecordRule<World>;
 using Record = std::optional<Bytes>;
 
-template <Record (*encode)(const World&)>
-Record of(const World& world, const PlistSerialiser&) {
-  return encode(world);
-}
 Record ofCellList(const World& world, const PlistSerialiser& plists) {
   return cellInfoRecord(cellListOf(world), plists);
 }
@@ -33,24 +29,17 @@ constexpr std::array rules{
     Rule{.encode = ofSim, .atMostEvery = 24h, .atLeastEvery = 24h},
     Rule{.encode = ofCellList, .atMostEvery = 2s},
     Rule{.encode = ofContexts, .atMostEvery = 2s},
-    Rule{.encode = of<transmitAntennasRecord>},
-    Rule{.encode = of<servingCellRecord>},
-    Rule{.encode = of<servingCellMeasurementRecord>, .atMostEvery = 400ms},
-    Rule{.encode = of<neighborMeasurementRecord>, .atMostEvery = 400ms},
-    Rule{.encode = of<reselectionCandidatesRecord>, .atMostEvery = 400ms},
-    Rule{.encode = of<connectedModeMeasurementRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<transmitAntennasRecord>},
+    Rule{.encode = recordOf<servingCellRecord>},
+    Rule{.encode = recordOf<servingCellMeasurementRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<neighborMeasurementRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<reselectionCandidatesRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<connectedModeMeasurementRecord>, .atMostEvery = 400ms},
 };
 
 }  // namespace
 
 DriveScenario::DriveScenario(std::uint64_t seed, const PlistSerialiser& plists)
-    : world_(Random(seed)), feed_(rules, plists) {}
-
-void DriveScenario::step(Messages& messages) {
-  const auto before = world_.situation();
-  now_ += stepLength();
-  world_.pass(std::chrono::duration<double>(stepLength()).count());
-  feed_.advance(now_, world_, world_.situation() != before, messages);
-}
+    : Drive(rules, plists, Random(seed)) {}
 
 }  // namespace kelvasi::sim::lte

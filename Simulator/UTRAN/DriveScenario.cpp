@@ -16,10 +16,6 @@ using namespace std::chrono_literals;
 using Rule = RecordRule<World>;
 using Record = std::optional<Bytes>;
 
-template <Record (*encode)(const World&)>
-Record of(const World& world, const PlistSerialiser&) {
-  return encode(world);
-}
 Record ofCellList(const World& world, const PlistSerialiser& plists) {
   return cellInfoRecord(gsm::cellListOf(world), plists);
 }
@@ -35,23 +31,16 @@ constexpr std::array rules{
     Rule{.encode = ofSim, .atMostEvery = 24h, .atLeastEvery = 24h},
     Rule{.encode = ofCellList, .atMostEvery = 2s},
     Rule{.encode = ofContexts, .atMostEvery = 2s},
-    Rule{.encode = of<rrcStateRecord>},
-    Rule{.encode = of<servingCellRecord>},
-    Rule{.encode = of<neighborCellsRecord>, .atMostEvery = 400ms},
-    Rule{.encode = of<gsmNeighborCellsRecord>, .atMostEvery = 400ms},
-    Rule{.encode = of<channelMeasurementRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<rrcStateRecord>},
+    Rule{.encode = recordOf<servingCellRecord>},
+    Rule{.encode = recordOf<neighborCellsRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<gsmNeighborCellsRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<channelMeasurementRecord>, .atMostEvery = 400ms},
 };
 
 }  // namespace
 
 DriveScenario::DriveScenario(std::uint64_t seed, const PlistSerialiser& plists)
-    : world_(Random(seed), layOutCells), feed_(rules, plists) {}
-
-void DriveScenario::step(Messages& messages) {
-  const auto before = world_.situation();
-  now_ += stepLength();
-  world_.pass(std::chrono::duration<double>(stepLength()).count());
-  feed_.advance(now_, world_, world_.situation() != before, messages);
-}
+    : Drive(rules, plists, Random(seed), layOutCells) {}
 
 }  // namespace kelvasi::sim::utran
