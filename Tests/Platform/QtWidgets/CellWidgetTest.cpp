@@ -4,19 +4,9 @@
 namespace kelvasi {
 namespace {
 
+using test::differenceOf;
 using test::RowContents;
 using test::RowsController;
-
-// The rectangle around the pixels in which two pictures differ; null when they are the same.
-QRect differenceOf(const QImage& one, const QImage& other) {
-  QRect difference;
-  for (int y = 0; y < one.height(); ++y) {
-    for (int x = 0; x < one.width(); ++x) {
-      if (one.pixel(x, y) != other.pixel(x, y)) difference |= QRect(x, y, 1, 1);
-    }
-  }
-  return difference;
-}
 
 class CellWidgetTest : public test::QtFixture {
  protected:

@@ -18,6 +18,17 @@
 
 namespace kelvasi::test {
 
+// The rectangle around the pixels in which two pictures differ; null when they are the same.
+inline QRect differenceOf(const QImage& one, const QImage& other) {
+  QRect difference;
+  for (int y = 0; y < one.height(); ++y) {
+    for (int x = 0; x < one.width(); ++x) {
+      if (one.pixel(x, y) != other.pixel(x, y)) difference |= QRect(x, y, 1, 1);
+    }
+  }
+  return difference;
+}
+
 // Names what a row is given to show.
 struct RowContents {
   std::string text;

@@ -2,10 +2,15 @@
 #include <QLabel>
 
 #include "Platform/QtWidgets/BarButton.h"
+#include "Platform/QtWidgets/Fonts.h"
+#include "Platform/QtWidgets/NavigationBar.h"
 #include "Tests/Platform/QtWidgets/QtFixture.h"
 
 namespace kelvasi {
 namespace {
+
+using test::RowContents;
+using test::RowsController;
 
 class TextFitTest : public test::QtFixture {
  protected:
@@ -33,6 +38,16 @@ class TextFitTest : public test::QtFixture {
     EXPECT_EQ(labelsSeen, labels);
   }
 
+  // What a text adds to a picture is as wide and as high as the text, nothing of it cut off or left out.
+  static void expectWhole(const QImage& with, const QImage& without, const std::string& text,
+                          const Font& font) {
+    const double scale = with.devicePixelRatio();
+    const QRect drawn = test::differenceOf(with, without);
+    const QRectF tight = QFontMetricsF(qtFont(font)).tightBoundingRect(qtText(text));
+    EXPECT_NEAR(drawn.width() / scale, tight.width(), 2) << text;
+    EXPECT_NEAR(drawn.height() / scale, tight.height(), 2) << text;
+  }
+
  private:
   static double widthOf(const QLabel& label) {
     return QFontMetricsF(label.font()).horizontalAdvance(label.text());
@@ -41,7 +56,7 @@ class TextFitTest : public test::QtFixture {
 
 TEST_F(TextFitTest, BarsShowTitleWayBackStatusAndSave) {
   showRows(3).setTitle("Kelvasi");
-  test::RowsController& pane = push(3, "Registration");
+  RowsController& pane = push(3, "Registration");
   const std::string status = "Updated 2024-03-05 at 14:07:09";
   const Font font = Font::system(14);
   stack->setToolbarHidden(false, false);
@@ -50,6 +65,28 @@ TEST_F(TextFitTest, BarsShowTitleWayBackStatusAndSave) {
                         FlexibleSpace{}, SaveButton{[] {}}},
                        true);
   expectRoomForTexts(2, 1);
+}
+
+TEST_F(TextFitTest, ATitleIsWhole) {
+  RowsController& pane = showRows(3);
+  const std::string title = "Gg Serving Cell Measurements";
+  auto* const bar = the<NavigationBar>();
+  pane.setTitle("");
+  settle();
+  const QImage without = bar->grab().toImage();
+  pane.setTitle(title);
+  settle();
+  expectWhole(bar->grab().toImage(), without, title, Font::boldSystem(17));
+}
+
+TEST_F(TextFitTest, ARowsTextIsWhole) {
+  const std::string text = "Ranking Value, Jj";
+  const auto picture = [this](const std::string& shown) {
+    const RowsController& pane = showRows(1, [shown](std::size_t) { return RowContents{.text = shown}; });
+    return tableOf(pane).cellAt(0)->grab().toImage();
+  };
+  const QImage with = picture(text);
+  expectWhole(with, picture(""), text, Font::system(17));
 }
 
 TEST_F(TextFitTest, TheSaveFormShowsItsTexts) {
