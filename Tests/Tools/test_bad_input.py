@@ -37,8 +37,10 @@ class BadCaptures(KelvasictlTest):
     def test_a_fault_ends_the_decoding_before_the_next_capture(self):
         broken = self.write("a.pcap", pcap(MM_IDLE)[:-1])
         result = self.decode(broken, self.write("b.pcap", pcap(GMM_REGISTERED)))
-        self.assert_fault(result, "a.pcap: byte 24: ")
+        self.assert_fault(result, "a.pcap: byte 24: ", "; the 1 after it was not read")
         self.assertEqual(result.stdout, b"null\n")
+        missing = self.decode(self.path("missing.pcap"), broken, broken)
+        self.assert_fault(missing, "missing.pcap: No such file or directory; the 2 after it were not read")
 
     def test_another_link_type_is_refused(self):
         result = self.decode(self.write("a.pcap", pcap(MM_IDLE, link_type=1)))
@@ -65,7 +67,8 @@ class WrongUsage(KelvasictlTest):
         gsm = ["decode", "--technology", "Orvane_GSM"]
         for arguments in ([], ["unknown"], ["decode", capture], gsm, [*gsm, "--unknown", capture],
                           [*gsm, "--format", "yaml", capture], ["decode", "--technology", "GSM", capture],
-                          ["monitor", "--format", "plist"], ["monitor", "--seconds", "x"], ["record"]):
+                          [*gsm, "--snapshot", "", capture],
+                          [*gsm, "--dlf", "", capture], ["monitor", "--format", "plist"], ["monitor", "--seconds", "x"], ["record"]):
             with self.subTest(arguments):
                 result = self.run_program(*arguments)
                 self.assert_fault(result, "(try --help)", status=2)

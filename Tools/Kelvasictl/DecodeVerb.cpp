@@ -70,9 +70,9 @@ class DecodeVerb {
       save(decode.saveContents());
     } catch (const ToolError& error) {
       if (!fault) throw;
-      throw ToolError(fault->text() + "; " + error.what());  // the capture's fault came first
+      throw ToolError(*fault + "; " + error.what());  // the capture's fault came first
     }
-    if (fault) throw ToolError(fault->text());
+    if (fault) throw ToolError(*fault);
     return exitSuccess;
   }
 
@@ -84,17 +84,24 @@ class DecodeVerb {
     };
   }
 
-  // Up to the first that has a fault.
-  std::optional<CaptureFault> decodeCaptures(Decode& decode) const {
+  // Up to the first that has a fault, which it returns.
+  std::optional<std::string> decodeCaptures(Decode& decode) const {
+    std::size_t notRead = options_.captures.size();
     for (const std::string& path : options_.captures) {
+      --notRead;
       const auto capture = openCapture(path);
       decode.take(*capture);
       if (capture->cutMessages() > 0)
         complain(path + ": " + std::to_string(capture->cutMessages()) +
                  " messages are not in the capture as a whole");
-      if (capture->fault()) return capture->fault();
+      if (capture->fault()) return capture->fault()->text() + saidOf(notRead);
     }
     return std::nullopt;
+  }
+
+  static std::string saidOf(std::size_t notRead) {
+    if (notRead == 0) return {};
+    return "; the " + std::to_string(notRead) + " after it " + (notRead == 1 ? "was" : "were") + " not read";
   }
 
   void printDisplay(const PlistValue& display) const {
@@ -147,6 +154,11 @@ void refuseInput(const DecodeOptions& options, const char* option, const std::st
   }
 }
 
+// A variable of a shell script that was never set is no wish for no file.
+std::string named(const std::string& file) {
+  return file.empty() ? "the file's name is empty" : "";
+}
+
 void addOptions(CLI::App& verb, DecodeOptions& options) {
   verb.add_option("--technology", options.technology,
                   "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
@@ -159,8 +171,9 @@ void addOptions(CLI::App& verb, DecodeOptions& options) {
   verb.add_flag("--every-tick", options.everyTick,
                 "a JSON line {\"time\": ..., \"display\": ...} for each display tick");
   verb.add_option("--dlf", options.dlf, "also write the DLF file that a snapshot would hold")
-      ->type_name("FILE");
-  verb.add_option("--snapshot", options.snapshot, "also write a snapshot")->type_name("FILE");
+      ->type_name("FILE")
+      ->check(named);
+  verb.add_option("--snapshot", options.snapshot, "also write a snapshot")->type_name("FILE")->check(named);
   verb.add_option("--description", options.description, "the snapshot's description")->type_name("TEXT");
   verb.add_flag("--start-command", options.startCommand,
                 "print the command that starts the stream, as a property list, and end");
