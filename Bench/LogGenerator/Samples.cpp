@@ -62,9 +62,12 @@ std::span<const Technology> technologies() {
 
 Bytes makeRecord(const Sample& sample, Random& random) {
   if (sample.payload) return listRecord(sample.logCode, sample.payload(random));
+  if (sample.record) return sample.record(random);
   RecordWriter writer(sample.logCode, sample.layout, sample.length);
   fill(writer, sample.layout, sample.below, random);
-  if (!sample.fixed.name.empty()) writer.set(sample.fixed.name, sample.fixed.value);
+  for (const FieldValue& fixed : sample.fixed) {
+    if (!fixed.name.empty()) writer.set(fixed.name, fixed.value);
+  }
   for (const SampleList& list : sample.lists) {
     if (list.size == 0) continue;
     writer.set(list.entries.count.name, static_cast<std::int64_t>(list.size - list.entries.uncounted));

@@ -36,7 +36,9 @@ struct Sample {
   // Fields hold any value that fits and is below this; it keeps states to those that have a name.
   std::uint64_t below = std::numeric_limits<std::uint64_t>::max();
   std::array<SampleList, 2> lists = {};
-  FieldValue fixed = {};  // the same in every record
+  std::array<FieldValue, 2> fixed = {};  // the same in every record
+  // Of a record that is not fields and lists alone: all of it.
+  Bytes (*record)(Random& random) = nullptr;
   // Of a record of the telephony daemon itself: its property list.
   PlistValue (*payload)(Random& random) = nullptr;
 };

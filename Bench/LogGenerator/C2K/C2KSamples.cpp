@@ -4,6 +4,8 @@
 #include "LogGenerator/C2K/EvdoRates.h"
 #include "LogGenerator/C2K/EvdoStatus.h"
 #include "LogGenerator/C2K/Fingers.h"
+#include "LogGenerator/C2K/SystemParameters.h"
+#include "Simulator/C2K/OneXRecords.h"
 
 namespace kelvasi::bench {
 
@@ -17,6 +19,17 @@ constexpr EntryList allFingers{.count = fieldIn(fingers::layout, "count"),
                                .start = fingers::firstFinger,
                                .stride = fingers::fingerSize,
                                .layout = fingers::fingerLayout};
+
+// A drive of up to two minutes: now in a call, now without a system.
+Bytes deviceStatus(Random& random) {
+  sim::c2k::World world{sim::Random(random.below(1000))};
+  for (std::uint64_t seconds = random.below(120); seconds > 0; --seconds) world.pass(1);
+  return *sim::c2k::deviceStatusRecord(world);
+}
+
+Bytes trafficFrame(Random& random) {
+  return sim::c2k::trafficFrameRecord(random.below(64) == 0);
+}
 
 }  // namespace
 
@@ -39,6 +52,14 @@ std::span<const Sample> c2kSamples() {
              .length = fingers::minimumLength,
              .layout = fingers::layout,
              .lists = {{{allFingers, 6}}}},
+      Sample{.name = "0x119C 1x device status", .share = 10, .record = deviceStatus},
+      Sample{.name = "0x119D 1x traffic frame", .share = 50, .record = trafficFrame},
+      Sample{.name = "0x134F 1x system parameters",
+             .logCode = systemParameters::logCode,
+             .length = systemParameters::minimumLength,
+             .layout = systemParameters::layout,
+             .fixed = {{{"version", systemParameters::minimumVersion},
+                        {"system type", systemParameters::cdmaSystem}}}},
   };
   return samples;
 }

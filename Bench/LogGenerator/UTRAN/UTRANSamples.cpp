@@ -19,7 +19,7 @@ std::span<const Sample> utranSamples() {
              .length = utran::rrcState::expectedLength,
              .layout = utran::rrcState::layout,
              .below = 6,
-             .fixed = {"layout version", utran::rrcState::knownVersion}},
+             .fixed = {{{"layout version", utran::rrcState::knownVersion}}}},
       Sample{.name = "0xD00A 8 UTRAN cells",
              .share = 20,
              .logCode = neighborCells::logCode,
