@@ -202,6 +202,19 @@ TEST_F(SaveInterfaceTest, AnimatedItRisesAndSinks) {
   while (the<SlideOverlay>()) QTest::qWait(1);
 }
 
+// A button that its shortcut pressed is clicked a moment later, perhaps between the two.
+TEST_F(SaveInterfaceTest, AClickAfterTheControllerIsGoneAndBeforeItsWidgetsAreRunsNoAction) {
+  auto interface = ui->loadInterface(resource);
+  int used = 0;
+  interface->setAction("savePressed", [&used] { ++used; });
+  const QPointer<BarButton> save = widgetOf(interface->view()).findChild<BarButton*>("saveSnapshot");
+  save->click();
+  interface.reset();
+  ASSERT_NE(save, nullptr);
+  save->click();
+  EXPECT_EQ(used, 1);
+}
+
 TEST_F(SaveInterfaceTest, TheStackMayGoWhileTheViewIsOpen) {
   present();
   stack.reset();
