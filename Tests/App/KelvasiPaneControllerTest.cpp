@@ -134,6 +134,14 @@ TEST_F(KelvasiPaneControllerTest, AValueCellUsedAgainForABranchKeepsWhereItsValu
   EXPECT_EQ(view.frameSet, (Rect{0, 0, 320, 50}));
 }
 
+// The content area ends where the accessory begins.
+TEST_F(KelvasiPaneControllerTest, ARowIsLaidOutWithItsNewAccessory) {
+  KelvasiPaneController& pane = show(branch("Root", {leaf("A", "a"), branch("B")}));
+  pane.reloadWithNode(branch("Root", {branch("A"), leaf("B", "b")}));
+  EXPECT_EQ(table().body(0).laidOutWith, CellAccessory::disclosureIndicator);
+  EXPECT_EQ(table().body(1).laidOutWith, CellAccessory::none);
+}
+
 TEST_F(KelvasiPaneControllerTest, AReloadTakesTitleAndRowsFromTheNewNode) {
   KelvasiPaneController& pane = show(branch("Old", {leaf("A", "1")}));
   pane.reloadWithNode(branch("New", {leaf("A", "2"), leaf("B", "3")}));

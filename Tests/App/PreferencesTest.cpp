@@ -24,6 +24,16 @@ TEST_F(PreferencesTest, AnAbsentPreferenceSwitchesTheShellsDisplayOnAndTellsIt) 
   EXPECT_TRUE(application.unsetRSSI());
 }
 
+TEST_F(PreferencesTest, TheDisplayIsSwitchedBeforeTheMarkerIsLookedForAndBeforeThereIsAWindow) {
+  std::size_t noted = 0;
+  files.asked = [&] {
+    noted = preferences.journal.size();
+    EXPECT_EQ(application.window(), nullptr);
+  };
+  launch();
+  EXPECT_EQ(noted, 3U);
+}
+
 TEST_F(PreferencesTest, AFalsePreferenceSwitchesItOnToo) {
   preferences.values[{own, key}] = false;
   launch();
