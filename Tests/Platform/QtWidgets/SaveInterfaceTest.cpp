@@ -2,6 +2,7 @@
 #include <QLineEdit>
 #include <QPointer>
 #include <QSignalSpy>
+#include <QWindow>
 
 #include "Platform/QtWidgets/AlertLayer.h"
 #include "Platform/QtWidgets/BarButton.h"
@@ -153,6 +154,16 @@ TEST_F(SaveInterfaceTest, TabStaysInTheForm) {
   for (int press = 0; press < 10; ++press) {
     key(Qt::Key_Tab);
     EXPECT_TRUE(widgetOf(shown.view()).isAncestorOf(QApplication::focusWidget()));
+  }
+}
+
+TEST_F(SaveInterfaceTest, TabComesBackIntoTheFormAfterTheFieldGaveUpTheKeyboard) {
+  Form& shown = present();
+  for (const Qt::Key pressed : {Qt::Key_Backtab, Qt::Key_Tab}) {
+    shown.field().resignFirstResponder();
+    QTest::keyClick(windowWidget().windowHandle(), pressed);
+    EXPECT_TRUE(widgetOf(shown.view()).isAncestorOf(QApplication::focusWidget())) << pressed;
+    edit().setFocus();
   }
 }
 
