@@ -291,6 +291,15 @@ TEST_F(AlertTest, KeepsTheKeyboardWhileThePaneBelowItGoesAndComes) {
   EXPECT_EQ(QApplication::focusWidget(), &tableOf(static_cast<RowsController&>(stack->topViewController())));
 }
 
+TEST_F(AlertTest, ItStaysAboveAViewThatIsPresentedLater) {
+  showRows(3);
+  const AlertLayer& shown = alert();
+  form = std::make_unique<Form>(ui->loadInterface(resource));
+  stack->presentModalViewController(*form, true);
+  settle();
+  EXPECT_TRUE(shown.isAncestorOf(windowWidget().childAt(195, 400)));
+}
+
 TEST_F(AlertTest, ItGoesWithItsWindow) {
   showRows(3);
   const QPointer<AlertLayer> shown = &alert();
