@@ -56,7 +56,7 @@ void InterfacePage::setAction(std::string_view name, std::function<void()> actio
   buttons.append(dynamic_cast<QAbstractButton*>(&widget()));
   for (QAbstractButton* const button : buttons) {
     if (button->property("action").toString() == qtText(name))
-      QObject::connect(button, &QAbstractButton::clicked, &widget(), [action] { action(); });
+      QObject::connect(button, &QAbstractButton::clicked, &actions_, [action] { action(); });
   }
 }
 

@@ -2,6 +2,7 @@
 // through uic, so that a fault in one stops the build and no reader of such files is needed to run.
 #pragma once
 
+#include <QObject>
 #include <map>
 #include <memory>
 #include <string>
@@ -31,6 +32,7 @@ class InterfacePage : public PageBody<InterfaceBody> {
   QWidget* find(std::string_view name);
 
   std::map<std::string, std::unique_ptr<QtTextField>, std::less<>> fields_;
+  QObject actions_;  // ends them with the page: its widgets go a little later
 };
 
 }  // namespace kelvasi

@@ -1,6 +1,7 @@
 #include "Platform/QtWidgets/Layer.h"
 
 #include <QApplication>
+#include <QKeyEvent>
 #include <QMouseEvent>
 
 namespace kelvasi {
@@ -19,12 +20,20 @@ Layer::~Layer() {
 
 bool Layer::eventFilter(QObject* watched, QEvent* event) {
   if (event->type() == QEvent::Resize && watched == parent()) setGeometry(parentWidget()->rect());
-  return QWidget::eventFilter(watched, event);
+  return isTabOfNobody(watched, *event) || QWidget::eventFilter(watched, event);
+}
+
+// Where no widget has the keyboard, its keys go to the window, which would hand it to what lies beneath.
+bool Layer::isTabOfNobody(QObject* watched, QEvent& event) {
+  if (event.type() != QEvent::KeyPress || watched != parent() || QApplication::focusWidget()) return false;
+  const int key = dynamic_cast<QKeyEvent&>(event).key();
+  return (key == Qt::Key_Tab || key == Qt::Key_Backtab) && focusNextPrevChild(key == Qt::Key_Tab);
 }
 
 bool Layer::focusNextPrevChild(bool next) {
-  QWidget* const from = QApplication::focusWidget();
-  for (QWidget* widget = from ? from : this;;) {
+  QWidget* const focused = QApplication::focusWidget();
+  QWidget* const from = focused ? focused : this;
+  for (QWidget* widget = from;;) {
     widget = next ? widget->nextInFocusChain() : widget->previousInFocusChain();
     if (widget == from || !widget) return true;
     const bool takesTab = (widget->focusPolicy() & Qt::TabFocus) != 0;

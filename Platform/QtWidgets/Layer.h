@@ -18,6 +18,8 @@ class Layer : public QWidget {
   void mousePressEvent(QMouseEvent* event) override;
 
  private:
+  bool isTabOfNobody(QObject* watched, QEvent& event);
+
   QPointer<QWidget> focusBefore_;
 };
 

@@ -43,6 +43,8 @@ TEST_F(KelvasiAppTest, TheWindowTakesTheWholeScreenAndHoldsTheStack) {
   EXPECT_EQ(ui.window->root, ui.stack);
   EXPECT_TRUE(ui.stack->view().isIn(ui.window->subviews));
   EXPECT_TRUE(ui.window->isVisible);
+  EXPECT_THAT(ui.journal,
+              ElementsAre("window gets its root", "window gets a subview", "window visible", "show Kelvasi"));
 }
 
 TEST_F(KelvasiAppTest, TheRootPaneFirstSaysConnectingThenConnectingWithDots) {
@@ -145,6 +147,7 @@ TEST_F(KelvasiAppTest, WhileDisconnectedARefreshReloadsAllPanesAndSaysConnecting
   receiveList(contexts("10.0.0.9"));
   *link.remoteValid = false;
   link.daemonIsThere = false;
+  surroundings.clock.time.secondsSince1970 += 60;
   std::vector<int> reloads;
   for (std::size_t place = 0; place < depth(); ++place)
     reloads.push_back(ui.pane(place).tableView().reloads + 1);
@@ -166,6 +169,14 @@ TEST_F(KelvasiAppTest, APaneAboutToBeShownSaysConnectingWhileDisconnected) {
   ui.topPane().tableView().tap(listRow());
   EXPECT_EQ(status(), "Connecting...");
   EXPECT_TRUE(isLoading());
+}
+
+TEST_F(KelvasiAppTest, APaneAboutToBeShownBeforeTheFirstDataSaysConnectingWithoutASpinner) {
+  launch();
+  application.navigationControllerWillShowViewControllerAnimated(*ui.stack, ui.stack->topViewController(),
+                                                                 true);
+  EXPECT_EQ(status(), "Connecting...");
+  EXPECT_FALSE(isLoading());
 }
 
 TEST_F(KelvasiAppTest, WithoutAGeneratorTheRootPaneKeepsItsDefaultTitle) {

@@ -128,10 +128,12 @@ TEST_F(KelvasiCellTest, JustUnderAnExactFitStandsFlushRight) {
 TEST_F(KelvasiCellTest, TheContentAreasOriginMovesKeyAndLateValueButNotAFlushOne) {
   table.contentArea = {7, 5, 320, 44};
   layOut({80, 18}, {100, 18});
-  EXPECT_EQ(key().frameSet.x, 17);
-  EXPECT_EQ(value().frameSet.x, 220);
+  EXPECT_EQ(key().frameSet, (Rect{17, 13, 80, 18}));
+  EXPECT_EQ(value().frameSet, (Rect{220, 13, 100, 18}));
   EXPECT_EQ(view().frameSet, (Rect{7, 5, 320, 50}));
   layOut({80, 18}, {250, 18});
+  EXPECT_EQ(value().frameSet.x, 147);
+  layOut({80, 18}, {180, 18});  // fits exactly
   EXPECT_EQ(value().frameSet.x, 147);
 }
 

@@ -119,6 +119,29 @@ TEST_F(KelvasiPaneControllerTest, AValueCellUsedAgainForABranchHasAnEmptyValue) 
   EXPECT_EQ(table().body(0).accessory, CellAccessory::disclosureIndicator);
 }
 
+// Its key is placed anew and nothing else: a long value leaves a row that scrolls.
+TEST_F(KelvasiPaneControllerTest, AValueCellUsedAgainForABranchKeepsWhereItsValueAndHowWideItsContentWas) {
+  ui.sizes[{"A", true}] = {80, 18};
+  ui.sizes[{"long", true}] = {250, 18};
+  ui.sizes[{"Another", true}] = {120, 20};
+  KelvasiPaneController& pane = show(branch("Root", {leaf("A", "long")}));
+  pane.reloadWithNode(branch("Root", {branch("Another")}));
+  const auto& view =
+      dynamic_cast<const test::MemoryScrollView&>(*table().body(0).contentView().subviews.parts().at(0));
+  EXPECT_EQ(static_cast<const test::MemoryLabel&>(cell(0).key()).frameSet, (Rect{10, 12, 120, 20}));
+  EXPECT_EQ(static_cast<const test::MemoryLabel&>(*cell(0).value()).frameSet, (Rect{140, 13, 250, 18}));
+  EXPECT_EQ(view.contentSize, (Size{650, 50}));
+  EXPECT_EQ(view.frameSet, (Rect{0, 0, 320, 50}));
+}
+
+// The content area ends where the accessory begins.
+TEST_F(KelvasiPaneControllerTest, ARowIsLaidOutWithItsNewAccessory) {
+  KelvasiPaneController& pane = show(branch("Root", {leaf("A", "a"), branch("B")}));
+  pane.reloadWithNode(branch("Root", {branch("A"), leaf("B", "b")}));
+  EXPECT_EQ(table().body(0).laidOutWith, CellAccessory::disclosureIndicator);
+  EXPECT_EQ(table().body(1).laidOutWith, CellAccessory::none);
+}
+
 TEST_F(KelvasiPaneControllerTest, AReloadTakesTitleAndRowsFromTheNewNode) {
   KelvasiPaneController& pane = show(branch("Old", {leaf("A", "1")}));
   pane.reloadWithNode(branch("New", {leaf("A", "2"), leaf("B", "3")}));
@@ -163,6 +186,16 @@ TEST_F(KelvasiPaneControllerTest, WithThePermissionTheSaveButtonComesLast) {
   ASSERT_TRUE(body().hasSaveButton());
   body().pressSave();
   EXPECT_EQ(shell.shown, 1);
+}
+
+TEST_F(KelvasiPaneControllerTest, EveryNewToolbarAsksForThePermissionAgain) {
+  KelvasiPaneController& pane = show(nullptr);
+  shell.allows = true;
+  pane.reloadWithNode(nullptr);
+  EXPECT_EQ(body().items.size(), 4U);
+  shell.allows = false;
+  pane.setStatus("text", false);
+  EXPECT_EQ(body().items.size(), 3U);
 }
 
 TEST_F(KelvasiPaneControllerTest, NoStatusIsShownAsAnEmptyOne) {

@@ -152,6 +152,18 @@ TEST_F(KelvasiSaveViewControllerTest, AWriteThatFailsGivesOneLineOneAlertAndAClo
   EXPECT_EQ(shell.closings, 1);
 }
 
+TEST_F(KelvasiSaveViewControllerTest, TheNextSaveAfterAFailureTriesAnotherName) {
+  files.isFull = true;
+  open(PlistArray::make());
+  interface().use("savePressed");
+  files.isFull = false;
+  surroundings.clock.time.secondsSince1970 += 1;
+  interface().use("savePressed");
+  EXPECT_EQ(files.written.size(), 1U);
+  EXPECT_TRUE(files.written.contains("/logs/KelvasiSnapshot-1709647630.kelvasi"));
+  EXPECT_EQ(ui.alerts.size(), 1U);
+}
+
 TEST_F(KelvasiSaveViewControllerTest, ContentsThatCannotBeSerialisedFailTheSameWay) {
   plists.refused = Bytes{'T', 'i', 'm', 'e', 's', 't', 'a', 'm', 'p'};
   open(PlistValue());

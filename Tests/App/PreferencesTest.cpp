@@ -24,6 +24,16 @@ TEST_F(PreferencesTest, AnAbsentPreferenceSwitchesTheShellsDisplayOnAndTellsIt) 
   EXPECT_TRUE(application.unsetRSSI());
 }
 
+TEST_F(PreferencesTest, TheDisplayIsSwitchedBeforeTheMarkerIsLookedForAndBeforeThereIsAWindow) {
+  std::size_t noted = 0;
+  files.asked = [&] {
+    noted = preferences.journal.size();
+    EXPECT_EQ(application.window(), nullptr);
+  };
+  launch();
+  EXPECT_EQ(noted, 3U);
+}
+
 TEST_F(PreferencesTest, AFalsePreferenceSwitchesItOnToo) {
   preferences.values[{own, key}] = false;
   launch();
@@ -56,13 +66,14 @@ TEST_F(PreferencesTest, TheFrameworksNoticeOfTerminationCleansNothingUp) {
 TEST_F(PreferencesTest, TheCleanUpSwitchesTheDisplayOffAgainAndLetsEverythingGo) {
   launch();
   application.showSaveView();
+  ui.journal.clear();
   application.applicationWillTerminate();
   EXPECT_FALSE(preferences.values.at({shell, key}));
   EXPECT_EQ(application.window(), nullptr);
   EXPECT_EQ(application.saveViewController(), nullptr);
   EXPECT_FALSE(application.updateMessage());
   EXPECT_FALSE(*link.localValid);
-  EXPECT_THAT(ui.journal, testing::IsSupersetOf({"window hidden", "window destroyed"}));
+  EXPECT_THAT(ui.journal, ElementsAre("dismiss", "window hidden", "window destroyed"));
 }
 
 TEST_F(PreferencesTest, TheCleanUpLeavesAloneADisplayThatThisRunDidNotSwitch) {

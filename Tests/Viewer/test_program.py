@@ -75,13 +75,22 @@ class Program(ViewerTest):
                          (1, "kelvasi: nowhere to save snapshots: none of KELVASI_LOG_DIRECTORY, XDG_STATE_HOME and "
                              "HOME is set\n"))
 
-    def test_a_picture_is_as_large_as_the_window_in_pixels(self):
-        self.environment["QT_SCALE_FACTOR"] = "2"
-        self.run_viewer("--script", "-", input=f"picture {self.path('window.png')}\n")
+    def picture_size(self, *options):
+        self.run_viewer(*options, "--script", "-", input=f"picture {self.path('window.png')}\n")
         picture = self.read("window.png")
         self.assertEqual(picture[:8], b"\x89PNG\r\n\x1a\n")
-        size = [int.from_bytes(picture[at:at + 4], "big") for at in (16, 20)]
-        self.assertEqual(size, [2 * 390, 2 * 844])
+        return [int.from_bytes(picture[at:at + 4], "big") for at in (16, 20)]
+
+    def test_a_picture_is_as_large_as_the_window_in_pixels(self):
+        self.environment["QT_SCALE_FACTOR"] = "2"
+        self.assertEqual(self.picture_size(), [2 * 390, 2 * 844])
+
+    def test_the_window_fills_a_screen_where_it_is_told_to_and_a_phones_anyway(self):
+        for screen, options, size in (((1000, 900), [], [390, 844]), ((1000, 900), ["--fullscreen"], [1000, 900]),
+                                      ((480, 1000), [], [480, 1000]), ((900, 360), [], [900, 360])):
+            with self.subTest(screen=screen, options=options):
+                self.use_screen(*screen)
+                self.assertEqual(self.picture_size(*options), size)
 
 
 class Preferences(ViewerTest):

@@ -11,7 +11,6 @@ from support import TEMPLATES
 
 VIEWER = os.environ["KELVASI"]
 COPY = os.environ["KELVASI_COPY"]  # its marker is a file in its working directory, its log the standard error
-SCREEN = json.dumps({"screens": [{"name": "desk", "x": 0, "y": 0, "width": 2560, "height": 2048}]}).encode()
 
 
 class Viewer:
@@ -70,11 +69,16 @@ class ViewerTest(LiveTest):
             "HOME": self.directory.name,
             "KELVASI_LOG_DIRECTORY": self.path("snapshots"),
             "KELVASI_RESOURCES": str(TEMPLATES),
-            "QT_QPA_PLATFORM": "offscreen:configfile=" + self.write("screen.json", SCREEN),
             "TZ": "UTC",
             "XDG_CONFIG_HOME": self.path("config"),
             "XDG_RUNTIME_DIR": self.directory.name,
         }
+        self.use_screen(2560, 2048)
+
+    def use_screen(self, width, height):
+        screen = {"name": "screen", "x": 0, "y": 0, "width": width, "height": height}
+        path = self.write("screen.json", json.dumps({"screens": [screen]}).encode())
+        self.environment["QT_QPA_PLATFORM"] = "offscreen:configfile=" + path
 
     def start_viewer(self, **options):
         return Viewer(self, self.environment, **options)

@@ -60,6 +60,20 @@ TEST_F(CellWidgetTest, ALabelWithoutAFrameOfItsOwnIsNotCut) {
   EXPECT_GT(text.right(), 210);
 }
 
+TEST_F(CellWidgetTest, AScrolledViewDrawsItsContentFurtherLeft) {
+  const RowsController& pane = showRows(2, [](std::size_t row) {
+    return RowContents{.text = row == 0 ? "" : "HHHHHHHHHHHH", .wideContent = 1000};
+  });
+  const auto textOf = [&](double offset) {
+    for (const std::size_t row : {0U, 1U}) tableOf(pane).cellAt(row)->scrollView()->scrollTo(offset);
+    const auto pictureOfRow = [&](std::size_t row) { return tableOf(pane).cellAt(row)->grab().toImage(); };
+    return differenceOf(pictureOfRow(0), pictureOfRow(1));
+  };
+  const QRect before = textOf(0);
+  const QRect after = textOf(60);
+  EXPECT_EQ(after.right(), before.right() - 60);
+}
+
 TEST_F(CellWidgetTest, NothingIsDrawnOutsideAScrollableView) {
   const RowContents text{.text = std::string(200, 'H')};
   EXPECT_LT(differenceOf(pictureOf({}), pictureOf(text)).right(), 380);

@@ -5,6 +5,7 @@
 
 #include <QFontDatabase>
 #include <QFontInfo>
+#include <QFontMetricsF>
 #include <cmath>
 
 namespace kelvasi {
@@ -36,6 +37,10 @@ TEST(Fonts, ATextTakesWholePoints) {
   EXPECT_EQ(size.width, std::floor(size.width));
   EXPECT_EQ(size.height, std::floor(size.height));
   EXPECT_GE(size.height, 15);
+  for (const char* const text : {"MM State", "RSCP", "-86 dBm", "Scrambling Code"}) {
+    const double advance = QFontMetricsF(qtFont(Font::boldSystem(15))).horizontalAdvance(text);
+    EXPECT_GE(sizeOfText(text, Font::boldSystem(15)).width, advance) << text;
+  }
 }
 
 TEST(Fonts, ALongerTextIsWiderAndNoneHasNoWidth) {

@@ -2,6 +2,7 @@
 #include <QLineEdit>
 #include <QPointer>
 #include <QSignalSpy>
+#include <QWindow>
 
 #include "Platform/QtWidgets/AlertLayer.h"
 #include "Platform/QtWidgets/BarButton.h"
@@ -156,6 +157,16 @@ TEST_F(SaveInterfaceTest, TabStaysInTheForm) {
   }
 }
 
+TEST_F(SaveInterfaceTest, TabComesBackIntoTheFormAfterTheFieldGaveUpTheKeyboard) {
+  Form& shown = present();
+  for (const Qt::Key pressed : {Qt::Key_Backtab, Qt::Key_Tab}) {
+    shown.field().resignFirstResponder();
+    QTest::keyClick(windowWidget().windowHandle(), pressed);
+    EXPECT_TRUE(widgetOf(shown.view()).isAncestorOf(QApplication::focusWidget())) << pressed;
+    edit().setFocus();
+  }
+}
+
 TEST_F(SaveInterfaceTest, ItFollowsTheSizeOfTheWindow) {
   const Form& shown = present();
   windowWidget().resize(500, 700);
@@ -200,6 +211,19 @@ TEST_F(SaveInterfaceTest, AnimatedItRisesAndSinks) {
   stack->dismissModalViewController(true);
   ASSERT_NE(the<SlideOverlay>(), nullptr);
   while (the<SlideOverlay>()) QTest::qWait(1);
+}
+
+// A button that its shortcut pressed is clicked a moment later, perhaps between the two.
+TEST_F(SaveInterfaceTest, AClickAfterTheControllerIsGoneAndBeforeItsWidgetsAreRunsNoAction) {
+  auto interface = ui->loadInterface(resource);
+  int used = 0;
+  interface->setAction("savePressed", [&used] { ++used; });
+  const QPointer<BarButton> save = widgetOf(interface->view()).findChild<BarButton*>("saveSnapshot");
+  save->click();
+  interface.reset();
+  ASSERT_NE(save, nullptr);
+  save->click();
+  EXPECT_EQ(used, 1);
 }
 
 TEST_F(SaveInterfaceTest, TheStackMayGoWhileTheViewIsOpen) {
@@ -265,6 +289,15 @@ TEST_F(AlertTest, KeepsTheKeyboardWhileThePaneBelowItGoesAndComes) {
   EXPECT_EQ(the<AlertLayer>(), nullptr);
   EXPECT_EQ(stack->viewControllers().size(), 2U);
   EXPECT_EQ(QApplication::focusWidget(), &tableOf(static_cast<RowsController&>(stack->topViewController())));
+}
+
+TEST_F(AlertTest, ItStaysAboveAViewThatIsPresentedLater) {
+  showRows(3);
+  const AlertLayer& shown = alert();
+  form = std::make_unique<Form>(ui->loadInterface(resource));
+  stack->presentModalViewController(*form, true);
+  settle();
+  EXPECT_TRUE(shown.isAncestorOf(windowWidget().childAt(195, 400)));
 }
 
 TEST_F(AlertTest, ItGoesWithItsWindow) {

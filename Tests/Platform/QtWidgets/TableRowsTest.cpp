@@ -146,6 +146,22 @@ TEST_F(TableRowsTest, AReloadOfATableThatIsNotSeenWaitsUntilItIs) {
   EXPECT_EQ(tableOf(root).cellsInSight().front()->spokenText(), "later");
 }
 
+TEST_F(TableRowsTest, ATableThatIsNotSeenAsksForNoRowThatAReloadTookAway) {
+  RowsController& root = showRows(200);
+  push(5, "Next");
+  root.rows = 2;
+  std::size_t asked = 0;
+  root.contentsOf = [&](std::size_t row) {
+    asked = std::max(asked, row);
+    return RowContents{};
+  };
+  root.tableView().reloadData();
+  tableOf(root).verticalScrollBar()->setValue(5'000);
+  stack->popViewController(false);
+  settle();
+  EXPECT_EQ(asked, 1U);
+}
+
 TEST_F(TableRowsTest, AnotherWidthLaysOutEveryRowAnew) {
   const RowsController& pane = showRows(10);
   windowWidget().resize(600, 844);

@@ -99,7 +99,14 @@ class MemoryWindow : public MemoryContainer<Window> {
   explicit MemoryWindow(Journal& journal) : journal_(journal) {}
   ~MemoryWindow() override { journal_.push_back("window destroyed"); }
 
-  void setRootViewController(NavigationStack& stack) override { root = &stack; }
+  void addSubview(View& view) override {
+    journal_.push_back("window gets a subview");
+    MemoryContainer::addSubview(view);
+  }
+  void setRootViewController(NavigationStack& stack) override {
+    journal_.push_back("window gets its root");
+    root = &stack;
+  }
   void makeKeyAndVisible() override {
     journal_.push_back("window visible");
     isVisible = true;

@@ -19,6 +19,7 @@ class MemoryCellBody : public CellBody {
   MemoryContainer<Container>& contentView() override { return contentView_; }
   void layOutStandard() override {
     ++layouts;
+    laidOutWith = accessory;
     contentView_.content = content_;
   }
   void setAccessory(CellAccessory itsAccessory) override { accessory = itsAccessory; }
@@ -27,6 +28,7 @@ class MemoryCellBody : public CellBody {
   const CellStyle style;
   CellAccessory accessory = CellAccessory::none;
   int layouts = 0;
+  std::optional<CellAccessory> laidOutWith;  // the accessory at the last layout
 
  private:
   // Empty until it is laid out, so that a layout that is forgotten shows.

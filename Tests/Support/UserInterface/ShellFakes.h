@@ -1,6 +1,7 @@
 // Preferences, files and date formatters in the test's hands.
 #pragma once
 
+#include <functional>
 #include <map>
 #include <set>
 #include <string>
@@ -41,7 +42,10 @@ class FakePreferences : public Preferences {
 
 class FakeFiles : public Files {
  public:
-  bool exists(const std::string& path) const override { return existing.contains(path); }
+  bool exists(const std::string& path) const override {
+    if (asked) asked();
+    return existing.contains(path);
+  }
   bool write(const std::string& path, std::span<const std::uint8_t> bytes) override {
     if (isFull) return false;
     written[path] = Bytes(bytes.begin(), bytes.end());
@@ -50,6 +54,7 @@ class FakeFiles : public Files {
   }
 
   std::set<std::string> existing;
+  std::function<void()> asked;  // called before every answer
   std::map<std::string, Bytes> written;
   int writes = 0;
   bool isFull = false;
