@@ -13,8 +13,9 @@ constexpr double lineIndent = 10;   // where the names of panes begin
 constexpr double labelIndent = 16;  // of the one-label style
 constexpr double glyphWidth = 34;
 
+// Applications put texts flush with the content area's right edge: it keeps off the screen's edge.
 double rightInset(CellAccessory accessory) {
-  return accessory == CellAccessory::none ? 10 : glyphWidth;
+  return accessory == CellAccessory::none ? lineIndent : glyphWidth;
 }
 
 QColor mixed(const QColor& from, const QColor& to, double share) {

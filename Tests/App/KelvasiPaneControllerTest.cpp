@@ -4,28 +4,17 @@
 #include <gtest/gtest.h>
 
 #include "App/KelvasiCell.h"
+#include "Tests/Support/PaneParts.h"
 #include "Tests/Support/UserInterface/MemoryUserInterface.h"
 
 namespace kelvasi {
 namespace {
 
+using test::branch;
+using test::FakeShell;
+using test::leaf;
 using test::MemoryTableBody;
 using testing::ElementsAre;
-
-struct FakeShell : SaveShell {
-  bool allowSaveButton() const override { return allows; }
-  void showSaveView() override { ++shown; }
-  void closeSaveView() override {}
-  bool allows = false;
-  int shown = 0;
-};
-
-NodeRef leaf(const char* name, const char* value) {
-  return std::make_shared<KelvasiModelLeafNode>(name, value);
-}
-NodeRef branch(const char* name, NodeList children = {}) {
-  return std::make_shared<KelvasiModelTreeNode>(name, std::move(children));
-}
 
 class KelvasiPaneControllerTest : public testing::Test {
  protected:

@@ -106,9 +106,12 @@ class QtFixture : public testing::Test {
     auto made = std::make_unique<RowsController>(*ui, rows, "Root");
     if (contentsOf) made->contentsOf = std::move(contentsOf);
     RowsController& controller = *made;
-    stack = ui->makeNavigationStack(std::move(made));
-    openWindow();
+    showRoot(std::move(made));
     return controller;
+  }
+  void showRoot(std::unique_ptr<ViewController> root) {
+    stack = ui->makeNavigationStack(std::move(root));
+    openWindow();
   }
   RowsController& push(std::size_t rows, const std::string& title, bool animated = true) {
     auto made = std::make_unique<RowsController>(*ui, rows, title);
