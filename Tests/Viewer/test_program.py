@@ -37,7 +37,7 @@ class Program(ViewerTest):
             self.assertIn(option, result.stdout)
 
     def test_signals_end_it_well(self):
-        for number in (signal.SIGINT, signal.SIGTERM):
+        for number in (signal.SIGINT, signal.SIGTERM, signal.SIGHUP):
             with self.subTest(number):
                 viewer = self.start_viewer()
                 viewer.state()
