@@ -2,6 +2,7 @@
 
 #include <CLI/CLI.hpp>
 
+#include "Platform/Posix/PackageResources.h"
 #include "Simulator/Commands.h"
 #include "Simulator/ScenarioList.h"
 
@@ -10,10 +11,6 @@ namespace kelvasi {
 namespace {
 
 constexpr int wrongUsage = 2;
-
-std::string shortName(std::string_view technology) {
-  return std::string(technology.substr(technology.find('_') + 1));
-}
 
 std::string listOfFaults() {
   std::string text = "Faults (several at once, each with its own --fault):\n";
@@ -53,9 +50,11 @@ std::string readSpeed(std::string& text) {
 void addOptions(CLI::App& app, Options& options) {
   app.add_option("--technology", options.technology,
                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
-      ->transform(CLI::Validator(readTechnology, "TECH"))
+      ->type_name("TECH")
+      ->transform(CLI::Validator(readTechnology, ""))
       ->required();
-  const auto scenario = app.add_option("--scenario", options.scenario, "what to play; see --list-scenarios");
+  const auto scenario =
+      app.add_option("--scenario", options.scenario, "what to play; see --list-scenarios")->type_name("NAME");
   app.add_option("--replay", options.replay, "play the messages of a capture, with its timing")
       ->type_name("CAPTURE")
       ->excludes(scenario);
@@ -92,11 +91,16 @@ void addOptions(CLI::App& app, Options& options) {
 
 }  // namespace
 
+std::string shortName(std::string_view technology) {
+  return std::string(technology.substr(technology.find('_') + 1));
+}
+
 CommandLine parseCommandLine(int argumentCount, const char* const* arguments) {
   Options options;
   CLI::App app("Plays the telephony daemon: serves log channels and streams what a simulated handset gives.",
                "telvon-sim");
   app.footer(listOfFaults());
+  app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
   addOptions(app, options);
   try {
     app.parse(argumentCount, arguments);

@@ -4,6 +4,7 @@
 #include <cstdint>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "Simulator/Faults.h"
@@ -23,6 +24,9 @@ struct Options {
   std::optional<double> seconds;
   sim::Faults faults;
 };
+
+// A technology's id as a user gives it.
+std::string shortName(std::string_view technology);
 
 struct CommandLine {
   std::optional<Options> options;

@@ -18,7 +18,8 @@ SourceResult scenarioSource(const Options& options, const PlistSerialiser& plist
     const std::string wanted =
         options.scenario.empty() ? "scenario" : "scenario \"" + options.scenario + "\"";
     return {.source = nullptr,
-            .failure = "there is no " + wanted + " for " + options.technology + " (try --list-scenarios)",
+            .failure =
+                "there is no " + wanted + " for " + shortName(options.technology) + " (try --list-scenarios)",
             .exitStatus = wrongUsage};
   }
   if (options.rate > 0)

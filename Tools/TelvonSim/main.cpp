@@ -23,10 +23,6 @@ void complain(const std::string& text) {
   std::fprintf(stderr, "telvon-sim: %s\n", text.c_str());
 }
 
-std::string shortName(std::string_view technology) {
-  return std::string(technology.substr(technology.find('_') + 1));
-}
-
 int runLoop(QtEventLoop& loop, const std::optional<double>& seconds) {
   if (!seconds) return loop.run();
   return loop.runFor(std::chrono::milliseconds(static_cast<std::int64_t>(*seconds * 1000)));
