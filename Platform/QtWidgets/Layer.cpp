@@ -1,6 +1,7 @@
 #include "Platform/QtWidgets/Layer.h"
 
 #include <QApplication>
+#include <QKeyEvent>
 #include <QMouseEvent>
 
 namespace kelvasi {
@@ -15,6 +16,13 @@ Layer::~Layer() {
   if (now && !isAncestorOf(now)) return;  // another layer has it
   QWidget* const next = focusBefore_ && focusBefore_->isVisible() ? focusBefore_.data() : parentWidget();
   next->setFocus();
+}
+
+// A key that is held since before the layer came does not work its buttons.
+bool Layer::event(QEvent* event) {
+  if (event->type() == QEvent::ShortcutOverride && dynamic_cast<QKeyEvent&>(*event).isAutoRepeat())
+    event->accept();
+  return QWidget::event(event);
 }
 
 bool Layer::eventFilter(QObject* watched, QEvent* event) {
