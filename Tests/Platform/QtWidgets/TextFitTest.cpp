@@ -2,6 +2,8 @@
 #include <QLabel>
 
 #include "Platform/QtWidgets/BarButton.h"
+#include "Platform/QtWidgets/ElidedLabel.h"
+#include "Platform/QtWidgets/FormParts.h"
 #include "Tests/Platform/QtWidgets/QtFixture.h"
 
 namespace kelvasi {
@@ -50,6 +52,23 @@ TEST_F(TextFitTest, BarsShowTitleWayBackStatusAndSave) {
                         FlexibleSpace{}, SaveButton{[] {}}},
                        true);
   expectRoomForTexts(2, 1);
+}
+
+TEST_F(TextFitTest, AStatusOrTitleWithoutEnoughRoomEndsInAnEllipsis) {
+  for (QLabel* const label : {static_cast<QLabel*>(new ElidedLabel), static_cast<QLabel*>(new FormTitle)}) {
+    const std::unique_ptr<QLabel> owned(label);
+    const QString text = QStringLiteral("Updated 2024-03-05 at 14:07:09");
+    label->setText(text);
+    label->resize(100, 30);
+    const QString cut = QFontMetricsF(label->font()).elidedText(text, Qt::ElideRight, 100);
+    ASSERT_NE(cut, text);
+    QLabel wanted(cut);
+    wanted.setFont(label->font());
+    wanted.resize(100, 30);
+    EXPECT_EQ(label->grab().toImage(), wanted.grab().toImage());
+    EXPECT_EQ(label->text(), text);
+    EXPECT_LT(label->minimumSizeHint().width(), 100);
+  }
 }
 
 TEST_F(TextFitTest, TheSaveFormShowsItsTexts) {
