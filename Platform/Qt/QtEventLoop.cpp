@@ -8,29 +8,16 @@
 #include <QEventLoop>
 #include <QSocketNotifier>
 #include <QTimer>
-#include <csignal>
 
+#include "Platform/Qt/EndingSignals.h"
 #include "Platform/Qt/FileDescriptor.h"
 
 namespace kelvasi {
-
-namespace {
-
-// Asked for by nohup(1). Held back it would arrive all the same.
-bool isHangUpIgnored() {
-  struct sigaction action {};
-  return ::sigaction(SIGHUP, nullptr, &action) == 0 && action.sa_handler == SIG_IGN;
-}
-
-}  // namespace
 
 // The ending signals as something to read: no handler, no global.
 class QtEventLoop::Signals {
  public:
   Signals() {
-    ::sigemptyset(&ending_);
-    for (const int signal : {SIGINT, SIGTERM}) ::sigaddset(&ending_, signal);
-    if (!isHangUpIgnored()) ::sigaddset(&ending_, SIGHUP);
     ::pthread_sigmask(SIG_BLOCK, &ending_, &before_);
     source_ = FileDescriptor(::signalfd(-1, &ending_, SFD_NONBLOCK | SFD_CLOEXEC));
     if (!source_) {
@@ -56,7 +43,7 @@ class QtEventLoop::Signals {
   }
   void handBack() { ::pthread_sigmask(SIG_SETMASK, &before_, nullptr); }
 
-  sigset_t ending_;
+  sigset_t ending_ = endingSignals();
   sigset_t before_;
   FileDescriptor source_;
   std::unique_ptr<QSocketNotifier> notifier_;

@@ -50,6 +50,14 @@ QSize BarButton::minimumSizeHint() const {
   return {buttonHeight, buttonHeight};
 }
 
+// A button's own way is to click a tenth of a second later, and that is lost where the window closes before.
+bool BarButton::event(QEvent* event) {
+  if (event->type() != QEvent::Shortcut || dynamic_cast<QShortcutEvent&>(*event).isAmbiguous())
+    return QPushButton::event(event);
+  click();
+  return true;
+}
+
 void BarButton::focusInEvent(QFocusEvent* event) {
   wasTabbedTo_ = event->reason() == Qt::TabFocusReason || event->reason() == Qt::BacktabFocusReason;
   QPushButton::focusInEvent(event);

@@ -68,7 +68,7 @@ void BackgroundControl::paintEvent(QPaintEvent*) {
   QPainter(this).fillRect(rect(), palette().color(QPalette::Light));
 }
 
-FormTitle::FormTitle(QWidget* parent) : QLabel(parent) {
+FormTitle::FormTitle(QWidget* parent) : ElidedLabel(parent) {
   setFont(qtFont(Font::boldSystem(17)));
 }
 

@@ -5,6 +5,8 @@
 #include <QFrame>
 #include <QLabel>
 
+#include "Platform/QtWidgets/ElidedLabel.h"
+
 namespace kelvasi {
 
 class Card : public QFrame {
@@ -37,7 +39,7 @@ class BackgroundControl : public QAbstractButton {
   void paintEvent(QPaintEvent* event) override;
 };
 
-class FormTitle : public QLabel {
+class FormTitle : public ElidedLabel {
  public:
   explicit FormTitle(QWidget* parent = nullptr);
 };

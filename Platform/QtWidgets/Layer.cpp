@@ -18,6 +18,13 @@ Layer::~Layer() {
   next->setFocus();
 }
 
+// A key that is held since before the layer came does not work its buttons.
+bool Layer::event(QEvent* event) {
+  if (event->type() == QEvent::ShortcutOverride && dynamic_cast<QKeyEvent&>(*event).isAutoRepeat())
+    event->accept();
+  return QWidget::event(event);
+}
+
 bool Layer::eventFilter(QObject* watched, QEvent* event) {
   if (event->type() == QEvent::Resize && watched == parent()) setGeometry(parentWidget()->rect());
   return isTabOfNobody(watched, *event) || QWidget::eventFilter(watched, event);

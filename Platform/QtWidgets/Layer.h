@@ -13,6 +13,7 @@ class Layer : public QWidget {
   ~Layer() override;
 
  protected:
+  bool event(QEvent* event) override;
   bool eventFilter(QObject* watched, QEvent* event) override;
   bool focusNextPrevChild(bool next) override;
   void mousePressEvent(QMouseEvent* event) override;

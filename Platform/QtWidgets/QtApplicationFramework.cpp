@@ -1,8 +1,8 @@
 #include "Platform/QtWidgets/QtApplicationFramework.h"
 
 #include <QApplication>
-#include <csignal>
 
+#include "Platform/Qt/EndingSignals.h"
 #include "Platform/Qt/QtEventLoop.h"
 
 namespace kelvasi {
@@ -11,10 +11,8 @@ namespace {
 
 // Threads that Qt starts with the application leave the signals to the event loop.
 std::unique_ptr<QApplication> makeApplication(int& argumentCount, char** arguments) {
-  sigset_t ending;
+  const sigset_t ending = endingSignals();
   sigset_t before;
-  ::sigemptyset(&ending);
-  for (const int signal : {SIGINT, SIGTERM}) ::sigaddset(&ending, signal);
   ::pthread_sigmask(SIG_BLOCK, &ending, &before);
   auto application = std::make_unique<QApplication>(argumentCount, arguments);
   ::pthread_sigmask(SIG_SETMASK, &before, nullptr);

@@ -14,7 +14,7 @@ class QtEventLoop;
 class QtApplicationFramework : public ApplicationFramework {
  public:
   // Made before anything else of Qt's; takes the options that are Qt's out of the arguments, which must
-  // outlive the framework. SIGINT and SIGTERM end run() from now on.
+  // outlive the framework. SIGINT, SIGTERM and SIGHUP, unless that is ignored, end run() from now on.
   QtApplicationFramework(int& argumentCount, char** arguments);
   ~QtApplicationFramework() override;
 

@@ -20,10 +20,16 @@ namespace {
 
 constexpr double textSize = 15;
 constexpr QSize windowSize(390, 844);
-constexpr int phoneSide = 480;  // a screen with a side no longer than this is a phone's
+constexpr int titleBarHeight = 48;  // points; desktops' are no higher
+constexpr int phoneSide = 480;      // a screen with a side no longer than this is a phone's
 
 bool isPhone(const QSize& screen) {
   return std::min(screen.width(), screen.height()) <= phoneSide;
+}
+
+// With its title bar on the screen, however low that is.
+QSize sizeOfWindow(const QScreen& screen) {
+  return windowSize.boundedTo(screen.availableGeometry().size() - QSize(0, titleBarHeight));
 }
 
 }  // namespace
@@ -34,8 +40,7 @@ QtUserInterface::QtUserInterface(const Options& options) : options_(options) {
   installAccessibility();
   const QScreen& screen = *QGuiApplication::primaryScreen();
   options_.fullScreen = options.fullScreen || isPhone(screen.size());
-  const QSize size =
-      options_.fullScreen ? screen.size() : windowSize.boundedTo(screen.availableGeometry().size());
+  const QSize size = options_.fullScreen ? screen.size() : sizeOfWindow(screen);
   screen_.area = {0, 0, static_cast<double>(size.width()), static_cast<double>(size.height())};
   if (!options.colourScheme)
     systemScheme_ = std::make_unique<SystemScheme>([this](ColourScheme scheme) { paint(scheme); });

@@ -79,8 +79,8 @@ bool StackWidget::event(QEvent* event) {
 void StackWidget::keyPressEvent(QKeyEvent* event) {
   if (isBack(*event)) return goBack_();
   QAbstractButton* const save = toolbar_->saveButton();
-  if (save && event->matches(QKeySequence::Save)) return save->click();
-  event->ignore();
+  if (!save || !event->matches(QKeySequence::Save)) return event->ignore();
+  if (!event->isAutoRepeat()) save->click();
 }
 
 void StackWidget::mousePressEvent(QMouseEvent* event) {

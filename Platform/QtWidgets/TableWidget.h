@@ -41,6 +41,8 @@ class TableWidget : public QAbstractScrollArea, public TableView, public HasWidg
   CellWidget* cellAt(std::size_t row) const;
   // In order from the top.
   std::vector<CellWidget*> cellsInSight() const;
+  // Of the row at which the keyboard is, in an active window or not; null before it is used, or out of sight.
+  CellWidget* cellAtKeyboard() const { return keyboard_ ? cellAt(*keyboard_) : nullptr; }
   std::size_t rows() const { return rows_; }
   QSize sizeHint() const override;
 

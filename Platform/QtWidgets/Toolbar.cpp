@@ -1,11 +1,11 @@
 #include "Platform/QtWidgets/Toolbar.h"
 
 #include <QHBoxLayout>
-#include <QLabel>
 #include <QPainter>
 #include <algorithm>
 
 #include "Platform/QtWidgets/BarButton.h"
+#include "Platform/QtWidgets/ElidedLabel.h"
 #include "Platform/QtWidgets/Fonts.h"
 #include "Platform/QtWidgets/Spinner.h"
 
@@ -53,7 +53,7 @@ void Toolbar::makeWidgets(const ToolbarItems& items) {
 
 QWidget* Toolbar::widgetFor(const ToolbarItem& item) {
   if (std::holds_alternative<ActivitySpinner>(item)) return new Spinner(this);
-  if (std::holds_alternative<ToolbarLabel>(item)) return new QLabel(this);
+  if (std::holds_alternative<ToolbarLabel>(item)) return new ElidedLabel(this);
   if (std::holds_alternative<FlexibleSpace>(item)) return nullptr;
   auto* const button = new BarButton(tr("Save"), this);
   button->setDefault(true);
@@ -70,10 +70,9 @@ void Toolbar::show(std::size_t place, const ToolbarItem& item) {
   if (const auto* spinner = std::get_if<ActivitySpinner>(&item))
     dynamic_cast<Spinner*>(widgets_[place])->setAnimating(spinner->isAnimating, spinner->hidesWhenStopped);
   if (const auto* label = std::get_if<ToolbarLabel>(&item)) {
-    auto& shown = dynamic_cast<QLabel&>(*widgets_[place]);
+    auto& shown = dynamic_cast<ElidedLabel&>(*widgets_[place]);
     shown.setFont(qtFont(label->font));
     shown.setText(qtText(label->text));
-    shown.setMinimumWidth(1);
     shown.setMaximumWidth(static_cast<int>(label->size.width) + 1);
   }
 }

@@ -116,9 +116,19 @@ class Demo(LiveTest):
     def test_help_names_the_options(self):
         help = self.start_demo("--help").communicate(timeout=PATIENCE)[0].decode()
         self.assertTrue(help.startswith("Sets up, builds"), help)
-        for option in ("--technology", "--seconds", "--fullscreen"):
+        for option in ("--technology", "Orvane_GSM", "--seconds", "--fullscreen"):
             self.assertIn(option, help)
         self.assertNotIn("set -euo", help)
+
+    def test_wrong_usage_has_status_2_before_anything_is_set_up(self):
+        pathlib.Path(self.demo).with_name("setup").unlink()
+        for arguments in (["--wrong"], ["file"], ["--technology"], ["--technology", "LTE"], ["--technology", ""],
+                          ["--seconds"], ["--seconds", "soon"], ["--seconds", "-1"], ["--seconds", "."]):
+            with self.subTest(arguments):
+                demo = self.start_demo(*arguments)
+                error = demo.communicate(timeout=PATIENCE)[1].decode()
+                self.assertEqual(demo.returncode, 2)
+                self.assertRegex(error, r"\Ademo: .*\(try --help\)\n\Z")
 
     def viewer(self):
         """The process of the viewer that the demo started."""

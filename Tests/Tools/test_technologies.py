@@ -153,6 +153,12 @@ class ObjectStream(Processes):
         message = plistlib.dumps({"A": ["x", {"B": 7}]}, fmt=plistlib.FMT_BINARY)
         self.assert_ends_the_viewer(message, "Unknown object of type int encountered")
 
+    def test_a_scenario_of_another_technology_is_told_by_the_names_a_user_gives(self):
+        daemon = self.start([DAEMON, "--technology", "Orvane_LTE", "--scenario", "mobility"])
+        self.assertEqual(daemon.communicate(timeout=PATIENCE)[1].decode(),
+                         'telvon-sim: there is no scenario "mobility" for Orvane_LTE (try --list-scenarios)\n')
+        self.assertEqual(daemon.returncode, 2)
+
 
 if __name__ == "__main__":
     unittest.main()

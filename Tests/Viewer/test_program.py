@@ -5,7 +5,8 @@ import signal
 import subprocess
 import unittest
 
-from live_support import PATIENCE
+from live_support import DAEMON, PATIENCE
+from support import PROGRAM
 from viewer_support import VIEWER, ViewerTest
 
 HOME_SCREEN = "[General]\nHomerailShowGSMRSSI=true\n"
@@ -36,8 +37,24 @@ class Program(ViewerTest):
         for option in ("--fullscreen", "--appearance", "--script"):
             self.assertIn(option, result.stdout)
 
+    def test_help_and_faults_name_the_looks_as_a_user_gives_them(self):
+        self.assertIn("SCHEME:{dark,light}", self.run_viewer("--help").stdout)
+        self.assertEqual(self.run_viewer("--appearance", "blue").stderr,
+                         "kelvasi: --appearance: blue not in {dark,light} (try --help)\n")
+
+    def test_looks_are_named_in_either_case(self):
+        for look in ("dark", "Light", "DARK"):
+            result = self.run_viewer("--appearance", look, "--script", "-", input="")
+            self.assertEqual((result.returncode, result.stderr), (0, ""))
+
+    def test_all_programs_tell_one_version(self):
+        told = {subprocess.run([program, "--version"], capture_output=True, check=True).stdout
+                for program in (VIEWER, PROGRAM, DAEMON)}
+        self.assertEqual(len(told), 1)
+        self.assertRegex(told.pop(), rb"\A\d+\.\d+\.\d+\n\Z")
+
     def test_signals_end_it_well(self):
-        for number in (signal.SIGINT, signal.SIGTERM):
+        for number in (signal.SIGINT, signal.SIGTERM, signal.SIGHUP):
             with self.subTest(number):
                 viewer = self.start_viewer()
                 viewer.state()

@@ -3,8 +3,9 @@
 #include <CLI/CLI.hpp>
 #include <cstdlib>
 #include <filesystem>
-#include <map>
 #include <stdexcept>
+
+#include "Platform/Posix/PackageResources.h"
 
 namespace kelvasi {
 
@@ -20,12 +21,14 @@ std::string environment(const char* name) {
 void addOptions(CLI::App& app, Options& options) {
   app.add_flag("--fullscreen", options.fullScreen,
                "fill the screen; a window of 390 by 844 points otherwise");
-  const std::map<std::string, ColourScheme> schemes{{"light", ColourScheme::light},
-                                                    {"dark", ColourScheme::dark}};
-  app.add_option_function<ColourScheme>(
-         "--appearance", [&options](ColourScheme scheme) { options.colourScheme = scheme; },
-         "light or dark; the desktop's otherwise")
-      ->transform(CLI::CheckedTransformer(schemes, CLI::ignore_case));
+  app.add_option_function<std::string>(
+         "--appearance",
+         [&options](const std::string& name) {
+           options.colourScheme = name == "dark" ? ColourScheme::dark : ColourScheme::light;
+         },
+         "the desktop's otherwise")
+      ->type_name("SCHEME")
+      ->transform(CLI::IsMember({"dark", "light"}, CLI::ignore_case));
   app.add_option(
          "--script", options.script,
          "lead the window through the commands of a file (Docs/viewer-script.md); - is the standard input")
@@ -37,6 +40,7 @@ void addOptions(CLI::App& app, Options& options) {
 CommandLine parseCommandLine(int argumentCount, const char* const* arguments) {
   Options options;
   CLI::App app("Shows what the cellular modem is doing right now.", "kelvasi");
+  app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
   addOptions(app, options);
   try {
     app.parse(argumentCount, arguments);

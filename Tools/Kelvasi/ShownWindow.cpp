@@ -89,13 +89,6 @@ QJsonArray buttonTexts() {
   return texts;
 }
 
-CellWidget* cellAtKeyboard(const TableWidget& table) {
-  for (CellWidget* const cell : table.cellsInSight()) {
-    if (cell->hasFocusMark()) return cell;
-  }
-  return nullptr;
-}
-
 CellWidget* wideCell() {
   for (CellWidget* const cell : shownTable()->cellsInSight()) {
     if (cell->scrollView() && cell->scrollView()->furthestOffset() > 0) return cell;
@@ -166,7 +159,7 @@ bool goToRow(const QString& name) {
   table.setFocus();
   if (table.rows() > 0) press(Qt::Key_Home);
   for (std::size_t row = 0; row < table.rows(); ++row) {
-    const CellWidget* const cell = cellAtKeyboard(table);
+    const CellWidget* const cell = table.cellAtKeyboard();
     if (cell && cell->texts().value(0) == name) return true;
     press(Qt::Key_Down);
   }

@@ -1,5 +1,6 @@
 // kelvasi: wires the viewer to its surroundings.
 #include <cstdio>
+#include <cstdlib>
 #include <stdexcept>
 
 #include "App/KelvasiApp.h"
@@ -51,6 +52,12 @@ bool run(QtApplicationFramework& framework, const Options& options) {
   return !script.hasFailed();
 }
 
+// A script's keys are meant as they are; and Qt's input method for Wayland takes no keys where there is no
+// seat.
+void keepInputMethodsOut() {
+  ::setenv("QT_IM_MODULE", "compose", 1);
+}
+
 }  // namespace
 
 }  // namespace kelvasi
@@ -63,6 +70,7 @@ int main(int argumentCount, char** arguments) {
     std::fprintf(stderr, "kelvasi: there is no display (neither WAYLAND_DISPLAY nor DISPLAY is set)\n");
     return 1;
   }
+  if (!commandLine.options->script.empty()) kelvasi::keepInputMethodsOut();
   int own = 1;  // the options are all this program's; Qt's has its variables
   kelvasi::QtApplicationFramework framework(own, arguments);
   try {

@@ -2,18 +2,16 @@
 
 #include <CLI/CLI.hpp>
 
+#include "Platform/Posix/PackageResources.h"
 #include "Simulator/Commands.h"
 #include "Simulator/ScenarioList.h"
+#include "Telvon/TechnologyName.h"
 
 namespace kelvasi {
 
 namespace {
 
 constexpr int wrongUsage = 2;
-
-std::string shortName(std::string_view technology) {
-  return std::string(technology.substr(technology.find('_') + 1));
-}
 
 std::string listOfFaults() {
   std::string text = "Faults (several at once, each with its own --fault):\n";
@@ -30,7 +28,7 @@ std::string listOfFaults() {
 std::string listOfScenarios() {
   std::string text;
   for (const sim::ScenarioKind& kind : sim::scenarioKinds()) {
-    std::string name = shortName(kind.technology) + " " + std::string(kind.name);
+    std::string name = std::string(shortTechnologyName(kind.technology)) + " " + std::string(kind.name);
     name.resize(std::max<std::size_t>(name.size() + 1, 24), ' ');
     text += name + std::string(kind.help) + "\n";
   }
@@ -53,9 +51,11 @@ std::string readSpeed(std::string& text) {
 void addOptions(CLI::App& app, Options& options) {
   app.add_option("--technology", options.technology,
                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
-      ->transform(CLI::Validator(readTechnology, "TECH"))
+      ->type_name("TECH")
+      ->transform(CLI::Validator(readTechnology, ""))
       ->required();
-  const auto scenario = app.add_option("--scenario", options.scenario, "what to play; see --list-scenarios");
+  const auto scenario =
+      app.add_option("--scenario", options.scenario, "what to play; see --list-scenarios")->type_name("NAME");
   app.add_option("--replay", options.replay, "play the messages of a capture, with its timing")
       ->type_name("CAPTURE")
       ->excludes(scenario);
@@ -97,6 +97,7 @@ CommandLine parseCommandLine(int argumentCount, const char* const* arguments) {
   CLI::App app("Plays the telephony daemon: serves log channels and streams what a simulated handset gives.",
                "telvon-sim");
   app.footer(listOfFaults());
+  app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
   addOptions(app, options);
   try {
     app.parse(argumentCount, arguments);

@@ -5,6 +5,7 @@
 #include "Simulator/LoadSource.h"
 #include "Simulator/ReplaySource.h"
 #include "Simulator/ScenarioList.h"
+#include "Telvon/TechnologyName.h"
 
 namespace kelvasi {
 
@@ -18,7 +19,8 @@ SourceResult scenarioSource(const Options& options, const PlistSerialiser& plist
     const std::string wanted =
         options.scenario.empty() ? "scenario" : "scenario \"" + options.scenario + "\"";
     return {.source = nullptr,
-            .failure = "there is no " + wanted + " for " + options.technology + " (try --list-scenarios)",
+            .failure = "there is no " + wanted + " for " +
+                       std::string(shortTechnologyName(options.technology)) + " (try --list-scenarios)",
             .exitStatus = wrongUsage};
   }
   if (options.rate > 0)

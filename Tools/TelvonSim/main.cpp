@@ -12,6 +12,7 @@
 #include "Platform/Qt/QtMessagePorts.h"
 #include "Platform/Qt/RuntimeDirectory.h"
 #include "Simulator/Simulation.h"
+#include "Telvon/TechnologyName.h"
 #include "Tools/TelvonSim/Options.h"
 #include "Tools/TelvonSim/Source.h"
 
@@ -21,10 +22,6 @@ namespace {
 
 void complain(const std::string& text) {
   std::fprintf(stderr, "telvon-sim: %s\n", text.c_str());
-}
-
-std::string shortName(std::string_view technology) {
-  return std::string(technology.substr(technology.find('_') + 1));
 }
 
 int runLoop(QtEventLoop& loop, const std::optional<double>& seconds) {
@@ -66,7 +63,7 @@ int serve(const Options& options) {
     complain("cannot serve in " + directory->path());
     return 1;
   }
-  complain("serving " + shortName(options.technology) + " in " + directory->path());
+  complain("serving " + std::string(shortTechnologyName(options.technology)) + " in " + directory->path());
   runLoop(loop, options.seconds);
   return 0;
 }

@@ -172,6 +172,15 @@ TEST_F(NavigationTest, CtrlSAndTheSaveButtonRunTheNewestAction) {
   EXPECT_EQ(newer, 2);
 }
 
+TEST_F(NavigationTest, CtrlSThatIsHeldSavesOnce) {
+  int saves = 0;
+  showRows(3).setToolbarItems({FlexibleSpace{}, SaveButton{[&] { ++saves; }}}, true);
+  stack->setToolbarHidden(false, false);
+  key(Qt::Key_S, Qt::ControlModifier);
+  repeatKey(Qt::Key_S, Qt::ControlModifier);
+  EXPECT_EQ(saves, 1);
+}
+
 TEST_F(NavigationTest, WithoutASaveButtonCtrlSDoesNothing) {
   showRows(3).setToolbarItems({FlexibleSpace{}}, true);
   key(Qt::Key_S, Qt::ControlModifier);

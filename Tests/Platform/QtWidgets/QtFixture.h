@@ -145,6 +145,11 @@ class QtFixture : public testing::Test {
   static void key(Qt::Key key, Qt::KeyboardModifiers modifiers = Qt::NoModifier) {
     QTest::keyClick(QApplication::focusWidget(), key, modifiers);
   }
+  // One of those that come while a key is held.
+  static void repeatKey(Qt::Key key, Qt::KeyboardModifiers modifiers = Qt::NoModifier,
+                        const QString& text = {}) {
+    QTest::simulateEvent(QApplication::focusWidget(), true, key, modifiers, text, true);
+  }
   // Layouts, paint events and late deletions.
   static void settle() {
     QCoreApplication::processEvents();

@@ -97,6 +97,27 @@ TEST_F(SaveInterfaceTest, CtrlSSavesAndEscapeCancels) {
   EXPECT_THAT(shown.used, ElementsAre("savePressed", "cancelPressed"));
 }
 
+TEST_F(SaveInterfaceTest, KeysAreThroughAtOnceSoThatNothingComesBetween) {
+  const Form& shown = present();
+  key(Qt::Key_S, Qt::ControlModifier);
+  EXPECT_THAT(shown.used, ElementsAre("savePressed"));
+}
+
+TEST_F(SaveInterfaceTest, AKeyThatIsHeldSinceBeforeDoesNotWorkTheForm) {
+  const Form& shown = present();
+  repeatKey(Qt::Key_S, Qt::ControlModifier);
+  repeatKey(Qt::Key_Escape);
+  settle();
+  EXPECT_THAT(shown.used, IsEmpty());
+}
+
+TEST_F(SaveInterfaceTest, AKeyThatIsHeldInTheFieldTypesOn) {
+  const Form& shown = present();
+  repeatKey(Qt::Key_A, Qt::NoModifier, "a");
+  repeatKey(Qt::Key_A, Qt::NoModifier, "a");
+  EXPECT_EQ(shown.field().text(), "aa");
+}
+
 TEST_F(SaveInterfaceTest, ItLiesOverTheWholeWindowAndTheFieldHasTheKeyboard) {
   const Form& shown = present();
   EXPECT_EQ(widgetOf(shown.view()).geometry(), QRect(0, 0, 390, 844));

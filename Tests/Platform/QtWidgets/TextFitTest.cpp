@@ -2,7 +2,9 @@
 #include <QLabel>
 
 #include "Platform/QtWidgets/BarButton.h"
+#include "Platform/QtWidgets/ElidedLabel.h"
 #include "Platform/QtWidgets/Fonts.h"
+#include "Platform/QtWidgets/FormParts.h"
 #include "Platform/QtWidgets/NavigationBar.h"
 #include "Tests/Platform/QtWidgets/QtFixture.h"
 
@@ -87,6 +89,23 @@ TEST_F(TextFitTest, ARowsTextIsWhole) {
   };
   const QImage with = picture(text);
   expectWhole(with, picture(""), text, Font::system(17));
+}
+
+TEST_F(TextFitTest, AStatusOrTitleWithoutEnoughRoomEndsInAnEllipsis) {
+  for (QLabel* const label : {static_cast<QLabel*>(new ElidedLabel), static_cast<QLabel*>(new FormTitle)}) {
+    const std::unique_ptr<QLabel> owned(label);
+    const QString text = QStringLiteral("Updated 2024-03-05 at 14:07:09");
+    label->setText(text);
+    label->resize(100, 30);
+    const QString cut = QFontMetricsF(label->font()).elidedText(text, Qt::ElideRight, 100);
+    ASSERT_NE(cut, text);
+    QLabel wanted(cut);
+    wanted.setFont(label->font());
+    wanted.resize(100, 30);
+    EXPECT_EQ(label->grab().toImage(), wanted.grab().toImage());
+    EXPECT_EQ(label->text(), text);
+    EXPECT_LT(label->minimumSizeHint().width(), 100);
+  }
 }
 
 TEST_F(TextFitTest, TheSaveFormShowsItsTexts) {
