@@ -1,9 +1,5 @@
 #include "Simulator/Commands.h"
 
-#include <array>
-
-#include "Telvon/Technology.h"
-
 namespace kelvasi::sim {
 
 namespace {
@@ -12,13 +8,7 @@ constexpr std::string_view technologyKey = "GetTechnology";
 constexpr std::string_view stateKey = "SetState";
 constexpr std::string_view streamingState = "Streaming";
 constexpr std::string_view missingTechnology = "kTelvonLogChannelTechnology_Missing";
-constexpr std::string_view idPrefix = "kTelvonLogChannelTechnology_";
 constexpr std::int32_t errorDomain = 1;
-
-constexpr std::array technologies{kTelvonLogChannelTechnology_IFX, kTelvonLogChannelTechnology_Orvane_GSM,
-                                  kTelvonLogChannelTechnology_Orvane_CDMA,
-                                  kTelvonLogChannelTechnology_Orvane_LTE,
-                                  kTelvonLogChannelTechnology_Orvane_UTRAN2};
 
 std::optional<Bytes> serialised(const PlistSerialiser& plists, std::string_view key, std::string_view value) {
   return plists.serialiseXml(PlistDictionary::make({{std::string(key), value}}));
@@ -53,13 +43,6 @@ std::optional<LogChannelAnswer> faultyChannelAnswer(std::string_view portName, c
   if (faults.has(Fault::nullPort)) return LogChannelAnswer{.error = {}, .portName = std::nullopt};
   if (faults.has(Fault::emptyPort)) return LogChannelAnswer{.error = {}, .portName = ""};
   if (faults.has(Fault::deadPort)) return LogChannelAnswer{.error = {}, .portName = std::string(portName)};
-  return std::nullopt;
-}
-
-std::optional<std::string_view> technologyId(std::string_view name) {
-  for (const std::string_view id : technologies) {
-    if (id == name || id.substr(idPrefix.size()) == name) return id;
-  }
   return std::nullopt;
 }
 

@@ -28,7 +28,4 @@ std::optional<Bytes> technologyAnswer(const PlistSerialiser& plists, std::string
 // The answer that a requested fault puts in place of a channel named `portName`; nothing when no fault does.
 std::optional<LogChannelAnswer> faultyChannelAnswer(std::string_view portName, const Faults& faults);
 
-// Technology ids by their short names, "Orvane_GSM", or in full; nothing for one that does not exist.
-std::optional<std::string_view> technologyId(std::string_view name);
-
 }  // namespace kelvasi::sim

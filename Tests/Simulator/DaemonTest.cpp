@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "Telvon/Technology.h"
+#include "Telvon/TechnologyName.h"
 #include "Tests/Simulator/FakeApplication.h"
 #include "Tests/Support/HexBytes.h"
 
@@ -229,13 +230,6 @@ TEST_F(SimulatedDaemon, FaultDeadPort) {
   EXPECT_NE(*viewer.answered.portName, "");
   EXPECT_FALSE(ports.isListening(*viewer.answered.portName));
   EXPECT_FALSE(viewer.isConnected());
-}
-
-TEST(TechnologyId, TakesShortAndFullNames) {
-  EXPECT_EQ(technologyId("Orvane_LTE"), kTelvonLogChannelTechnology_Orvane_LTE);
-  EXPECT_EQ(technologyId("kTelvonLogChannelTechnology_IFX"), kTelvonLogChannelTechnology_IFX);
-  EXPECT_EQ(technologyId("LTE"), std::nullopt);
-  EXPECT_EQ(technologyId(""), std::nullopt);
 }
 
 }  // namespace

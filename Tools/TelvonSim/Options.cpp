@@ -37,7 +37,7 @@ std::string listOfScenarios() {
 
 // Both take a text apart for CLI11, whose convention is to return what is wrong with it.
 std::string readTechnology(std::string& text) {
-  const auto id = sim::technologyId(text);
+  const auto id = technologyId(text);
   if (!id) return "there is no technology \"" + text + "\"";
   text = *id;
   return {};
