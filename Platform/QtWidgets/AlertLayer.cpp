@@ -40,6 +40,7 @@ AlertLayer::AlertLayer(QWidget& parent, const AlertText& text) : Layer(parent) {
   setAccessibleName(text.title);
   setAccessibleDescription(text.message);
   auto* const card = new Card(this);
+  card->setBackgroundRole(QPalette::ToolTipBase);
   card->setFixedWidth(cardWidth);
   fill(*card, text);
   auto* const layout = new QGridLayout(this);

@@ -36,13 +36,14 @@ class CardCorners : public QWidget {
 
 Card::Card(QWidget* parent) : QFrame(parent) {
   setFrameShape(QFrame::NoFrame);
+  setBackgroundRole(QPalette::Base);
 }
 
 void Card::paintEvent(QPaintEvent*) {
   QPainter painter(this);
   painter.setRenderHint(QPainter::Antialiasing);
   painter.setPen(Qt::NoPen);
-  painter.setBrush(palette().color(QPalette::Base));
+  painter.setBrush(palette().color(backgroundRole()));
   painter.drawRoundedRect(rect(), radius, radius);
 }
 

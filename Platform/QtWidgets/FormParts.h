@@ -9,6 +9,7 @@
 
 namespace kelvasi {
 
+// In the colour of its background role.
 class Card : public QFrame {
  public:
   explicit Card(QWidget* parent = nullptr);

@@ -18,6 +18,7 @@ constexpr auto none = QPalette::NColorRoles;
 constexpr std::array colours{
     Colour{{QPalette::Base, none, none}, 0xFFFFFFFF, 0xFF121417},
     Colour{{QPalette::AlternateBase, QPalette::Midlight, none}, 0xFFE6ECF5, 0xFF26303D},
+    Colour{{QPalette::ToolTipBase, none, none}, 0xFFFFFFFF, 0xFF262A31},
     Colour{{QPalette::Window, QPalette::Button, none}, 0xFFF6F7F9, 0xFF1C1F24},
     Colour{{QPalette::Light, none, none}, 0xFFECEEF2, 0xFF08090B},
     Colour{{QPalette::Text, QPalette::WindowText, QPalette::ButtonText}, 0xFF14171C, 0xFFF0F2F5},

@@ -20,11 +20,21 @@ double contrast(const QColor& one, const QColor& other) {
 TEST(Palettes, TextsCanBeReadOnEveryGround) {
   for (const ColourScheme scheme : {ColourScheme::light, ColourScheme::dark}) {
     const QPalette palette = paletteOf(scheme);
-    for (const auto ground : {QPalette::Base, QPalette::AlternateBase, QPalette::Window, QPalette::Light}) {
+    for (const auto ground : {QPalette::Base, QPalette::AlternateBase, QPalette::Window, QPalette::Light,
+                              QPalette::ToolTipBase}) {
       EXPECT_GE(contrast(palette.color(QPalette::Text), palette.color(ground)), 7) << ground;
       EXPECT_GE(contrast(palette.color(QPalette::PlaceholderText), palette.color(ground)), 4.5) << ground;
       EXPECT_GE(contrast(palette.color(QPalette::Highlight), palette.color(ground)), 4.5) << ground;
     }
+  }
+}
+
+TEST(Palettes, AnAlertStandsOutFromTheRowsThatItDims) {
+  for (const ColourScheme scheme : {ColourScheme::light, ColourScheme::dark}) {
+    const QPalette palette = paletteOf(scheme);
+    const QColor rows = palette.color(QPalette::Base);
+    const QColor dimmed = QColor::fromRgbF(rows.redF() * 0.6F, rows.greenF() * 0.6F, rows.blueF() * 0.6F);
+    EXPECT_GE(contrast(palette.color(QPalette::ToolTipBase), dimmed), 1.3);
   }
 }
 
