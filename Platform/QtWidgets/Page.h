@@ -18,6 +18,8 @@ class Page {
   virtual QWidget& widget() = 0;
   // What takes the keyboard when the page is shown.
   virtual QWidget& firstFocus() = 0;
+  // Whether a user works on it by keyboard.
+  virtual bool isKeyboardInUse() { return false; }
 
   const QString& title() const { return title_; }
   const ToolbarItems& toolbarItems() const { return items_; }
@@ -65,6 +67,7 @@ class TablePage : public PageBody<TableControllerBody> {
  public:
   TablePage() : PageBody(std::unique_ptr<QWidget, DeleteLater>(new TableWidget)) {}
   TableWidget& tableView() override { return dynamic_cast<TableWidget&>(widget()); }
+  bool isKeyboardInUse() override { return tableView().isKeyboardInUse(); }
 };
 
 }  // namespace kelvasi

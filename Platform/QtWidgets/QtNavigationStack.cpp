@@ -58,17 +58,19 @@ void QtNavigationStack::setToolbarHidden(bool hidden, bool) {
 
 void QtNavigationStack::showTop(Change change, bool animated) {
   const QRect area = widget_->slidingArea();
-  if (change == Change::none || !animated || !animates_ || !widget_->isVisible()) return swapPage();
+  if (change == Change::none || !animated || !animates_ || !widget_->isVisible()) return swapPage(change);
   SlideOverlay::Pictures pictures;
   pictures.before = widget_->grab(area);
-  swapPage();
+  swapPage(change);
   pictures.after = widget_->grab(area);
   const auto direction =
       change == Change::pushed ? SlideOverlay::Direction::leftwards : SlideOverlay::Direction::rightwards;
   new SlideOverlay(*widget_, area, std::move(pictures), direction, widget_->bar().height());
 }
 
-void QtNavigationStack::swapPage() {
+// A pane that was opened by keyboard goes on with it, as if it were reached with Tab.
+void QtNavigationStack::swapPage(Change change) {
+  const bool isByKeyboard = change == Change::pushed && shown_ && shown_->isKeyboardInUse();
   Page& page = pageOf(topViewController());
   shown_ = &page;
   page.setChanged([this, &page] {
@@ -76,7 +78,8 @@ void QtNavigationStack::swapPage() {
   });
   widget_->showPage(page.widget());
   showBars();
-  if (!isCovered(*widget_->window())) page.firstFocus().setFocus();
+  if (!isCovered(*widget_->window()))
+    page.firstFocus().setFocus(isByKeyboard ? Qt::TabFocusReason : Qt::OtherFocusReason);
 }
 
 void QtNavigationStack::showBars() {

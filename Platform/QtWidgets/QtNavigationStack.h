@@ -27,7 +27,7 @@ class QtNavigationStack : public NavigationStack {
   void showTop(Change change, bool animated) override;
   void showModal(ViewController& controller, bool animated) override;
   void hideModal(ViewController& controller, bool animated) override;
-  void swapPage();
+  void swapPage(Change change);
   void showBars();
   // The title of the pane below, which may be empty; none at the root.
   std::optional<QString> backTitle() const;

@@ -43,6 +43,8 @@ class TableWidget : public QAbstractScrollArea, public TableView, public HasWidg
   std::vector<CellWidget*> cellsInSight() const;
   // Of the row at which the keyboard is, in an active window or not; null before it is used, or out of sight.
   CellWidget* cellAtKeyboard() const { return keyboard_ ? cellAt(*keyboard_) : nullptr; }
+  // Whether a key was pressed since the last tap.
+  bool isKeyboardInUse() const { return isKeyboardInUse_; }
   std::size_t rows() const { return rows_; }
   QSize sizeHint() const override;
 

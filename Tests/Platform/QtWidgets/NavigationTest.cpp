@@ -14,6 +14,7 @@ namespace {
 
 using test::RowsController;
 using testing::ElementsAre;
+using testing::IsEmpty;
 
 class NavigationTest : public test::QtFixture {
  protected:
@@ -59,6 +60,28 @@ TEST_F(NavigationTest, OnlyTheTopPaneIsSeenAndItFillsTheRoomBetweenTheBars) {
   stack->setToolbarHidden(false, false);
   settle();
   EXPECT_EQ(tableOf(next).height(), 844 - 44 - 44);
+}
+
+TEST_F(NavigationTest, ThePaneOfARowThatWasOpenedByKeyboardGoesOnByKeyboard) {
+  showRows(3);
+  key(Qt::Key_Down);
+  const RowsController& next = push(3, "Next");
+  EXPECT_TRUE(tableOf(next).cellAt(0)->hasFocusMark());
+  key(Qt::Key_Return);
+  EXPECT_THAT(next.opened, ElementsAre(0));
+  const RowsController& empty = push(0, "Empty");
+  key(Qt::Key_Return);
+  EXPECT_THAT(empty.opened, IsEmpty());
+}
+
+TEST_F(NavigationTest, ThePaneOfARowThatWasTappedMarksNone) {
+  const RowsController& root = showRows(3);
+  key(Qt::Key_Down);
+  QTest::mouseClick(tableOf(root).viewport(), Qt::LeftButton, {}, {100, 75});
+  const RowsController& next = push(3, "Next");
+  EXPECT_FALSE(tableOf(next).cellAt(0)->hasFocusMark());
+  key(Qt::Key_Return);
+  EXPECT_THAT(next.opened, IsEmpty());
 }
 
 TEST_F(NavigationTest, TheBackButtonGoesBack) {
