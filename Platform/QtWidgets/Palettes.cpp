@@ -22,6 +22,7 @@ constexpr std::array colours{
     Colour{{QPalette::Window, QPalette::Button, none}, 0xFFF6F7F9, 0xFF1C1F24},
     Colour{{QPalette::Light, none, none}, 0xFFECEEF2, 0xFF08090B},
     Colour{{QPalette::Text, QPalette::WindowText, QPalette::ButtonText}, 0xFF14171C, 0xFFF0F2F5},
+    Colour{{QPalette::ToolTipText, none, none}, 0xFF14171C, 0xFFF0F2F5},
     Colour{{QPalette::PlaceholderText, none, none}, 0xFF5A6472, 0xFF9AA4B2},
     Colour{{QPalette::Mid, none, none}, 0xFFD9DDE3, 0xFF30353D},
     Colour{{QPalette::Dark, none, none}, 0xFF8A94A3, 0xFF6B7686},

@@ -1,4 +1,7 @@
 // Light and dark, the window and the screen.
+#include <QLabel>
+
+#include "Platform/QtWidgets/FormParts.h"
 #include "Tests/Platform/QtWidgets/QtFixture.h"
 
 namespace kelvasi {
@@ -42,6 +45,20 @@ class AppearanceTest : public test::QtFixture {
  protected:
   QColor groundOfRows() const { return windowWidget().grab().toImage().pixelColor(200, 700); }
 };
+
+TEST_F(AppearanceTest, AnAlertsTextsCanBeReadOnItsGround) {
+  for (const ColourScheme scheme : {ColourScheme::light, ColourScheme::dark}) {
+    ui = std::make_unique<QtUserInterface>(
+        QtUserInterface::Options{.colourScheme = scheme, .animates = false});
+    showRows(1);
+    ui->showAlert("File Error", "Unable to write file to disk", "Close");
+    const QColor ground = the<Card>()->palette().color(the<Card>()->backgroundRole());
+    for (const QLabel* const text : the<Card>()->findChildren<QLabel*>())
+      EXPECT_GE(contrast(text->palette().color(text->foregroundRole()), ground), 7);
+    window.reset();
+    stack.reset();
+  }
+}
 
 TEST_F(AppearanceTest, AStatedSchemeIsPainted) {
   for (const ColourScheme scheme : {ColourScheme::light, ColourScheme::dark}) {
