@@ -53,4 +53,9 @@ void StderrSystemLog::write(LogPriority priority, std::string_view text) {
   writeAll(STDERR_FILENO, {reinterpret_cast<const std::uint8_t*>(line.data()), line.size()});
 }
 
+std::unique_ptr<SystemLog> makeSystemLog(bool isStderr, const std::string& program) {
+  if (isStderr) return std::make_unique<StderrSystemLog>();
+  return std::make_unique<SyslogSystemLog>(program);
+}
+
 }  // namespace kelvasi

@@ -3,6 +3,7 @@
 // was composed. Only strings of received property lists can bring line feeds from outside.
 #pragma once
 
+#include <memory>
 #include <string>
 #include <string_view>
 
@@ -39,5 +40,8 @@ class StderrSystemLog final : public SystemLog {
  private:
   LogLevel level_;
 };
+
+// Syslog's, under the program's name, or the standard error's.
+std::unique_ptr<SystemLog> makeSystemLog(bool isStderr, const std::string& program);
 
 }  // namespace kelvasi

@@ -157,7 +157,7 @@ class Saving(ViewerTest):
         self.assertFalse(os.path.exists(self.path("missing")))
 
     def start_copy(self):
-        return self.start_viewer(program=COPY, cwd=self.directory.name)
+        return self.start_viewer("--log-stderr", program=COPY, cwd=self.directory.name)
 
     def test_a_directory_that_cannot_be_written_gives_one_line_and_one_alert(self):
         self.environment |= {"KELVASI_LOG_DIRECTORY": "/proc/self", "KELVASI_LOG_LEVEL": "err"}  # not even root can

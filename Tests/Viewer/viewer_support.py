@@ -10,17 +10,17 @@ from live_support import PATIENCE, LiveTest
 from support import TEMPLATES
 
 VIEWER = os.environ["KELVASI"]
-COPY = os.environ["KELVASI_COPY"]  # its marker is a file in its working directory, its log the standard error
+COPY = os.environ["KELVASI_COPY"]  # its marker is a file in its working directory
 
 
 class Viewer:
     """A running viewer. Commands are done one after the other; state() waits for those before it."""
 
-    def __init__(self, test, environment, program=VIEWER, **options):
+    def __init__(self, test, environment, *arguments, program=VIEWER, **options):
         self.test = test
         self.errors = open(test.path("viewer-errors"), "wb")
         test.addCleanup(self.errors.close)
-        self.process = test.start([program, "--script", "-"], env=environment, stdin=subprocess.PIPE,
+        self.process = test.start([program, "--script", "-", *arguments], env=environment, stdin=subprocess.PIPE,
                                   stderr=self.errors, **options)
         test.addCleanup(self.process.stdin.close)
 
@@ -80,8 +80,8 @@ class ViewerTest(LiveTest):
         path = self.write("screen.json", json.dumps({"screens": [screen]}).encode())
         self.environment["QT_QPA_PLATFORM"] = "offscreen:configfile=" + path
 
-    def start_viewer(self, **options):
-        return Viewer(self, self.environment, **options)
+    def start_viewer(self, *arguments, **options):
+        return Viewer(self, self.environment, *arguments, **options)
 
     def preference_file(self, domain):
         return os.path.join(self.path("config"), "preferences", domain + ".ini")

@@ -10,6 +10,7 @@ namespace kelvasi {
 
 struct Options {
   bool fullScreen = false;
+  bool logsToStderr = false;
   std::optional<ColourScheme> colourScheme;
   std::string script;  // the name of a file; "-" for the standard input, empty for none
 };

@@ -28,20 +28,20 @@ namespace {
 
 // False when the script that led the window failed.
 bool run(QtApplicationFramework& framework, const Options& options) {
-  SyslogSystemLog log;
-  installTerminateHandler(log, "kelvasi");
+  const auto log = makeSystemLog(options.logsToStderr, "kelvasi");
+  installTerminateHandler(*log, options.logsToStderr ? "" : "kelvasi");
   StandardOutputTrace trace;
   const LibplistSerialiser plists;
   const PackageResources resources;
   const PosixClock clock;
   QtMainQueue queue;
-  QtMessagePorts ports(log);
-  QtTelephonyDaemon daemon(log);
+  QtMessagePorts ports(*log);
+  QtTelephonyDaemon daemon(*log);
   QtUserInterface ui({.fullScreen = options.fullScreen, .colourScheme = options.colourScheme});
   QtPreferences preferences;
   const QtDateFormatters dateFormatters;
   PosixFiles files;
-  const AppPlatform platform{.core = {log, trace, plists, resources, clock},
+  const AppPlatform platform{.core = {*log, trace, plists, resources, clock},
                              .link = {queue, ports, daemon},
                              .shell = {ui, preferences, dateFormatters, files},
                              .paths = {.logDirectory = makeLogDirectory(),

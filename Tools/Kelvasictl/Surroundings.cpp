@@ -18,11 +18,6 @@ class NoTrace : public TraceOutput {
   void writeLine(std::string_view) override {}
 };
 
-std::unique_ptr<SystemLog> makeLog(bool isStderr) {
-  if (isStderr) return std::make_unique<StderrSystemLog>();
-  return std::make_unique<SyslogSystemLog>("kelvasictl");
-}
-
 std::unique_ptr<TraceOutput> makeTrace(bool isStderr) {
   if (isStderr) return std::make_unique<StandardErrorTrace>();
   return std::make_unique<NoTrace>();
@@ -47,7 +42,7 @@ void SurroundingsOptions::addTo(CLI::App& verb) {
 }
 
 Surroundings::Surroundings(const SurroundingsOptions& options)
-    : log(makeLog(options.logsToStderr)),
+    : log(makeSystemLog(options.logsToStderr, "kelvasictl")),
       trace(makeTrace(options.logsToStderr)),
       resources(resourcesDirectory(options)) {
   installTerminateHandler(*log, options.logsToStderr ? "" : "kelvasictl");
