@@ -74,6 +74,16 @@ class WrongUsage(KelvasictlTest):
                 self.assert_fault(result, "(try --help)", status=2)
                 self.assertEqual(result.stdout, b"")
 
+    def test_is_told_in_plain_words(self):
+        for arguments, words in (([], "a subcommand is missing: decode, monitor or record"),
+                                 (["unknown"], "The following argument was not expected: unknown"),
+                                 (["monitor", "--seconds", "x"], '--seconds: "x" is no number from 0 to 1000000000'),
+                                 (["monitor", "--seconds", "nan"], '--seconds: "nan" is no number'),
+                                 (["monitor", "--seconds", "-1"], '--seconds: "-1" is no number'),
+                                 (["monitor", "--seconds", "1s"], '--seconds: "1s" is no number')):
+            with self.subTest(arguments):
+                self.assert_fault(self.run_program(*arguments), words, status=2)
+
     def test_help_is_no_error(self):
         for arguments in (["--help"], ["decode", "--help"], ["monitor", "--help"], ["record", "--help"], ["--version"]):
             with self.subTest(arguments):

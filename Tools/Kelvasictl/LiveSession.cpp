@@ -5,6 +5,7 @@
 #include "Platform/Qt/RuntimeDirectory.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
+#include "Tools/NumberCheck.h"
 
 namespace kelvasi {
 
@@ -27,7 +28,7 @@ std::string aDaemonThere() {
 void LiveOptions::addTo(CLI::App& verb) {
   verb.add_option("--seconds", seconds, "end after so many seconds; otherwise at SIGINT, SIGTERM or SIGHUP")
       ->type_name("N")
-      ->check(CLI::Range(0.0, 1e9));
+      ->check(numberBetween(0, 1e9, "from 0 to 1000000000"));
   surroundings.addTo(verb);
 }
 

@@ -20,7 +20,6 @@ constexpr std::array verbs{
 
 int run(int argumentCount, char** arguments) {
   CLI::App app("Decodes, watches and records the diagnostic stream of a cellular modem.", "kelvasictl");
-  app.require_subcommand(1);
   app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
   std::vector<Action> actions;
   for (const Verb& verb : verbs) actions.push_back(verb.declare(*app.add_subcommand(verb.name, verb.help)));
@@ -35,6 +34,7 @@ int run(int argumentCount, char** arguments) {
   for (std::size_t place = 0; place < verbs.size(); ++place) {
     if (app.got_subcommand(verbs[place].name)) return actions[place]();
   }
+  complain("a subcommand is missing: decode, monitor or record (try --help)");
   return exitWrongUsage;
 }
 

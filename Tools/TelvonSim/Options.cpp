@@ -6,6 +6,7 @@
 #include "Simulator/Commands.h"
 #include "Simulator/ScenarioList.h"
 #include "Telvon/TechnologyName.h"
+#include "Tools/NumberCheck.h"
 
 namespace kelvasi {
 
@@ -63,14 +64,19 @@ void addOptions(CLI::App& app, Options& options) {
   app.add_flag("--leave", options.leavesAtEnd, "end when the capture has been played")->needs("--replay");
   app.add_option("--speed", options.speed.factor,
                  "world seconds per second; \"max\" or 0 is as fast as the applications take it")
-      ->transform(CLI::Validator(readSpeed, "X"))
-      ->check(CLI::Range(0.0, 1e6));
+      ->type_name("X")
+      ->transform(CLI::Validator(readSpeed, ""))
+      ->check(numberBetween(0, 1e6, "from 0 to 1000000"));
   app.add_option("--rate", options.rate, "synthetic load: repeat the scenario's messages, N a second")
       ->type_name("N")
-      ->check(CLI::Range(1e-3, 1e9))
+      ->check(numberBetween(1e-3, 1e9, "from 0.001 to 1000000000"))
       ->excludes("--replay");
-  app.add_option("--seed", options.seed, "the same seed gives the same messages")->capture_default_str();
-  app.add_option("--seconds", options.seconds, "end after so many seconds")->check(CLI::Range(0.0, 1e9));
+  app.add_option("--seed", options.seed, "the same seed gives the same messages")
+      ->type_name("N")
+      ->capture_default_str();
+  app.add_option("--seconds", options.seconds, "end after so many seconds")
+      ->type_name("N")
+      ->check(numberBetween(0, 1e9, "from 0 to 1000000000"));
   app.add_option_function<std::vector<std::string>>(
          "--fault",
          [&options](const std::vector<std::string>& requests) {
