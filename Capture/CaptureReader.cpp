@@ -7,6 +7,8 @@
 #include "Capture/DlfReader.h"
 #include "Capture/InputBytes.h"
 #include "Capture/PcapReader.h"
+#include "Capture/PlistBeginning.h"
+#include "Capture/SnapshotReader.h"
 
 namespace kelvasi {
 
@@ -14,8 +16,13 @@ namespace {
 
 constexpr std::array<std::uint8_t, 4> versionReportStart{0xA1, 0x00, 0xFD, 0x1F};
 
-bool isDlf(const std::string& path, const InputBytes& input) {
-  return path.ends_with(".dlf") || std::ranges::equal(input.firstBytes(), versionReportStart);
+bool isDlf(const std::string& path, InputBytes& input) {
+  return path.ends_with(".dlf") ||
+         std::ranges::equal(input.firstBytes(versionReportStart.size()), versionReportStart);
+}
+
+bool isSnapshot(const std::string& path, InputBytes& input) {
+  return path.ends_with(".kelvasi") || beginsAsPlist(input);
 }
 
 }  // namespace
@@ -25,9 +32,10 @@ std::string CaptureFault::text() const {
   return file + place + ": " + reason;
 }
 
-std::unique_ptr<CaptureReader> openCapture(const std::string& path) {
+std::unique_ptr<CaptureReader> openCapture(const std::string& path, const PlistSerialiser& plists) {
   auto input = std::make_unique<InputBytes>(path);
   if (isDlf(path, *input)) return std::make_unique<DlfReader>(*input);
+  if (isSnapshot(path, *input)) return std::make_unique<SnapshotReader>(*input, plists);
   return std::make_unique<PcapReader>(std::move(input));
 }
 

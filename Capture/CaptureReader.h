@@ -8,6 +8,8 @@
 #include <span>
 #include <string>
 
+#include "Platform/PlistSerialiser.h"
+
 namespace kelvasi {
 
 struct CapturedMessage {
@@ -18,7 +20,8 @@ struct CapturedMessage {
 // Why a capture ends before its end.
 struct CaptureFault {
   std::string file;
-  std::optional<std::uint64_t> offset;  // of what could not be read; nothing when the file was not opened
+  std::optional<std::uint64_t> offset;  // of what could not be read; nothing when the file was not opened,
+                                        // and where it is wrong as a whole
   std::string reason;
 
   // One line: "drive.pcap: byte 1024: truncated dump file"
@@ -41,9 +44,10 @@ class CaptureReader {
   std::uint64_t cutMessages_ = 0;
 };
 
-// Opens a pcap, pcapng or DLF file; "-" is the standard input. A DLF file is told by its version report or by
-// its name's ending ".dlf". Never null: what cannot be opened or read is a capture without messages and with
-// a fault.
-std::unique_ptr<CaptureReader> openCapture(const std::string& path);
+// Opens a pcap, pcapng or DLF file or a snapshot; "-" is the standard input. A DLF file is told by its
+// version report or by its name's ending ".dlf", a snapshot as a property list or by ".kelvasi". Never null:
+// what cannot be opened or read is a capture without messages and with a fault. `plists` is needed until the
+// call returns.
+std::unique_ptr<CaptureReader> openCapture(const std::string& path, const PlistSerialiser& plists);
 
 }  // namespace kelvasi

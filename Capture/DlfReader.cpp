@@ -1,12 +1,9 @@
 #include "Capture/DlfReader.h"
 
 #include <algorithm>
-#include <array>
-#include <cerrno>
-#include <string_view>
-#include <system_error>
 #include <utility>
 
+#include "Capture/PlistBeginning.h"
 #include "LogGenerator/RecordView.h"
 
 namespace kelvasi {
@@ -29,32 +26,16 @@ nanoseconds fromSystemTime(std::uint64_t stamp) {
   return systemTimeBegin + std::chrono::seconds(second) + nanoseconds(fraction);
 }
 
-bool isPropertyList(std::span<const std::uint8_t> payload) {
-  using namespace std::literals;
-  constexpr std::array beginnings{"bplist"sv, "<?xml"sv, "<!DOCTYPE"sv, "<plist"sv};
-  return std::ranges::any_of(beginnings, [&](std::string_view beginning) {
-    return payload.size() >= beginning.size() &&
-           std::ranges::equal(payload.first(beginning.size()), beginning);
-  });
-}
-
 }  // namespace
 
-DlfReader::DlfReader(InputBytes& input) : name_(input.name()) {
+DlfReader::DlfReader(InputBytes& input)
+    : name_(input.name()), file_(input.readToEnd(largestFile, "a DLF file")) {
   fault_ = input.fault();
-  if (!fault_) readAll(input);
   if (!fault_) findRecords();
 }
 
-void DlfReader::readAll(InputBytes& input) {
-  std::array<std::uint8_t, 65536> block;
-  std::ptrdiff_t count = 0;
-  while ((count = input.read(block)) > 0) {
-    file_.insert(file_.end(), block.begin(), block.begin() + count);
-    if (file_.size() > largestFile) return fail(largestFile, "larger than a DLF file may be here");
-  }
-  if (count < 0) return fail(file_.size(), std::generic_category().message(errno));
-  if (file_.empty()) fail(0, "an empty file");
+DlfReader::DlfReader(std::string name, Bytes file) : name_(std::move(name)), file_(std::move(file)) {
+  findRecords();
 }
 
 void DlfReader::findRecords() {
@@ -95,13 +76,9 @@ std::span<const std::uint8_t> DlfReader::messageOf(const DlfRecordPlace& place) 
   const std::size_t lead = place.record - place.begin;
   if (lead == 2) return whole.subspan(1);  // what is left of a prefix
   if (lead != 0) return whole;
-  typed_.assign(1, isPropertyList(whole.subspan(dlfRecordHeaderSize)) ? 0xFF : 0x01);
+  typed_.assign(1, beginsAsPlist(whole.subspan(dlfRecordHeaderSize)) ? 0xFF : 0x01);
   typed_.insert(typed_.end(), whole.begin(), whole.end());
   return typed_;
-}
-
-void DlfReader::fail(std::uint64_t offset, std::string reason) {
-  fault_ = CaptureFault{name_, offset, std::move(reason)};
 }
 
 }  // namespace kelvasi

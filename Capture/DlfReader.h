@@ -26,16 +26,16 @@ class DlfReader : public CaptureReader {
 
   // Reads the whole input; a larger one than `largestFile` is a fault.
   explicit DlfReader(InputBytes& input);
+  // `name` stands for the file in a fault.
+  DlfReader(std::string name, Bytes file);
 
   std::optional<CapturedMessage> next() override;
 
  private:
-  void readAll(InputBytes& input);
   void findRecords();
   bool isVersionReport(const DlfRecordPlace& place) const;
   std::optional<std::chrono::nanoseconds> stampOf(const DlfRecordPlace& place) const;
   std::span<const std::uint8_t> messageOf(const DlfRecordPlace& place);
-  void fail(std::uint64_t offset, std::string reason);
 
   std::string name_;
   Bytes file_;

@@ -7,10 +7,15 @@
 #include <algorithm>
 #include <cerrno>
 #include <system_error>
+#include <utility>
 
 namespace kelvasi {
 
 namespace {
+
+std::string lastError() {
+  return std::generic_category().message(errno);
+}
 
 int openInput(const std::string& path) {
   if (path == "-") return ::fcntl(STDIN_FILENO, F_DUPFD_CLOEXEC, 0);
@@ -32,17 +37,18 @@ int seekCookie(void* cookie, off64_t* offset, int whence) {
 
 InputBytes::InputBytes(const std::string& path)
     : name_(path == "-" ? "standard input" : path), file_(openInput(path)) {
-  const auto reason = [] { return std::generic_category().message(errno); };
-  if (!file_) {
-    fault_ = CaptureFault{name_, std::nullopt, reason()};
-    return;
+  if (!file_) fault_ = CaptureFault{name_, std::nullopt, lastError()};
+}
+
+std::span<const std::uint8_t> InputBytes::firstBytes(std::size_t count) {
+  const std::size_t wanted = std::min(count, first_.size());
+  while (firstCount_ < wanted && !endsInFirst_ && !fault_) {
+    const auto added = readDescriptor(std::span(first_).first(wanted).subspan(firstCount_));
+    if (added < 0) fail(firstCount_, lastError());
+    if (added == 0) endsInFirst_ = true;
+    if (added > 0) firstCount_ += static_cast<std::size_t>(added);
   }
-  while (firstCount_ < first_.size()) {
-    const auto count = readDescriptor(std::span(first_).subspan(firstCount_));
-    if (count < 0) fault_ = CaptureFault{name_, firstCount_, reason()};
-    if (count <= 0) return;
-    firstCount_ += static_cast<std::size_t>(count);
-  }
+  return std::span(first_).first(std::min(wanted, firstCount_));
 }
 
 std::ptrdiff_t InputBytes::read(std::span<std::uint8_t> block) {
@@ -51,11 +57,24 @@ std::ptrdiff_t InputBytes::read(std::span<std::uint8_t> block) {
     if (count > 0) position_ += static_cast<std::uint64_t>(count);
     return count;
   }
-  const auto waiting = firstBytes().subspan(static_cast<std::size_t>(position_));
+  const auto waiting = std::span(first_).first(firstCount_).subspan(static_cast<std::size_t>(position_));
   const auto taken = waiting.first(std::min(waiting.size(), block.size()));
   std::ranges::copy(taken, block.begin());
   position_ += taken.size();
   return static_cast<std::ptrdiff_t>(taken.size());
+}
+
+Bytes InputBytes::readToEnd(std::size_t largest, std::string_view kind) {
+  Bytes bytes;
+  std::array<std::uint8_t, 65536> block;
+  std::ptrdiff_t count = 0;
+  while (!fault_ && (count = read(block)) > 0) {
+    bytes.insert(bytes.end(), block.begin(), block.begin() + count);
+    if (bytes.size() > largest) fail(largest, "larger than " + std::string(kind) + " may be here");
+  }
+  if (count < 0) fail(bytes.size(), lastError());
+  if (!fault_ && bytes.empty()) fail(0, "an empty file");
+  return bytes;
 }
 
 std::ptrdiff_t InputBytes::readDescriptor(std::span<std::uint8_t> block) {
@@ -64,6 +83,10 @@ std::ptrdiff_t InputBytes::readDescriptor(std::span<std::uint8_t> block) {
     count = ::read(file_.number(), block.data(), block.size());
   } while (count < 0 && errno == EINTR);
   return count;
+}
+
+void InputBytes::fail(std::uint64_t offset, std::string reason) {
+  fault_ = CaptureFault{name_, offset, std::move(reason)};
 }
 
 std::unique_ptr<std::FILE, InputBytes::Close> InputBytes::stream() {

@@ -24,9 +24,10 @@ std::string wrongLinkType(int linkType) {
          " instead of " + std::to_string(DLT_USER0) + " (USER0)";
 }
 
-// The library knows of DLF files as little as it says what it reads.
+// The library knows nothing of DLF files and snapshots, and does not say what it reads.
 std::string whyNotOpened(const std::string& error) {
-  return error == "unknown file format" ? error + "; pcap, pcapng and DLF files are read" : error;
+  return error == "unknown file format" ? error + "; pcap, pcapng and DLF files and snapshots are read"
+                                        : error;
 }
 
 }  // namespace

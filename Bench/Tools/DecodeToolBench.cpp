@@ -22,7 +22,7 @@ void decodeFile(benchmark::State& state, const Technology& technology, std::size
   for (auto _ : state) {
     Decode decode(LogGenerator::generatorFromTechnology(technology.id, surroundings.platform()),
                   [](TickSchedule::Time, const PlistValue&) {});
-    const auto capture = openCapture(path);
+    const auto capture = openCapture(path, surroundings.platform().plists);
     decode.take(*capture);
     decode.finish();
     if (capture->fault() || !decode.display()) return state.SkipWithError("the capture was not decoded");

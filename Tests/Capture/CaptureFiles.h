@@ -5,6 +5,7 @@
 #include <vector>
 
 #include "Capture/CaptureReader.h"
+#include "Platform/Plist/LibplistSerialiser.h"
 #include "Platform/Posix/Files.h"
 #include "Tests/Platform/Posix/Surroundings.h"
 #include "Tests/Support/HexBytes.h"
@@ -29,7 +30,7 @@ struct ReadCapture {
 
 inline ReadCapture readCapture(const std::string& path) {
   ReadCapture capture;
-  const auto reader = openCapture(path);
+  const auto reader = openCapture(path, LibplistSerialiser());
   while (const auto message = reader->next()) {
     capture.messages.emplace_back(message->bytes.begin(), message->bytes.end());
     capture.arrivals.push_back(message->arrival.count());

@@ -38,7 +38,9 @@ class PipedInput {
 TEST(InputBytes, ShowsTheFirstBytesAndReadsThemAllTheSame) {
   const CaptureDirectory directory;
   InputBytes input(directory.write("a", hex("0102030405")));
-  EXPECT_THAT(input.firstBytes(), ElementsAre(1, 2, 3, 4));
+  EXPECT_THAT(input.firstBytes(2), ElementsAre(1, 2));
+  EXPECT_THAT(input.firstBytes(4), ElementsAre(1, 2, 3, 4));
+  EXPECT_THAT(input.firstBytes(1), ElementsAre(1));
   Bytes block(3);
   EXPECT_EQ(input.read(block), 3);
   EXPECT_EQ(block, hex("010203"));
@@ -51,8 +53,8 @@ TEST(InputBytes, ShowsTheFirstBytesAndReadsThemAllTheSame) {
 
 TEST(InputBytes, ShowsLessOfAShortFile) {
   const CaptureDirectory directory;
-  EXPECT_THAT(InputBytes(directory.write("a", hex("0102"))).firstBytes(), ElementsAre(1, 2));
-  EXPECT_THAT(InputBytes(directory.write("a", {})).firstBytes(), IsEmpty());
+  EXPECT_THAT(InputBytes(directory.write("a", hex("0102"))).firstBytes(4), ElementsAre(1, 2));
+  EXPECT_THAT(InputBytes(directory.write("a", {})).firstBytes(4), IsEmpty());
 }
 
 TEST(InputBytes, TellsTheStreamsPlaceInAPipe) {
@@ -79,6 +81,21 @@ TEST(InputBytes, TellsADlfFileInAPipeByItsVersionReport) {
   report.resize(161);
   const PipedInput piped(report + hex("0D00 C0B0 0000000000000000 77"));
   EXPECT_THAT(readCapture("-").messages, ElementsAre(hex("01 0D00 C0B0 0000000000000000 77")));
+}
+
+TEST(InputBytes, TellsASnapshotInAPipeByItsContent) {
+  const PipedInput piped(
+      bytesOf("\n<plist><dict><key>Data</key><array><dict><key>DLF</key>"
+              "<data>DQDAsAAAAAAAAAAAdw==</data></dict></array></dict></plist>"));
+  EXPECT_THAT(readCapture("-").messages, ElementsAre(hex("01 0D00 C0B0 0000000000000000 77")));
+}
+
+TEST(InputBytes, ShowsNoMoreThanItsFirstBytesAndTakesNoneAway) {
+  const CaptureDirectory directory;
+  InputBytes input(directory.write("a", Bytes(300, 7)));
+  EXPECT_EQ(input.firstBytes(1000).size(), InputBytes::mostFirstBytes);
+  EXPECT_EQ(input.readToEnd(300, "a test"), Bytes(300, 7));
+  EXPECT_FALSE(input.fault());
 }
 
 }  // namespace

@@ -18,7 +18,7 @@ class BadCaptures(KelvasictlTest):
 
     def test_an_unknown_format_is_told_with_those_that_are_read(self):
         result = self.decode(self.write("text.pcap", b"this is no capture at all"))
-        self.assert_fault(result, "byte 0: unknown file format; pcap, pcapng and DLF files are read")
+        self.assert_fault(result, "byte 0: unknown file format; pcap, pcapng and DLF files and snapshots are read")
 
     def test_a_cut_capture_is_decoded_up_to_the_cut(self):
         contents = pcap(MM_IDLE, GMM_REGISTERED)

@@ -89,7 +89,7 @@ class DecodeVerb {
     std::size_t notRead = options_.captures.size();
     for (const std::string& path : options_.captures) {
       --notRead;
-      const auto capture = openCapture(path);
+      const auto capture = openCapture(path, surroundings_.plists);
       decode.take(*capture);
       if (capture->cutMessages() > 0)
         complain(path + ": " + std::to_string(capture->cutMessages()) +
@@ -178,7 +178,7 @@ void addOptions(CLI::App& verb, DecodeOptions& options) {
   verb.add_flag("--start-command", options.startCommand,
                 "print the command that starts the stream, as a property list, and end");
   verb.add_option("CAPTURE", options.captures,
-                  "pcap, pcapng or DLF files, in order; - is the standard input");
+                  "pcap, pcapng or DLF files or snapshots, in order; - is the standard input");
   options.surroundings.addTo(verb);
 }
 

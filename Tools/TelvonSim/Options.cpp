@@ -57,7 +57,8 @@ void addOptions(CLI::App& app, Options& options) {
       ->required();
   const auto scenario =
       app.add_option("--scenario", options.scenario, "what to play; see --list-scenarios")->type_name("NAME");
-  app.add_option("--replay", options.replay, "play the messages of a capture, with its timing")
+  app.add_option("--replay", options.replay,
+                 "play the messages of a capture (pcap, pcapng, DLF) or a snapshot, with its timing")
       ->type_name("CAPTURE")
       ->excludes(scenario);
   app.add_flag("--loop", options.isLooping, "begin the capture again when it has ended")->needs("--replay");

@@ -36,10 +36,10 @@ void tellFaults(const std::string& path, const CaptureReader& capture) {
   if (capture.fault()) std::fprintf(stderr, "telvon-sim: %s\n", capture.fault()->text().c_str());
 }
 
-SourceResult replaySource(const Options& options) {
+SourceResult replaySource(const Options& options, const PlistSerialiser& plists) {
   SourceResult result;
   result.source = std::make_unique<sim::ReplaySource>(
-      [path = options.replay] { return openCapture(path); }, options.isLooping,
+      [path = options.replay, &plists] { return openCapture(path, plists); }, options.isLooping,
       [path = options.replay](const CaptureReader& capture) { tellFaults(path, capture); });
   if (!result.source->nextAt())
     return {.source = nullptr, .failure = options.replay + ": no messages to play", .exitStatus = 1};
@@ -49,7 +49,7 @@ SourceResult replaySource(const Options& options) {
 }  // namespace
 
 SourceResult makeSource(const Options& options, const PlistSerialiser& plists) {
-  if (!options.replay.empty()) return replaySource(options);
+  if (!options.replay.empty()) return replaySource(options, plists);
   return scenarioSource(options, plists);
 }
 
