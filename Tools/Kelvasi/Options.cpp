@@ -22,7 +22,7 @@ void addOptions(CLI::App& app, Options& options) {
   app.add_flag("--fullscreen", options.fullScreen,
                "fill the screen; a window of 390 by 844 points otherwise");
   app.add_flag("--log-stderr", options.logsToStderr,
-               "system-log lines go to the standard error, as \"<N>text\", instead of to syslog");
+               R"(system-log lines go to the standard error, as "<N>text", instead of to syslog)");
   app.add_option_function<std::string>(
          "--appearance",
          [&options](const std::string& name) {

@@ -169,7 +169,7 @@ void addOptions(CLI::App& verb, DecodeOptions& options) {
       ->type_name("FORMAT")
       ->check(CLI::IsMember({"json", "tree", "plist"}));
   verb.add_flag("--every-tick", options.everyTick,
-                "a JSON line {\"time\": ..., \"display\": ...} for each display tick");
+                R"(a JSON line {"time": ..., "display": ...} for each display tick)");
   verb.add_option("--dlf", options.dlf, "also write the DLF file that a snapshot would hold")
       ->type_name("FILE")
       ->check(named);

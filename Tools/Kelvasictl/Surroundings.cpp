@@ -38,7 +38,7 @@ void SurroundingsOptions::addTo(CLI::App& verb) {
   verb.add_option("--resources", resources, "where the display templates are (also KELVASI_RESOURCES)")
       ->type_name("DIR");
   verb.add_flag("--log-stderr", logsToStderr,
-                "system-log lines go to the standard error, as \"<N>text\", instead of to syslog");
+                R"(system-log lines go to the standard error, as "<N>text", instead of to syslog)");
 }
 
 Surroundings::Surroundings(const SurroundingsOptions& options)

@@ -22,6 +22,7 @@ int run(int argumentCount, char** arguments) {
   CLI::App app("Decodes, watches and records the diagnostic stream of a cellular modem.", "kelvasictl");
   app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
   std::vector<Action> actions;
+  actions.reserve(verbs.size());
   for (const Verb& verb : verbs) actions.push_back(verb.declare(*app.add_subcommand(verb.name, verb.help)));
   try {
     app.parse(argumentCount, arguments);
@@ -42,6 +43,7 @@ int run(int argumentCount, char** arguments) {
 
 }  // namespace kelvasi
 
+// NOLINTNEXTLINE(bugprone-exception-escape): the terminate handler tells of what is no ToolError
 int main(int argumentCount, char** arguments) {
   kelvasi::secureStandardStreams();
   try {

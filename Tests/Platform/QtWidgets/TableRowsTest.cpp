@@ -9,7 +9,6 @@ namespace {
 
 using test::RowContents;
 using test::RowsController;
-using testing::ElementsAre;
 using testing::UnorderedElementsAre;
 
 // Counts events of a kind by widget.
