@@ -27,7 +27,13 @@ QtApplicationFramework::QtApplicationFramework(int& argumentCount, char** argume
   QApplication::setDesktopFileName(QStringLiteral("org.kelvasi.Kelvasi"));
 }
 
-QtApplicationFramework::~QtApplicationFramework() = default;
+// Qt's part for Wayland may wait for a thread of its own for ever when it goes. The end of the process takes
+// it.
+QtApplicationFramework::~QtApplicationFramework() {
+  loop_.reset();
+  if (QGuiApplication::platformName().startsWith(QLatin1String("wayland")))
+    static_cast<void>(application_.release());
+}
 
 void QtApplicationFramework::run(const ApplicationClasses& classes, std::string_view applicationClass,
                                  std::string_view delegateClass) {
