@@ -88,6 +88,16 @@ class Saving(ViewerTest):
         self.assertEqual(dlf["Description"], f"DLF binary ({len(dlf['DLF'])} bytes)")
         self.assert_dlf(dlf["DLF"], MM_IDLE[1:] + GMM_REGISTERED + MM_IDLE[1:], before, time.time())
 
+    def test_no_more_than_the_last_five_updates_are_saved(self):
+        viewer = self.start_world("--scenario", "drive")
+        viewer.do(*["await-update"] * 5, "click Save")  # the sixth interval
+        texts = [row[0] for row in viewer.state()["saveView"]["rows"]]
+        self.assertEqual([text.partition(" (")[0] for text in texts], ["Snapshot"] * 5 + ["DLF binary"])
+        self.assertEqual(texts[:5], sorted(set(texts[:5])))
+        viewer.do("click Save")
+        viewer.await_state(lambda state: state["saveView"] is None)
+        self.assertEqual([entry["Description"] for entry in self.saved()["Data"]], texts)
+
     def test_an_untouched_field_is_saved_as_an_empty_description(self):
         self.save(self.replay(MM_IDLE))
         self.assertEqual(self.saved()["Description"], "")
