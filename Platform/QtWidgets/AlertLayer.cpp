@@ -40,7 +40,7 @@ AlertLayer::AlertLayer(QWidget& parent, const AlertText& text) : Layer(parent) {
   setAccessibleName(text.title);
   setAccessibleDescription(text.message);
   auto* const card = new Card(this);
-  card->setBackgroundRole(QPalette::ToolTipBase);
+  card->setBackgroundRole(QPalette::ToolTipBase);  // lighter than rows in the dark, to stand out
   card->setFixedWidth(cardWidth);
   fill(*card, text);
   auto* const layout = new QGridLayout(this);

@@ -20,7 +20,7 @@ namespace {
 
 constexpr double textSize = 15;
 constexpr QSize windowSize(390, 844);
-constexpr int titleBarHeight = 48;  // points; desktops' are no higher
+constexpr int titleBarHeight = 48;  // points, a generous one
 constexpr int phoneSide = 480;      // a screen with a side no longer than this is a phone's
 
 bool isPhone(const QSize& screen) {

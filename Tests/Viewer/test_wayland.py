@@ -42,7 +42,7 @@ class Wayland(ViewerTest):
         self.assertEqual(plistlib.loads(self.read(os.path.join("snapshots", name))).keys(), {"Timestamp"})
 
     def test_a_signal_ends_it_well_every_time(self):
-        for _ in range(40):  # one in fifteen used to wait for a thread of Qt's for ever
+        for _ in range(40):  # a race among Qt's threads is lost once in fifteen times or so
             viewer = self.start_viewer()
             viewer.state()
             self.assertEqual((viewer.interrupt(), viewer.said()), (0, ""))
