@@ -15,7 +15,6 @@ constexpr std::int64_t frameMicroseconds = 1250;
 constexpr std::int64_t fractions = 65536;
 
 constexpr std::chrono::seconds systemTimeEpoch{315964800};  // 6 January 1980, since 1970
-constexpr std::chrono::seconds worldEpoch{1704067200};      // 1 January 2024, since 1970
 
 void put(Bytes& record, std::size_t at, std::uint64_t value, std::size_t size) {
   for (std::size_t place = 0; place < size; ++place, value >>= 8)

@@ -5,9 +5,11 @@
 
 namespace kelvasi::sim {
 
-// Sets the record's length, which counts from the length field on, and its time stamp: the moment `at` of a
-// world that began on 1 January 2024 UTC, in CDMA system time (3GPP2 C.S0002). Bytes that hold no whole
-// record header stay as they are.
+// When every world began, 1 January 2024 UTC, since 1970.
+inline constexpr std::chrono::seconds worldEpoch{1704067200};
+
+// Sets the record's length, which counts from the length field on, and its time stamp: the world's moment
+// `at`, in CDMA system time (3GPP2 C.S0002). Bytes that hold no whole record header stay as they are.
 void stampRecord(Bytes& record, WorldTime at);
 
 }  // namespace kelvasi::sim

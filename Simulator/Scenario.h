@@ -22,6 +22,15 @@ class Scenario {
   virtual void greet(Messages& messages) = 0;
 };
 
+// Lets `time` pass, in whole steps, without a word of it.
+inline void skip(Scenario& scenario, WorldTime time) {
+  Messages untold;
+  for (WorldTime now{0}; now < time; now += scenario.stepLength()) {
+    scenario.step(untold);
+    untold.clear();
+  }
+}
+
 using ScenarioMaker = std::function<std::unique_ptr<Scenario>()>;
 
 // Plays a scenario without end; a rewound one is made anew.

@@ -1,6 +1,7 @@
 #include "Tools/TelvonSim/Options.h"
 
 #include <CLI/CLI.hpp>
+#include <cmath>
 
 #include "Platform/Posix/PackageResources.h"
 #include "Simulator/Commands.h"
@@ -75,6 +76,13 @@ void addOptions(CLI::App& app, Options& options) {
   app.add_option("--seed", options.seed, "the same seed gives the same messages")
       ->type_name("N")
       ->capture_default_str();
+  app.add_option_function<double>(
+         "--start-at",
+         [&options](double seconds) { options.startAt = std::chrono::seconds(std::llround(seconds)); },
+         "begin so many whole seconds after the scenario's beginning")
+      ->type_name("N")
+      ->check(numberBetween(0, 86400, "from 0 to 86400"))
+      ->excludes("--replay");
   app.add_option("--seconds", options.seconds, "end after so many seconds")
       ->type_name("N")
       ->check(numberBetween(0, 1e9, "from 0 to 1000000000"));
@@ -88,6 +96,18 @@ void addOptions(CLI::App& app, Options& options) {
          },
          "misbehave; see below")
       ->type_name("FAULT");
+  const auto write =
+      app.add_option("--write", options.write,
+                     "write what a stream from the start brings into a pcap file, without waiting, and end")
+          ->type_name("FILE")
+          ->excludes("--replay")
+          ->excludes("--seconds");
+  const auto messages = app.add_option("--messages", options.messages, "how many messages go into the file")
+                            ->type_name("N")
+                            ->check(CLI::PositiveNumber)
+                            ->needs(write);
+  write->needs(messages);
+  app.add_flag("--force", options.isForced, "the file may take the place of another")->needs(write);
   app.add_flag_callback(
       "--list-scenarios",
       [] {

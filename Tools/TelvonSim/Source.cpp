@@ -13,6 +13,13 @@ namespace {
 
 constexpr int wrongUsage = 2;
 
+std::unique_ptr<sim::Scenario> begun(const sim::ScenarioKind& kind, const Options& options,
+                                     const PlistSerialiser& plists) {
+  auto scenario = kind.make(options.seed, plists);
+  sim::skip(*scenario, options.startAt);
+  return scenario;
+}
+
 SourceResult scenarioSource(const Options& options, const PlistSerialiser& plists) {
   const sim::ScenarioKind* kind = sim::findScenario(options.technology, options.scenario);
   if (!kind) {
@@ -24,9 +31,9 @@ SourceResult scenarioSource(const Options& options, const PlistSerialiser& plist
             .exitStatus = wrongUsage};
   }
   if (options.rate > 0)
-    return {.source = std::make_unique<sim::LoadSource>(kind->make(options.seed, plists), options.rate)};
+    return {.source = std::make_unique<sim::LoadSource>(begun(*kind, options, plists), options.rate)};
   return {.source = std::make_unique<sim::ScenarioSource>(
-              [kind, seed = options.seed, &plists] { return kind->make(seed, plists); })};
+              [kind, options, &plists] { return begun(*kind, options, plists); })};
 }
 
 void tellFaults(const std::string& path, const CaptureReader& capture) {

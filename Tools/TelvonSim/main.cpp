@@ -15,6 +15,7 @@
 #include "Telvon/TechnologyName.h"
 #include "Tools/TelvonSim/Options.h"
 #include "Tools/TelvonSim/Source.h"
+#include "Tools/TelvonSim/WrittenDrive.h"
 
 namespace kelvasi {
 
@@ -68,11 +69,22 @@ int serve(const Options& options) {
   return 0;
 }
 
+int writeDrive(const Options& options) {
+  const LibplistSerialiser plists;
+  const SourceResult made = makeSource(options, plists);
+  const std::string failure = made.source ? writeCapture(*made.source, options) : made.failure;
+  if (failure.empty()) return 0;
+  complain(failure);
+  return made.source ? 1 : made.exitStatus;
+}
+
 }  // namespace
 
 }  // namespace kelvasi
 
 int main(int argumentCount, char** arguments) {
   const kelvasi::CommandLine commandLine = kelvasi::parseCommandLine(argumentCount, arguments);
-  return commandLine.options ? kelvasi::serve(*commandLine.options) : commandLine.exitStatus;
+  if (!commandLine.options) return commandLine.exitStatus;
+  const kelvasi::Options& options = *commandLine.options;
+  return options.write.empty() ? kelvasi::serve(options) : kelvasi::writeDrive(options);
 }
