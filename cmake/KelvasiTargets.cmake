@@ -1,6 +1,6 @@
 # How every target of the project is compiled.
 add_library(kelvasi_options INTERFACE)
-target_compile_options(kelvasi_options INTERFACE -Wall -Wextra -Wconversion -Wshadow -Werror)
+target_compile_options(kelvasi_options INTERFACE -Wall -Wextra -Wconversion -Wshadow)
 target_include_directories(kelvasi_options INTERFACE ${PROJECT_SOURCE_DIR})
 if(KELVASI_SANITIZE)
   target_compile_options(kelvasi_options INTERFACE -fsanitize=${KELVASI_SANITIZE} -fno-omit-frame-pointer

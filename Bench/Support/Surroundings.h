@@ -26,7 +26,7 @@ struct Surroundings {
   MaskedLog log;
   NoTrace trace;
   LibplistSerialiser plists;
-  PackageResources resources;
+  PackageResources resources{KELVASI_BENCH_RESOURCES};
   PosixClock clock;
 
   Platform platform() { return {log, trace, plists, resources, clock}; }

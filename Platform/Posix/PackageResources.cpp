@@ -28,16 +28,26 @@ bool isResource(const fs::directory_entry& entry, const std::string& extension) 
          entry.is_regular_file(unreadable);
 }
 
+// Of the program itself, not of a link to it.
+fs::path programDirectory() {
+  std::error_code unreadable;
+  return fs::read_symlink("/proc/self/exe", unreadable).parent_path();
+}
+
 }  // namespace
 
 PackageResources::PackageResources(fs::path directory) : directory_(std::move(directory)) {}
 
 fs::path PackageResources::standardDirectory() {
   const char* chosen = std::getenv("KELVASI_RESOURCES");
-  if (chosen && *chosen) return chosen;
+  return chosen && *chosen ? fs::path(chosen) : directoryFor(programDirectory());
+}
+
+fs::path PackageResources::directoryFor(const fs::path& programs) {
   std::error_code unreadable;
-  const fs::path source = KELVASI_SOURCE_RESOURCES;
-  return fs::is_directory(source, unreadable) ? source : fs::path(KELVASI_INSTALLED_RESOURCES);
+  const fs::path beside = programs / "Resources";
+  if (fs::is_directory(beside, unreadable)) return beside;
+  return (programs / KELVASI_INSTALLED_RESOURCES).lexically_normal();
 }
 
 std::vector<std::string> PackageResources::pathsOfType(std::string_view type) const {

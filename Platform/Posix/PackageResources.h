@@ -14,9 +14,13 @@ class PackageResources : public Resources {
 
   explicit PackageResources(std::filesystem::path directory = standardDirectory());
 
-  // KELVASI_RESOURCES where that is set and not empty; else the source tree's directory while it is there;
-  // else the one of the installation.
+  // KELVASI_RESOURCES where that is set and not empty; else the one that belongs to this program.
   static std::filesystem::path standardDirectory();
+  // For programs in a directory: Resources beside them, as in a build tree, where it is there; else the one
+  // of their installation, whether it is there or not.
+  static std::filesystem::path directoryFor(const std::filesystem::path& programs);
+
+  const std::filesystem::path& directory() const { return directory_; }
 
   std::vector<std::string> pathsOfType(std::string_view type) const override;
   // Names and types with a slash or a NUL, empty ones and names that begin with a dot name no resource.

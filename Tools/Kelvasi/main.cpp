@@ -21,6 +21,7 @@
 #include "Platform/QtWidgets/QtUserInterface.h"
 #include "Tools/Kelvasi/Options.h"
 #include "Tools/Kelvasi/Script.h"
+#include "Tools/Kelvasi/TemplateNotice.h"
 
 namespace kelvasi {
 
@@ -48,6 +49,7 @@ bool run(QtApplicationFramework& framework, const Options& options) {
                                        .internalInstallMarker = KELVASI_INTERNAL_INSTALL_MARKER}};
   const ApplicationClasses classes{{"KelvasiApp", [&] { return std::make_unique<KelvasiApp>(platform); }}};
   const Script script(options.script);
+  queue.post([&] { noticeMissingTemplates(resources, ui); });  // when the window is there
   framework.run(classes, "KelvasiApp", "KelvasiApp");
   return !script.hasFailed();
 }

@@ -29,7 +29,8 @@ std::filesystem::path resourcesDirectory(const SurroundingsOptions& options) {
   std::error_code error;
   if (std::filesystem::is_directory(directory, error)) return directory;
   if (!error) error = std::make_error_code(std::errc::not_a_directory);
-  throw ToolError(directory.native() + ": " + error.message());
+  throw ToolError(directory.native() + ": " + error.message() +
+                  "; --resources or KELVASI_RESOURCES names where the display templates are");
 }
 
 }  // namespace

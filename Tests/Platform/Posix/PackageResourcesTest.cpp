@@ -14,8 +14,10 @@ namespace {
 
 using namespace std::string_view_literals;
 using ::testing::ElementsAre;
+using ::testing::HasSubstr;
 using ::testing::IsEmpty;
 using ::testing::MatchesRegex;
+using ::testing::Not;
 using testing::TemporaryDirectory;
 using testing::Variable;
 
@@ -93,9 +95,19 @@ TEST_F(PackageResourcesTest, TheEnvironmentChoosesTheDirectory) {
   EXPECT_THAT(PackageResources().pathsOfType("plist"), ElementsAre(directory.file("a.plist")));
 }
 
-TEST_F(PackageResourcesTest, WithoutTheVariableItIsTheSourceTreesOrTheInstallations) {
+TEST_F(PackageResourcesTest, WithoutTheVariableItBelongsToTheProgram) {
   const Variable variable("KELVASI_RESOURCES", "");
-  EXPECT_THAT(PackageResources::standardDirectory().native(), MatchesRegex(".+/(Resources|share/kelvasi)"));
+  const auto program = std::filesystem::read_symlink("/proc/self/exe");
+  EXPECT_EQ(PackageResources::standardDirectory(), PackageResources::directoryFor(program.parent_path()));
+}
+
+TEST_F(PackageResourcesTest, ProgramsHaveTheirResourcesBesideThemOrInTheirInstallation) {
+  const auto programs = directory.path() / "bin";
+  const auto installed = PackageResources::directoryFor(programs);
+  EXPECT_EQ(installed.filename(), "kelvasi");
+  EXPECT_THAT(installed.native(), Not(HasSubstr("..")));
+  std::filesystem::create_directories(programs / "Resources");
+  EXPECT_EQ(PackageResources::directoryFor(programs), programs / "Resources");
 }
 
 TEST_F(PackageResourcesTest, StatesTheProjectsVersion) {

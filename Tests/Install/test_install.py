@@ -1,0 +1,135 @@
+"""What is installed, where it is found again, and how a packager configures and compiles."""
+
+import json
+import os
+import pathlib
+import shlex
+import shutil
+import subprocess
+import tempfile
+import unittest
+
+from live_support import PATIENCE, LiveTest
+from support import MM_IDLE, pcap
+
+CMAKE = os.environ["CMAKE"]
+BUILD = os.environ["BUILD"]
+SOURCES = pathlib.Path(os.environ["SOURCES"])
+
+PROGRAMS = {"bin/kelvasi", "bin/kelvasictl", "bin/telvon-sim"}
+TEMPLATES = {f"share/kelvasi/{name}" for name in ("C2KTemplate.plist", "LTE.plist", "Orvane_GSM.plist", "UTRAN.plist")}
+DESKTOP = {"share/applications/org.kelvasi.Kelvasi.desktop",
+           "share/icons/hicolor/scalable/apps/org.kelvasi.Kelvasi.svg"}
+
+
+def cmake(*arguments, **variables):
+    return subprocess.run([CMAKE, *map(str, arguments)], env=os.environ | variables, capture_output=True, text=True,
+                          timeout=PATIENCE, check=True)
+
+
+class Installed(LiveTest):
+    """Staged for /opt/kelvasi, then moved to where no build ever heard of."""
+
+    @classmethod
+    def setUpClass(cls):
+        directory = tempfile.TemporaryDirectory()
+        cls.addClassCleanup(directory.cleanup)
+        cmake("--install", BUILD, "--prefix", "/opt/kelvasi", DESTDIR=directory.name + "/stage")
+        cls.prefix = pathlib.Path(shutil.move(directory.name + "/stage/opt/kelvasi", directory.name + "/moved"))
+
+    def setUp(self):
+        super().setUp()
+        screen = {"name": "screen", "x": 0, "y": 0, "width": 1000, "height": 900}
+        path = self.write("screen.json", json.dumps({"screens": [screen]}).encode())
+        self.environment |= {"HOME": self.directory.name, "XDG_RUNTIME_DIR": self.directory.name,
+                             "QT_QPA_PLATFORM": "offscreen:configfile=" + path}
+
+    def lose_templates(self):
+        templates = self.prefix / "share/kelvasi"
+        lost = templates.rename(self.prefix / "lost")
+        self.addCleanup(lost.rename, templates)
+
+    def program(self, name):
+        return self.prefix / "bin" / name
+
+    def run_installed(self, name, *arguments, **options):
+        return subprocess.run([self.program(name), *arguments], env=self.environment, capture_output=True, text=True,
+                              timeout=PATIENCE, check=False, **options)
+
+    def state_of_viewer(self, program="kelvasi", script="state\n"):
+        result = self.run_installed(program, "--script", "-", input=script)
+        self.assertEqual((result.returncode, result.stderr), (0, ""))
+        return json.loads(next(line for line in result.stdout.splitlines() if line.startswith("{")))
+
+    def test_the_programs_and_what_they_need_are_there(self):
+        files = {str(path.relative_to(self.prefix)) for path in self.prefix.rglob("*") if path.is_file()}
+        self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | {"share/doc/kelvasi/LICENSE"})
+
+    def test_captures_are_decoded(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        for technology, branch in (("Orvane_GSM", "Registration"), ("Orvane_LTE", "Serving Cell"),
+                                   ("Orvane_UTRAN2", "Serving Cell"), ("Orvane_CDMA", "1x")):
+            result = self.run_installed("kelvasictl", "decode", "--technology", technology, capture)
+            self.assertEqual((result.returncode, result.stderr), (0, ""))
+            self.assertTrue(any(branch in name for name in json.loads(result.stdout)), result.stdout)
+
+    def test_the_viewer_shows_what_the_simulated_daemon_sends(self):
+        daemon = self.start([self.program("telvon-sim"), "--technology", "Orvane_GSM"])
+        self.await_line(daemon, "serving")
+        monitor = self.run_installed("kelvasictl", "monitor", "--once", "--format", "tree")
+        self.assertIn("/Registration\t", monitor.stdout, monitor.stderr)
+        state = self.state_of_viewer(script="await-status Updated\nstate\n")
+        self.assertIn(["Registration"], state["rows"])
+        self.assertIsNone(state["alert"])
+
+    def test_without_templates_the_window_says_so_and_where_they_were_sought(self):
+        self.lose_templates()
+        said = self.state_of_viewer()["alert"]
+        self.assertEqual(said["title"], "No display templates")
+        self.assertIn(f"{self.prefix}/share/kelvasi", said["message"])
+
+    def test_without_templates_kelvasictl_says_what_to_do(self):
+        self.lose_templates()
+        result = self.run_installed("kelvasictl", "decode", "--technology", "Orvane_GSM",
+                                    self.write("a.pcap", pcap(MM_IDLE)))
+        self.assertEqual(result.returncode, 1)
+        self.assertEqual(result.stderr, f"kelvasictl: {self.prefix}/share/kelvasi: No such file or directory; "
+                                        "--resources or KELVASI_RESOURCES names where the display templates are\n")
+
+    def test_a_link_to_a_program_finds_them_too(self):
+        link = self.path("link")
+        os.symlink(self.program("kelvasi"), link)
+        self.assertIsNone(self.state_of_viewer(program=link)["alert"])
+
+
+class Configured(unittest.TestCase):
+    """What each source is compiled with, in a build tree of its own."""
+
+    def commands(self, *arguments):
+        with tempfile.TemporaryDirectory() as build:
+            cmake("-S", SOURCES, "-B", build, *arguments, CXXFLAGS="", CPPFLAGS="")
+            commands = json.loads(pathlib.Path(build, "compile_commands.json").read_text())
+        return {os.path.relpath(command["file"], SOURCES): shlex.split(command["command"]) for command in commands}
+
+    def test_plainly_it_is_optimised_programs_and_nothing_else(self):
+        commands = self.commands()
+        for source in ("Tools/Kelvasi/main.cpp", "Tools/Kelvasictl/main.cpp", "Tools/TelvonSim/main.cpp"):
+            self.assertIn("-O3", commands[source])
+        self.assertEqual({pathlib.Path(source).parts[0] for source in commands} & {"Tests", "Bench", "Fuzz"}, set())
+        for source, command in commands.items():
+            self.assertNotIn("-Werror", command, source)
+
+    def test_the_flags_of_packages_stay_and_bring_no_warning_about_the_build_time(self):
+        flags = [subprocess.run(["dpkg-buildflags", "--get", name], capture_output=True, text=True,
+                                check=True).stdout.strip() for name in ("CXXFLAGS", "CPPFLAGS")]
+        command = self.commands(f"-DCMAKE_CXX_FLAGS={' '.join(flags)}", "-DCMAKE_BUILD_TYPE=None",
+                                "-DCMAKE_COMPILE_WARNING_AS_ERROR=ON")["Platform/Posix/BuildTime.cpp"]
+        self.assertLess({"-O2", "-Wdate-time", "-Werror"}, set(command))
+        self.assertNotIn("-O3", command)
+        compiled = subprocess.run([*command[:command.index("-o")], "-fsyntax-only", command[-1]], capture_output=True,
+                                  text=True, check=False)
+        self.assertEqual((compiled.returncode, compiled.stderr), (0, ""))
+
+
+if __name__ == "__main__":
+    unittest.main()
