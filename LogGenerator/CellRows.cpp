@@ -18,7 +18,7 @@ void showCell(const PlistDictionary& cell, std::span<const CellRow> rows, RowWri
     if (!number) {
       if (!row.failure.empty()) log.write(LogPriority::error, row.failure);
     } else if (row.isMeasurement && *number == notMeasured) {
-      writer.text(row.key, {});
+      writer.text(row.key, std::string_view());
     } else {
       writer.number(row.key, std::int64_t{*number} * row.factor, row.unit);
     }

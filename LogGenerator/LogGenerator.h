@@ -14,6 +14,9 @@
 #include <span>
 #include <string_view>
 
+#include "LogGenerator/Arrival.h"
+#include "LogGenerator/Intake.h"
+#include "LogGenerator/Readings.h"
 #include "Platform/Platform.h"
 #include "Plist/PlistValue.h"
 
@@ -46,15 +49,31 @@ class LogGenerator {
   // the first of its keys that the state lacks.
   static void updateHistoryInState(PlistDictionary& state, const Clock& clock);
 
+  // The arrival of the messages from now on; the caller says it anew before each of them.
+  void setArrival(Arrival arrival) { arrival_ = arrival; }
+  // From now on every message's readings are gathered there, until another place or null is named.
+  virtual void gatherInto(Readings* readings) { readings_ = readings; }
+  // What became of the messages so far.
+  const Intake& intake() const { return intake_; }
+
   // The generator for what the daemon calls the technology; null for one that is not known.
   static std::unique_ptr<LogGenerator> generatorFromTechnology(std::string_view technology,
                                                                const Platform& platform);
 
  protected:
   const Platform& platform() const { return platform_; }
+  Arrival arrival() const { return arrival_; }
+  Readings* readings() const { return readings_; }  // null: nobody listens
+  void count(LogCode logCode, Outcome outcome, std::span<const std::uint8_t> record,
+             std::optional<std::size_t> versionAt = {}) {
+    intake_.count(logCode, outcome, arrival_, record, versionAt);
+  }
 
  private:
   Platform platform_;
+  Arrival arrival_{0};
+  Readings* readings_ = nullptr;
+  Intake intake_;
 };
 
 }  // namespace kelvasi

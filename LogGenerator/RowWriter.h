@@ -30,6 +30,9 @@ class RowWriter {
     place_ = mode_ == Rows::anew ? rows_.rewriteText(key, text, place_) : rows_.setText(key, text, place_);
   }
 
+  void text(std::string_view key, DeferredText text) {
+    place_ = mode_ == Rows::anew ? rows_.rewriteText(key, text, place_) : rows_.setText(key, text, place_);
+  }
   // As "%d" of a 32-bit integer, the unit (at most 16 characters) right after it.
   template <std::integral Integer>
   void number(std::string_view key, Integer value, std::string_view unit = {}) {
@@ -41,7 +44,7 @@ class RowWriter {
 
   // A row that is no text. Setting the absent value removes the row.
   void value(std::string_view key, PlistValue value) {
-    if (mode_ == Rows::anew) text(key, {});
+    if (mode_ == Rows::anew) text(key, std::string_view());
     rows_.set(key, std::move(value));
   }
 

@@ -51,21 +51,34 @@ void PlistDictionary::removeAll() {
   truncate(0);
 }
 
-std::size_t PlistDictionary::setText(std::string_view key, std::string_view text, std::size_t place) {
+template <typename Text>
+std::size_t PlistDictionary::setAnyText(std::string_view key, Text text, std::size_t place) {
   if (place >= size() || entries_[place].first != key) place = placeOf(key);
   if (place == size()) return append(key, text);
-  PlistValue& value = entries_[place].second;
-  if (std::string* standing = value.string()) {
-    standing->assign(text);
-  } else {
-    value = text;
-  }
+  entries_[place].second.set(text);
   return place + 1;
 }
 
-std::size_t PlistDictionary::rewriteText(std::string_view key, std::string_view text, std::size_t place) {
+template <typename Text>
+std::size_t PlistDictionary::rewriteAnyText(std::string_view key, Text text, std::size_t place) {
   if (place < size() && entries_[place].first != key) truncate(place);
-  return setText(key, text, place);
+  return setAnyText(key, text, place);
+}
+
+std::size_t PlistDictionary::setText(std::string_view key, std::string_view text, std::size_t place) {
+  return setAnyText(key, text, place);
+}
+
+std::size_t PlistDictionary::setText(std::string_view key, DeferredText text, std::size_t place) {
+  return setAnyText(key, text, place);
+}
+
+std::size_t PlistDictionary::rewriteText(std::string_view key, std::string_view text, std::size_t place) {
+  return rewriteAnyText(key, text, place);
+}
+
+std::size_t PlistDictionary::rewriteText(std::string_view key, DeferredText text, std::size_t place) {
+  return rewriteAnyText(key, text, place);
 }
 
 void PlistDictionary::truncate(std::size_t place) {

@@ -41,15 +41,21 @@ class PlistDictionary {
   // Sets `key` to a string, written into the string that stands there where there is one. `place` is where
   // the caller expects the key; a right guess saves the search. Returns the place after the key's.
   std::size_t setText(std::string_view key, std::string_view text, std::size_t place);
+  std::size_t setText(std::string_view key, DeferredText text, std::size_t place);
   void setText(std::string_view key, std::string_view text) { setText(key, text, size()); }
   // Makes `key` the entry at `place`, at most size(): kept in place where it stands there, else it takes the
   // place of all entries from there on. For writing a whole dictionary anew, entry by entry, without emptying
   // it first.
   std::size_t rewriteText(std::string_view key, std::string_view text, std::size_t place);
+  std::size_t rewriteText(std::string_view key, DeferredText text, std::size_t place);
   // Drops the entries from `place` on.
   void truncate(std::size_t place);
 
  private:
+  template <typename Text>
+  std::size_t setAnyText(std::string_view key, Text text, std::size_t place);
+  template <typename Text>
+  std::size_t rewriteAnyText(std::string_view key, Text text, std::size_t place);
   std::size_t placeOf(std::string_view key) const;
   std::size_t append(std::string_view key, PlistValue value);
   void rebuildIndex();

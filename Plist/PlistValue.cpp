@@ -48,6 +48,8 @@ PlistValue PlistValue::shallowCopy() const {
 }
 
 bool PlistValue::operator==(const PlistValue& other) const {
+  makeText();
+  other.makeText();
   if (value_.index() != other.value_.index()) return false;
   if (const Bytes* bytes = data()) return *bytes == *other.data();
   if (const PlistArray* elements = array()) return std::ranges::equal(*elements, *other.array());

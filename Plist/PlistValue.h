@@ -24,6 +24,15 @@ struct PlistDate {
   bool operator==(const PlistDate&) const = default;
 };
 
+// A text that is made when somebody looks: `make` gives it from `source`, which lasts as long as the process,
+// and a number.
+struct DeferredText {
+  std::string (*make)(const void* source, std::int64_t number) = nullptr;
+  const void* source = nullptr;
+  std::int64_t number = 0;
+  bool operator==(const DeferredText&) const = default;
+};
+
 class PlistValue {
  public:
   using Array = std::shared_ptr<PlistArray>;
@@ -34,6 +43,7 @@ class PlistValue {
   PlistValue(std::string text) : value_(std::move(text)) {}
   PlistValue(std::string_view text) : value_(std::string(text)) {}
   PlistValue(const char* text) : value_(std::string(text)) {}
+  PlistValue(DeferredText text) : value_(text) {}
   PlistValue(bool flag) : value_(flag) {}
   template <std::integral Integer>
   requires(!std::same_as<Integer, bool>) PlistValue(Integer number)
@@ -48,9 +58,16 @@ class PlistValue {
   bool isAbsent() const { return std::holds_alternative<std::monostate>(value_); }
   explicit operator bool() const { return !isAbsent(); }
 
-  // Each returns null when the value is of another kind.
-  const std::string* string() const { return std::get_if<std::string>(&value_); }
-  std::string* string() { return std::get_if<std::string>(&value_); }
+  // Each returns null when the value is of another kind. A deferred text is a string, made at the first look;
+  // so a value is for one thread, also for those who only look.
+  const std::string* string() const {
+    makeText();
+    return std::get_if<std::string>(&value_);
+  }
+  std::string* string() {
+    makeText();
+    return std::get_if<std::string>(&value_);
+  }
   const std::int64_t* integer() const { return std::get_if<std::int64_t>(&value_); }
   const double* real() const { return std::get_if<double>(&value_); }
   const bool* boolean() const { return std::get_if<bool>(&value_); }
@@ -67,11 +84,35 @@ class PlistValue {
   // never changes.
   PlistValue shallowCopy() const;
 
+  // Becomes this text. One that nobody looked at is replaced at no cost.
+  void set(DeferredText text) {
+    if (auto* standing = std::get_if<DeferredText>(&value_)) {
+      *standing = text;
+    } else {
+      value_ = text;
+    }
+  }
+  // Becomes this text, in the room of the string that stands there, if any.
+  void set(std::string_view text) {
+    if (auto* standing = std::get_if<std::string>(&value_)) {
+      standing->assign(text);
+    } else {
+      value_ = std::string(text);
+    }
+  }
+
   // Equal kind and content, dictionaries whatever the order of their keys.
   bool operator==(const PlistValue& other) const;
 
  private:
-  std::variant<std::monostate, std::string, std::int64_t, double, bool, PlistDate, Data, Dictionary, Array>
+  void makeText() const {
+    if (const auto* text = std::get_if<DeferredText>(&value_))
+      value_ = text->make(text->source, text->number);
+  }
+
+  // Mutable for the text that the first look makes.
+  mutable std::variant<std::monostate, std::string, std::int64_t, double, bool, PlistDate, Data, Dictionary,
+                       Array, DeferredText>
       value_;
 };
 
