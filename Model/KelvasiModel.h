@@ -21,6 +21,7 @@ class KelvasiModel {
   // Called from the main queue after each tick that saw new data.
   using ViewControllerUpdate = std::function<void()>;
   using MessageHandler = std::function<void(std::span<const std::uint8_t> message)>;
+  using StartCommandChange = std::function<PlistValue(PlistValue command)>;
 
   KelvasiModel(const Platform& platform, const LinkPlatform& link,
                ViewControllerUpdate updateViewControllerFromModel);
@@ -40,6 +41,8 @@ class KelvasiModel {
   void updateWithData(std::span<const std::uint8_t> data) noexcept;
   // From now on hands every log message that arrives to `handler`, as it came, instead of to the generator.
   void divertMessages(MessageHandler handler) { messageHandler_ = std::move(handler); }
+  // From now on a session begins with what `change` makes of the generator's start command.
+  void changeStartCommand(StartCommandChange change) { startCommandChange_ = std::move(change); }
   // The display tick, every 2.0 s while the monitor runs.
   void refresh();
   // The same in the form of a timer's action.
@@ -69,6 +72,7 @@ class KelvasiModel {
   LinkPlatform link_;
   ViewControllerUpdate updateViewControllerFromModel_;
   MessageHandler messageHandler_;  // empty: messages go to the generator
+  StartCommandChange startCommandChange_;
 
   std::unique_ptr<LocalPort> recvPort_;
   std::unique_ptr<RemotePort> sendPort_;

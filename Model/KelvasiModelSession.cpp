@@ -147,7 +147,9 @@ std::optional<Bytes> KelvasiModel::askForTechnology() {
 }
 
 bool KelvasiModel::sendStartCommand() {
-  const auto command = platform_.plists.serialiseXml(logGenerator_->getStartCommand());
+  PlistValue wish = logGenerator_->getStartCommand();
+  if (startCommandChange_) wish = startCommandChange_(std::move(wish));
+  const auto command = platform_.plists.serialiseXml(wish);
   if (!command) {
     platform_.log.print(LogPriority::error, " Could not generate PLIST");
     return false;

@@ -74,6 +74,41 @@ class Record(LiveTest):
         # The daemon sends what is subscribed to, and the SIM files are once they are decoded.
         self.assertEqual(self.recorded()[-1], MM_IDLE)
 
+    UNKNOWN = [record(0x7199, b"unknown"), record(0xB193, b"unknown too"), record(0x0007, b"[]", log_type=0xFF)]
+
+    def record_unknown(self, *options):
+        daemon = self.start_daemon("--replay", self.write("world.pcap", pcap(*self.UNKNOWN, MM_IDLE)), "--leave")
+        recorder = self.start_record(*options)
+        self.assertEqual(daemon.wait(PATIENCE), 0)
+        self.assertEqual(self.end(recorder)[0], 0)
+        return self.recorded()
+
+    def test_what_the_display_does_not_show_is_not_asked_for(self):
+        self.assertEqual(self.record_unknown(), [MM_IDLE])
+
+    def test_more_is_recorded_on_request(self):
+        self.assertEqual(self.record_unknown("--code", "0x7199"), [self.UNKNOWN[0], MM_IDLE])
+        self.assertEqual(self.record_unknown("--code", "0x7199", "--code", "45459", "--code", "0xFF0007"),
+                         [*self.UNKNOWN, MM_IDLE])
+        self.assertEqual(self.record_unknown("--all-codes", "0xB000-0xB1FF"), [self.UNKNOWN[1], MM_IDLE])
+
+    def test_all_codes_that_there_are(self):
+        self.assertEqual(self.record_unknown("--all-codes", "0-0xFFFF", "--all-codes", "0xFF0000-0xFFFFFF"),
+                         [*self.UNKNOWN, MM_IDLE])
+
+    def test_a_code_that_is_none_is_said(self):
+        for option, value, words in (
+                ("--code", "0x10000", '"0x10000" is no log code'),
+                ("--code", "many", '"many" is no log code'),
+                ("--all-codes", "7", '"7" is no range of log codes such as 0xB000-0xB1FF'),
+                ("--all-codes", "9-7", '"9-7" is no range'),
+                ("--all-codes", "0xFFFF-0xFF0001", '"0xFFFF-0xFF0001" is no range')):
+            with self.subTest(value):
+                recorder = self.start_record(option, value)
+                _, error = recorder.communicate(timeout=PATIENCE)
+                self.assertEqual(recorder.returncode, 2)
+                self.assertIn(words, error.decode())
+
     def test_the_file_is_a_capture_from_the_start(self):
         recorder = self.start_record("--seconds", "0.2")
         _, error = recorder.communicate(timeout=PATIENCE)

@@ -2,8 +2,10 @@
 #include <CLI/CLI.hpp>
 
 #include "Capture/PcapWriter.h"
+#include "Model/MoreLogCodes.h"
 #include "Platform/Clock.h"
 #include "Tools/Kelvasictl/LiveSession.h"
+#include "Tools/Kelvasictl/LogCodeOptions.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
 #include "Tools/Kelvasictl/Verb.h"
@@ -14,6 +16,7 @@ namespace {
 
 struct RecordOptions {
   std::string file;
+  LogCodeOptions logCodes;
   LiveOptions live;
 };
 
@@ -27,6 +30,9 @@ class RecordVerb {
   explicit RecordVerb(const RecordOptions& options)
       : options_(options), writer_(options.file), session_(options.live, [] {}) {
     if (writer_.error()) throw ToolError(*writer_.error());
+    session_.model().changeStartCommand([codes = options.logCodes.all()](PlistValue command) {
+      return withLogCodes(std::move(command), codes);
+    });
     session_.model().divertMessages([this](std::span<const std::uint8_t> message) { take(message); });
   }
 
@@ -73,6 +79,7 @@ Action declareRecord(CLI::App& verb) {
   const auto options = std::make_shared<RecordOptions>();
   verb.add_option("FILE", options->file, "the pcap file, created or overwritten; - is the standard output")
       ->required();
+  options->logCodes.addTo(verb);
   options->live.addTo(verb);
   return [options] { return RecordVerb(*options).run(); };
 }
