@@ -10,7 +10,7 @@ import re
 import sys
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent
-HOUSE = ["Plist", "Platform", "Radio", "Telvon", "Dlf", "LogGenerator", "Model", "App", "Capture", "Simulator", "Tools"]
+HOUSE = ["Plist", "Platform", "Radio", "Telvon", "Dlf", "LogGenerator", "Model", "Survey", "App", "Capture", "Simulator", "Tools"]
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
 STANDARD = re.compile(r"^[a-z_]+$")  # <vector>, <cstdint>; neither <syslog.h> nor <QTimer>
 
