@@ -130,6 +130,12 @@ class Configured(unittest.TestCase):
                                   text=True, check=False)
         self.assertEqual((compiled.returncode, compiled.stderr), (0, ""))
 
+    def test_a_package_that_is_missing_is_named(self):
+        with tempfile.TemporaryDirectory() as build, self.assertRaises(subprocess.CalledProcessError) as caught:
+            cmake("-S", SOURCES, "-B", build, "-DKELVASI_PROVIDERS=/missing/providers.xml")
+        said = " ".join(caught.exception.stderr.split())
+        self.assertIn("/missing/providers.xml is missing. Install Debian's package mobile-broadband-provider-info", said)
+
 
 if __name__ == "__main__":
     unittest.main()
