@@ -96,7 +96,7 @@ def literal(text):
 
 def table(name, kind, rows):
     lines = ",\n".join(f"    {kind}{{{', '.join(row)}}}" for row in rows)
-    return f"constexpr std::array {name}{{\n{lines},\n}};\n\n"
+    return f"constexpr std::array<{kind}, {len(rows)}> {name}{{{{\n{lines},\n}}}};\n\n"
 
 
 def main():
