@@ -1,20 +1,25 @@
 #include "Capture/PcapWriter.h"
 
 #include <pcap/pcap.h>
-#include <stdio_ext.h>
-#include <unistd.h>
 
 #include <algorithm>
-#include <cerrno>
-#include <cstdio>
-#include <system_error>
+#include <new>
 
 namespace kelvasi {
 
 namespace {
 
-constexpr std::int64_t fileHeaderSize = 24;
-constexpr std::int64_t packetHeaderSize = 16;
+ssize_t appendCookie(void* cookie, const char* block, std::size_t size) {
+  Bytes& bytes = *static_cast<Bytes*>(cookie);
+  bytes.insert(bytes.end(), block, block + size);
+  return static_cast<ssize_t>(size);
+}
+
+// The library formats into a stream. This one cannot fail, so what reaches the disk is ours to watch.
+std::FILE* streamInto(Bytes& bytes) {
+  return ::fopencookie(&bytes, "w",
+                       {.read = nullptr, .write = appendCookie, .seek = nullptr, .close = nullptr});
+}
 
 pcap_pkthdr headerFor(std::size_t size, std::chrono::nanoseconds arrival) {
   using namespace std::chrono;
@@ -33,42 +38,32 @@ void PcapWriter::Close::operator()(pcap* format) const {
   pcap_close(format);
 }
 
-void PcapWriter::Close::operator()(pcap_dumper* file) const {
-  pcap_dump_close(file);
+void PcapWriter::Close::operator()(pcap_dumper* packets) const {
+  pcap_dump_close(packets);
 }
 
-PcapWriter::PcapWriter(const std::string& path)
-    : name_(path == "-" ? "standard output" : path), format_(pcap_open_dead(DLT_USER0, largestPacket)) {
-  std::FILE* stream = path == "-" ? stdout : std::fopen(path.c_str(), "wbe");
-  if (stream && format_) file_.reset(pcap_dump_fopen(format_.get(), stream));
-  if (!file_ || pcap_dump_flush(file_.get()) != 0) {
-    fail();
-  } else {
-    wholeSize_ = fileHeaderSize;
-  }
+PcapWriter::PcapWriter(const std::string& path, OutputFile::Existing existing)
+    : file_(path, existing), format_(pcap_open_dead(DLT_USER0, largestPacket)) {
+  std::FILE* stream = streamInto(formatted_);
+  if (!format_ || !stream) throw std::bad_alloc();
+  packets_.reset(pcap_dump_fopen(format_.get(), stream));  // which closes the stream when it fails
+  if (!packets_) throw std::bad_alloc();
+  if (appendFormatted() && !file_.hasOlder()) file_.publish();
 }
-
-PcapWriter::~PcapWriter() = default;
 
 bool PcapWriter::write(std::span<const std::uint8_t> message, std::chrono::nanoseconds arrival) {
-  if (error_) return false;
+  if (file_.error()) return false;
   const pcap_pkthdr header = headerFor(message.size(), arrival);
   // The library's callback signature wants it so.
-  pcap_dump(reinterpret_cast<u_char*>(file_.get()), &header, message.data());
-  if (pcap_dump_flush(file_.get()) != 0) return fail();
-  wholeSize_ += packetHeaderSize + std::int64_t{header.caplen};
-  return true;
+  pcap_dump(reinterpret_cast<u_char*>(packets_.get()), &header, message.data());
+  return appendFormatted() && file_.publish();
 }
 
-bool PcapWriter::fail() {
-  error_ = name_ + ": " + std::generic_category().message(errno);
-  if (file_) {
-    std::FILE* stream = pcap_dump_file(file_.get());
-    ::__fpurge(stream);
-    // Best effort: a pipe cannot be cut.
-    if (::ftruncate(::fileno(stream), wholeSize_) != 0) return false;
-  }
-  return false;
+bool PcapWriter::appendFormatted() {
+  pcap_dump_flush(packets_.get());
+  const bool isAppended = file_.append(formatted_);
+  formatted_.clear();
+  return isAppended;
 }
 
 }  // namespace kelvasi

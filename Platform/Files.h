@@ -12,8 +12,8 @@ class Files {
   virtual ~Files() = default;
 
   virtual bool exists(const std::string& path) const = 0;
-  // Writes a whole file straight to its path, replacing what is there. False when that fails; a regular
-  // file that could not be written to its end is then removed.
+  // Writes a whole file straight to its path, replacing what is there. False when that fails; the path then
+  // has what it had before.
   virtual bool write(const std::string& path, std::span<const std::uint8_t> bytes) = 0;
 };
 

@@ -21,7 +21,7 @@ std::string pathFor(const Technology& technology, std::size_t count) {
 
 std::string writeMixedCapture(const Technology& technology, std::size_t count) {
   const std::string path = pathFor(technology, count);
-  PcapWriter writer(path);
+  PcapWriter writer(path, OutputFile::Existing::isReplaced);
   std::chrono::nanoseconds arrival = 1709647629s;
   for (const Bytes& message : mixtureOf(technology, count)) {
     if (!writer.write(message, arrival)) throw std::runtime_error(writer.error().value_or(path));

@@ -1,5 +1,6 @@
 #include "Platform/Posix/FileDescriptor.h"
 
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -14,13 +15,41 @@ bool FileDescriptor::close() {
   return number < 0 || ::close(number) == 0 || errno == EINTR;
 }
 
-bool writeAll(int descriptor, std::span<const std::uint8_t> bytes) {
-  while (!bytes.empty()) {
-    const ssize_t count = ::write(descriptor, bytes.data(), bytes.size());
-    if (count > 0) bytes = bytes.subspan(static_cast<std::size_t>(count));
-    if (count < 0 && errno != EINTR) return false;
+namespace {
+
+// How many bytes went through; fewer than all, with errno set, on failure.
+std::size_t writeWhatGoes(int descriptor, std::span<const std::uint8_t> bytes) {
+  std::size_t written = 0;
+  while (written < bytes.size()) {
+    const ssize_t count = ::write(descriptor, bytes.data() + written, bytes.size() - written);
+    if (count > 0) written += static_cast<std::size_t>(count);
+    if (count < 0 && errno != EINTR) break;
   }
-  return true;
+  return written;
+}
+
+// Best effort: a pipe cannot be cut.
+void takeBack(int descriptor, std::size_t count) {
+  struct stat status {};
+  const off_t end = ::lseek(descriptor, 0, SEEK_CUR);
+  if (::fstat(descriptor, &status) != 0 || !S_ISREG(status.st_mode) || status.st_size != end) return;
+  const off_t before = end - static_cast<off_t>(count);
+  if (::ftruncate(descriptor, before) == 0) ::lseek(descriptor, before, SEEK_SET);
+}
+
+}  // namespace
+
+bool writeAll(int descriptor, std::span<const std::uint8_t> bytes) {
+  return writeWhatGoes(descriptor, bytes) == bytes.size();
+}
+
+bool writeWhole(int descriptor, std::span<const std::uint8_t> bytes) {
+  const std::size_t written = writeWhatGoes(descriptor, bytes);
+  if (written == bytes.size()) return true;
+  const int reason = errno;
+  if (written > 0) takeBack(descriptor, written);
+  errno = reason;
+  return false;
 }
 
 }  // namespace kelvasi

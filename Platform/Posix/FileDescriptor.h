@@ -25,4 +25,7 @@ class FileDescriptor {
 // Goes on after signals and short writes until all is written. False, with errno set, on failure.
 bool writeAll(int descriptor, std::span<const std::uint8_t> bytes);
 
+// The same, and where it fails on a disk the file ends where it ended before.
+bool writeWhole(int descriptor, std::span<const std::uint8_t> bytes);
+
 }  // namespace kelvasi

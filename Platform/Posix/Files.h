@@ -23,14 +23,16 @@ struct FileContents {
 // Reads to the end of the file, which may be a pipe. A file of more than `limit` bytes is an error.
 FileContents readFile(const std::string& path, std::size_t limit = std::numeric_limits<std::size_t>::max());
 
-// Creates the file or overwrites what is there, straight at its path. After an error while writing a regular
-// file is removed.
+// What is written is its owner's alone (0600), whatever the umask and whatever it replaces. Symbolic links
+// are followed. What exists and is no regular file, such as a pipe or a device, is written into and stays as
+// it is.
+
+// Creates the file straight at its path, or replaces what is there as replaceFile() does. After an error the
+// name has what it had before.
 FileError writeFile(const std::string& path, std::span<const std::uint8_t> bytes);
 
-// Puts a file in the place of the one of that name, if any, whose permissions it takes over. The name always
-// has a whole file, the old or the new, even if the machine stops; after an error it is the old. Symbolic
-// links are followed. What exists and is no regular file, such as a pipe or a device, is written into and
-// stays.
+// Puts a file in the place of the one of that name, if any. The name always has a whole file, the old or the
+// new, even if the machine stops; after an error it is the old.
 FileError replaceFile(const std::string& path, std::span<const std::uint8_t> bytes);
 
 }  // namespace kelvasi

@@ -1,7 +1,9 @@
 """kelvasictl record beside a simulated daemon, both as processes."""
 
 import os
+import resource
 import signal
+import stat
 import time
 import unittest
 
@@ -20,8 +22,8 @@ class Record(LiveTest):
         world = self.write("world.pcap", pcap(*messages))
         return self.start_daemon("--replay", world, "--speed", speed, "--leave")
 
-    def start_record(self, *arguments):
-        return self.start_live("record", self.path("a.pcap"), *arguments)
+    def start_record(self, *arguments, **options):
+        return self.start_live("record", self.path("a.pcap"), *arguments, **options)
 
     def file_reaches(self, size):
         return os.path.exists(self.path("a.pcap")) and os.path.getsize(self.path("a.pcap")) >= size
@@ -30,7 +32,7 @@ class Record(LiveTest):
         for number in (signal.SIGINT, signal.SIGTERM):
             with self.subTest(number):
                 daemon = self.replay(*MANY)
-                recorder = self.start_record()
+                recorder = self.start_record("--force")
                 self.assertEqual(daemon.wait(PATIENCE), 0)
                 status, out, error = self.end(recorder, number)
                 self.assertEqual((status, out), (0, b""))
@@ -55,6 +57,64 @@ class Record(LiveTest):
         messages = self.recorded()
         self.assertGreater(len(messages), 2000)
         self.assertEqual(messages[:5000], MANY[:len(messages)])
+
+    def limited_to(self, size):
+        """A recorder whose files may not grow past `size`."""
+        def limit():
+            signal.signal(signal.SIGXFSZ, signal.SIG_IGN)
+            resource.setrlimit(resource.RLIMIT_FSIZE, (size, resource.RLIM_INFINITY))
+        return self.start_live("record", self.path("a.pcap"), "--force", preexec_fn=limit)
+
+    def test_a_file_that_may_not_grow_ends_with_its_last_whole_message(self):
+        messages = [record(0x7131, bytes([number]) * size) for number, size in ((1, 4200), (2, 40), (3, 5000))]
+        ends = [24]
+        for message in messages:
+            ends.append(ends[-1] + 16 + len(message))
+        for size in sorted({end + change for end in ends[1:] for change in (-4096, -1, 0, 1, 100)} - {ends[-1] + 1}):
+            with self.subTest(size):
+                if os.path.exists(self.path("a.pcap")):
+                    os.remove(self.path("a.pcap"))
+                whole = messages[:sum(end <= size for end in ends[1:])]
+                daemon = self.replay(*messages)
+                recorder = self.limited_to(size)
+                if len(whole) == len(messages):
+                    self.assertEqual(daemon.wait(PATIENCE), 0)
+                    recorder.send_signal(signal.SIGINT)
+                error = recorder.communicate(timeout=PATIENCE)[1].decode().splitlines()
+                said = [f"kelvasictl: {len(whole)} messages recorded in {self.path('a.pcap')}"]
+                if len(whole) < len(messages):
+                    said.append(f"kelvasictl: {self.path('a.pcap')}: File too large")
+                self.assertEqual(error, said)
+                self.assertEqual(recorder.returncode, len(said) - 1)
+                self.assertEqual(self.recorded(), whole)
+                self.stop(daemon)
+
+    def test_an_older_file_stays_unless_it_is_forced(self):
+        older = self.write("a.pcap", b"older")
+        self.assert_fault(self.run_program("record", older), "a.pcap exists; --force replaces it")
+        self.assertEqual(self.read("a.pcap"), b"older")
+
+    def test_an_older_file_stays_until_the_first_message(self):
+        self.write("a.pcap", b"older")
+        recorder = self.start_record("--force", "--seconds", "0.2")
+        error = recorder.communicate(timeout=PATIENCE)[1].decode()
+        self.assertIn(f"0 messages recorded in {self.path('a.pcap')}, which stays as it was\n", error)
+        self.assertEqual((recorder.returncode, self.read("a.pcap")), (1, b"older"))
+        self.assertEqual(sorted(os.listdir(self.directory.name)), ["a.pcap", "run"])
+
+        daemon = self.replay(MM_IDLE)
+        recorder = self.start_record("--force")
+        self.assertEqual(daemon.wait(PATIENCE), 0)
+        self.assertEqual(self.end(recorder)[0], 0)
+        self.assertEqual(self.recorded(), [MM_IDLE])
+
+    def test_the_file_is_its_owners_alone_whatever_the_umask(self):
+        for mask in (0o000, 0o077, 0o777):
+            with self.subTest(mask):
+                recorder = self.start_record("--force", "--seconds", "0", preexec_fn=lambda: os.umask(mask))
+                recorder.communicate(timeout=PATIENCE)
+                self.assertEqual(stat.S_IMODE(os.stat(self.path("a.pcap")).st_mode), 0o600)
+                os.remove(self.path("a.pcap"))
 
     def test_it_goes_on_with_the_next_daemon(self):
         first = self.replay(*MANY[:10])
@@ -200,7 +260,7 @@ class RecordFromTheWire(LiveTest):
     def test_all_of_it_is_in_the_file_after_a_signal(self):
         for number in (signal.SIGINT, signal.SIGTERM):
             with self.subTest(number):
-                recorder, messages = self.start_record()
+                recorder, messages = self.start_record("--force")
                 sent = self.stop_and_fill(recorder, messages)
                 recorder.send_signal(number)
                 recorder.send_signal(signal.SIGCONT)

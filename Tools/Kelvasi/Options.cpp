@@ -6,6 +6,7 @@
 #include <stdexcept>
 
 #include "Platform/Posix/PackageResources.h"
+#include "Platform/Posix/PrivateFiles.h"
 
 namespace kelvasi {
 
@@ -70,8 +71,7 @@ std::string makeLogDirectory() {
         "nowhere to save snapshots: none of KELVASI_LOG_DIRECTORY, XDG_STATE_HOME and HOME is set");
   const std::filesystem::path directory = state.empty() ? std::filesystem::path(home) / ".local/state/kelvasi"
                                                         : std::filesystem::path(state) / "kelvasi";
-  std::error_code fault;  // told when a snapshot is saved
-  std::filesystem::create_directories(directory, fault);
+  makeFolders(directory);  // a failure is told when a snapshot is saved
   return directory;
 }
 

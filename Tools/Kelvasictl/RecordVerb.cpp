@@ -1,5 +1,7 @@
 // kelvasictl record: a live link to a capture.
 #include <CLI/CLI.hpp>
+#include <filesystem>
+#include <system_error>
 
 #include "Capture/PcapWriter.h"
 #include "Model/MoreLogCodes.h"
@@ -17,6 +19,7 @@ namespace {
 struct RecordOptions {
   std::string file;
   LogCodeOptions logCodes;
+  bool force = false;
   LiveOptions live;
 };
 
@@ -24,11 +27,22 @@ std::chrono::nanoseconds sinceEpoch(PlistDate date) {
   return std::chrono::round<std::chrono::microseconds>(std::chrono::duration<double>(date.secondsSince1970));
 }
 
+const std::string& notThere(const RecordOptions& options) {
+  std::error_code error;
+  if (!options.force && std::filesystem::is_regular_file(options.file, error))
+    throw ToolError(options.file + " exists; --force replaces it");
+  return options.file;
+}
+
+OutputFile::Existing existing(const RecordOptions& options) {
+  return options.force ? OutputFile::Existing::isReplaced : OutputFile::Existing::stays;
+}
+
 // Messages are written as they come and are not decoded, so one that a decoder dies of is kept too.
 class RecordVerb {
  public:
   explicit RecordVerb(const RecordOptions& options)
-      : options_(options), writer_(options.file), session_(options.live, [] {}) {
+      : options_(options), writer_(notThere(options), existing(options)), session_(options.live, [] {}) {
     if (writer_.error()) throw ToolError(*writer_.error());
     session_.model().changeStartCommand([codes = options.logCodes.all()](PlistValue command) {
       return withLogCodes(std::move(command), codes);
@@ -40,9 +54,11 @@ class RecordVerb {
     try {
       session_.run();
     } catch (const ToolError&) {
+      writer_.close();
       tellCount();
       throw;
     }
+    if (!writer_.close()) throw ToolError(*writer_.error());
     tellCount();
     return exitSuccess;
   }
@@ -63,7 +79,8 @@ class RecordVerb {
 
   void tellCount() const {
     const std::string cut = cutCount_ == 0 ? "" : ", " + std::to_string(cutCount_) + " of them cut";
-    complain(std::to_string(count_) + " messages recorded in " + options_.file + cut);
+    const std::string untouched = writer_.hasOlder() ? ", which stays as it was" : "";
+    complain(std::to_string(count_) + " messages recorded in " + options_.file + cut + untouched);
   }
 
   const RecordOptions& options_;
@@ -77,9 +94,10 @@ class RecordVerb {
 
 Action declareRecord(CLI::App& verb) {
   const auto options = std::make_shared<RecordOptions>();
-  verb.add_option("FILE", options->file, "the pcap file, created or overwritten; - is the standard output")
+  verb.add_option("FILE", options->file, "the pcap file, which is created; - is the standard output")
       ->required();
   options->logCodes.addTo(verb);
+  verb.add_flag("--force", options->force, "replace a file that is there, once the first message has come");
   options->live.addTo(verb);
   return [options] { return RecordVerb(*options).run(); };
 }

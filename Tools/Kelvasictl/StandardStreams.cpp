@@ -32,6 +32,7 @@ void secureStandardStreams() {
     if (::fcntl(stream, F_GETFD) < 0 && ::open("/dev/null", mode) != stream) std::abort();
   }
   std::signal(SIGPIPE, SIG_IGN);
+  std::signal(SIGXFSZ, SIG_IGN);
 }
 
 void printOut(std::string_view text) {

@@ -4,7 +4,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <pthread.h>
-#include <sys/resource.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -20,8 +19,10 @@ namespace kelvasi {
 namespace {
 
 using ::testing::ElementsAre;
+using testing::FileSizeLimit;
 using ::testing::IsEmpty;
 using testing::TemporaryDirectory;
+using testing::Umask;
 using ::testing::UnorderedElementsAre;
 
 Bytes manyBytes(std::size_t count) {
@@ -37,24 +38,6 @@ std::vector<std::string> namesIn(const TemporaryDirectory& directory) {
   }
   return names;
 }
-
-// Files of this process end at `bytes`; a write beyond is cut short, the next one fails.
-class FileSizeLimit {
- public:
-  explicit FileSizeLimit(rlim_t bytes) : signal_(std::signal(SIGXFSZ, SIG_IGN)) {
-    ::getrlimit(RLIMIT_FSIZE, &before_);
-    const rlimit limit{bytes, before_.rlim_max};
-    ::setrlimit(RLIMIT_FSIZE, &limit);
-  }
-  ~FileSizeLimit() {
-    ::setrlimit(RLIMIT_FSIZE, &before_);
-    std::signal(SIGXFSZ, signal_);
-  }
-
- private:
-  rlimit before_{};
-  void (*signal_)(int);
-};
 
 class FilesTest : public ::testing::Test {
  protected:
@@ -95,11 +78,12 @@ TEST_F(FilesTest, AWriteCutShortIsAnErrorAndLeavesNothing) {
   EXPECT_THAT(namesIn(directory), IsEmpty());
 }
 
-TEST_F(FilesTest, AWriteOverAFileThatIsCutShortLeavesNeither) {
+TEST_F(FilesTest, AWriteOverAFileThatIsCutShortLeavesTheOldFile) {
   writeFile(path, manyBytes(10));
   const FileSizeLimit limit(1000);
   EXPECT_EQ(writeFile(path, manyBytes(2000)), path + ": File too large");
-  EXPECT_THAT(namesIn(directory), IsEmpty());
+  EXPECT_EQ(readFile(path).bytes, manyBytes(10));
+  EXPECT_THAT(namesIn(directory), ElementsAre("file"));
 }
 
 TEST_F(FilesTest, WhatIsNoRegularFileStaysAfterAnError) {
@@ -145,18 +129,26 @@ TEST_F(FilesTest, AReplacementThatFailsLeavesTheOldFileAndNothingElse) {
   EXPECT_THAT(namesIn(directory), ElementsAre("file"));
 }
 
-TEST_F(FilesTest, AReplacementKeepsThePermissions) {
-  writeFile(path, {});
-  std::filesystem::permissions(path, std::filesystem::perms(0640));
-  EXPECT_EQ(replaceFile(path, Bytes{1}), std::nullopt);
-  EXPECT_EQ(std::filesystem::status(path).permissions(), std::filesystem::perms(0640));
+TEST_F(FilesTest, FilesAreTheirOwnersAloneWhateverTheUmask) {
+  for (const mode_t mask : {0000, 0022, 0277, 0777}) {
+    const Umask umask(mask);
+    for (const std::string& name : {directory.file("new"), path, path}) {
+      EXPECT_EQ(replaceFile(name, Bytes{1}), std::nullopt);
+      EXPECT_EQ(writeFile(name + "-written", Bytes{1}), std::nullopt);
+      for (const std::string& file : {name, name + "-written"})
+        EXPECT_EQ(std::filesystem::status(file).permissions(), std::filesystem::perms(0600)) << mask;
+    }
+    for (const std::string& name : namesIn(directory)) std::filesystem::remove(directory.file(name));
+  }
 }
 
-TEST_F(FilesTest, ANewFileHasThePermissionsTheUserGivesNewFiles) {
-  const mode_t before = ::umask(027);
-  EXPECT_EQ(replaceFile(path, Bytes{1}), std::nullopt);
-  ::umask(before);
-  EXPECT_EQ(std::filesystem::status(path).permissions(), std::filesystem::perms(0640));
+TEST_F(FilesTest, AReplacementIsItsOwnersAloneWhateverItReplaces) {
+  for (const auto replace : {replaceFile, writeFile}) {
+    writeFile(path, {});
+    std::filesystem::permissions(path, std::filesystem::perms(0644));
+    EXPECT_EQ(replace(path, Bytes{1}), std::nullopt);
+    EXPECT_EQ(std::filesystem::status(path).permissions(), std::filesystem::perms(0600));
+  }
 }
 
 TEST_F(FilesTest, AFileLeftOverUnderTheTemporaryNameIsNotTouched) {

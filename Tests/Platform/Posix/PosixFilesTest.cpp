@@ -33,6 +33,14 @@ TEST_F(PosixFilesTest, WritingReplacesALongerFile) {
   EXPECT_EQ(readFile(path).bytes, Bytes{9});
 }
 
+// Two snapshots that are saved within a second share a name.
+TEST_F(PosixFilesTest, AFailureLeavesTheFileThatWasThere) {
+  files.write(path, Bytes{1, 2, 3});
+  const testing::FileSizeLimit limit(4);
+  EXPECT_FALSE(files.write(path, Bytes{4, 5, 6, 7, 8}));
+  EXPECT_EQ(readFile(path).bytes, (Bytes{1, 2, 3}));
+}
+
 TEST_F(PosixFilesTest, AMissingDirectoryIsAFailureAndIsNotMade) {
   EXPECT_FALSE(files.write(directory.file("none/file"), Bytes{1}));
   EXPECT_FALSE(files.exists(directory.file("none")));

@@ -1,9 +1,12 @@
 // Pieces of the process's surroundings that a test changes and gives back.
 #pragma once
 
+#include <sys/resource.h>
 #include <sys/socket.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
+#include <csignal>
 #include <cstdlib>
 #include <filesystem>
 #include <optional>
@@ -47,6 +50,37 @@ class TemporaryDirectory {
 
  private:
   std::filesystem::path path_;
+};
+
+// Files of this process end at `bytes`; a write beyond is cut short, the next one fails.
+class FileSizeLimit {
+ public:
+  explicit FileSizeLimit(rlim_t bytes) : signal_(std::signal(SIGXFSZ, SIG_IGN)) {
+    ::getrlimit(RLIMIT_FSIZE, &before_);
+    const rlimit limit{bytes, before_.rlim_max};
+    ::setrlimit(RLIMIT_FSIZE, &limit);
+  }
+  ~FileSizeLimit() {
+    ::setrlimit(RLIMIT_FSIZE, &before_);
+    std::signal(SIGXFSZ, signal_);
+  }
+  FileSizeLimit(const FileSizeLimit&) = delete;
+  FileSizeLimit& operator=(const FileSizeLimit&) = delete;
+
+ private:
+  rlimit before_{};
+  void (*signal_)(int);
+};
+
+class Umask {
+ public:
+  explicit Umask(mode_t mask) : before_(::umask(mask)) {}
+  ~Umask() { ::umask(before_); }
+  Umask(const Umask&) = delete;
+  Umask& operator=(const Umask&) = delete;
+
+ private:
+  mode_t before_;
 };
 
 // Stands in for a standard stream and keeps its writes apart.
