@@ -91,7 +91,7 @@ class Record(LiveTest):
 
     def test_an_older_file_stays_unless_it_is_forced(self):
         older = self.write("a.pcap", b"older")
-        self.assert_fault(self.run_program("record", older), "a.pcap exists; --force replaces it")
+        self.assert_fault(self.run_program("record", older), "a.pcap: there is such a file already; --force overwrites it")
         self.assertEqual(self.read("a.pcap"), b"older")
 
     def test_an_older_file_stays_until_the_first_message(self):

@@ -6,6 +6,7 @@ import os
 import plistlib
 import re
 import resource
+import stat
 import struct
 import time
 import unittest
@@ -204,7 +205,10 @@ class Saving(ViewerTest):
         del self.environment["KELVASI_LOG_DIRECTORY"]
         self.environment["XDG_STATE_HOME"] = self.path("state")
         self.save(self.replay(MM_IDLE))
-        self.assertEqual(len(os.listdir(os.path.join(self.path("state"), "kelvasi"))), 1)
+        directory = os.path.join(self.path("state"), "kelvasi")
+        (name,) = os.listdir(directory)
+        modes = [stat.S_IMODE(os.stat(path).st_mode) for path in (directory, os.path.join(directory, name))]
+        self.assertEqual(modes, [0o700, 0o600])
 
 
 if __name__ == "__main__":

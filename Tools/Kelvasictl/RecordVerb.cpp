@@ -1,7 +1,5 @@
 // kelvasictl record: a live link to a capture.
 #include <CLI/CLI.hpp>
-#include <filesystem>
-#include <system_error>
 
 #include "Capture/PcapWriter.h"
 #include "Model/MoreLogCodes.h"
@@ -11,6 +9,7 @@
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
 #include "Tools/Kelvasictl/Verb.h"
+#include "Tools/OlderFile.h"
 
 namespace kelvasi {
 
@@ -27,22 +26,19 @@ std::chrono::nanoseconds sinceEpoch(PlistDate date) {
   return std::chrono::round<std::chrono::microseconds>(std::chrono::duration<double>(date.secondsSince1970));
 }
 
-const std::string& notThere(const RecordOptions& options) {
-  std::error_code error;
-  if (!options.force && std::filesystem::is_regular_file(options.file, error))
-    throw ToolError(options.file + " exists; --force replaces it");
+const std::string& writable(const RecordOptions& options) {
+  if (const std::string refusal = refusalOf(options.file, options.force); !refusal.empty())
+    throw ToolError(refusal);
   return options.file;
-}
-
-OutputFile::Existing existing(const RecordOptions& options) {
-  return options.force ? OutputFile::Existing::isReplaced : OutputFile::Existing::stays;
 }
 
 // Messages are written as they come and are not decoded, so one that a decoder dies of is kept too.
 class RecordVerb {
  public:
   explicit RecordVerb(const RecordOptions& options)
-      : options_(options), writer_(notThere(options), existing(options)), session_(options.live, [] {}) {
+      : options_(options),
+        writer_(writable(options), existing(options.force)),
+        session_(options.live, [] {}) {
     if (writer_.error()) throw ToolError(*writer_.error());
     session_.model().changeStartCommand([codes = options.logCodes.all()](PlistValue command) {
       return withLogCodes(std::move(command), codes);
