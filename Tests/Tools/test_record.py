@@ -138,7 +138,7 @@ class Record(LiveTest):
 
     def record_unknown(self, *options):
         daemon = self.start_daemon("--replay", self.write("world.pcap", pcap(*self.UNKNOWN, MM_IDLE)), "--leave")
-        recorder = self.start_record(*options)
+        recorder = self.start_record("--force", *options)
         self.assertEqual(daemon.wait(PATIENCE), 0)
         self.assertEqual(self.end(recorder)[0], 0)
         return self.recorded()
