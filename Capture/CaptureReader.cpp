@@ -32,6 +32,21 @@ std::string CaptureFault::text() const {
   return file + place + ": " + reason;
 }
 
+std::vector<std::string> CaptureReader::complaints() const {
+  std::vector<std::string> lines;
+  for (const CaptureFault& message : skipped_) lines.push_back(message.text());
+  if (const std::uint64_t more = skippedCount_ - skipped_.size(); more > 0)
+    lines.push_back(skipped_.front().file + ": " + std::to_string(more) +
+                    " more messages are skipped for the same reason");
+  if (fault_) lines.push_back(fault_->text());
+  return lines;
+}
+
+void CaptureReader::skip(CaptureFault message) {
+  constexpr std::size_t mostNamed = 5;
+  if (++skippedCount_ <= mostNamed) skipped_.push_back(std::move(message));
+}
+
 std::unique_ptr<CaptureReader> openCapture(const std::string& path, const PlistSerialiser& plists) {
   auto input = std::make_unique<InputBytes>(path);
   if (isDlf(path, *input)) return std::make_unique<DlfReader>(*input);

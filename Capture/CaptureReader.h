@@ -7,6 +7,7 @@
 #include <optional>
 #include <span>
 #include <string>
+#include <vector>
 
 #include "Platform/PlistSerialiser.h"
 
@@ -17,7 +18,7 @@ struct CapturedMessage {
   std::chrono::nanoseconds arrival{0};  // since 1 January 1970 UTC, never negative
 };
 
-// Why a capture ends before its end.
+// What of a capture could not be read.
 struct CaptureFault {
   std::string file;
   std::optional<std::uint64_t> offset;  // of what could not be read; nothing when the file was not opened,
@@ -32,16 +33,24 @@ class CaptureReader {
  public:
   virtual ~CaptureReader() = default;
 
-  // Nothing at the end and after a fault; what was read before a fault has been delivered by then.
+  // The next whole message. Nothing at the end and after a fault; what was read before a fault has been
+  // delivered by then.
   virtual std::optional<CapturedMessage> next() = 0;
-  // Set at the latest when next() has returned nothing.
+  // Why the capture ends before its end. Set at the latest when next() has returned nothing.
   const std::optional<CaptureFault>& fault() const { return fault_; }
-  // How many of the messages read so far the capture holds only the beginning of.
-  std::uint64_t cutMessages() const { return cutMessages_; }
+  // Everything that could not be read, in lines for people: messages of which the capture holds only the
+  // beginning, which were skipped, and at last the fault. Empty when all was well.
+  std::vector<std::string> complaints() const;
 
  protected:
+  // Of many such messages only the first are named.
+  void skip(CaptureFault message);
+
   std::optional<CaptureFault> fault_;
-  std::uint64_t cutMessages_ = 0;
+
+ private:
+  std::vector<CaptureFault> skipped_;
+  std::uint64_t skippedCount_ = 0;
 };
 
 // Opens a pcap, pcapng or DLF file or a snapshot; "-" is the standard input. A DLF file is told by its

@@ -54,17 +54,27 @@ void PcapReader::open() {
 }
 
 std::optional<CapturedMessage> PcapReader::next() {
-  if (!capture_) return std::nullopt;
-  const std::uint64_t begin = position();
-  pcap_pkthdr* header = nullptr;
-  const u_char* bytes = nullptr;
-  const int outcome = pcap_next_ex(capture_.get(), &header, &bytes);
-  if (outcome == 1) {
-    if (header->caplen < header->len) ++cutMessages_;
-    return CapturedMessage{.bytes = {bytes, header->caplen}, .arrival = arrivalOf(*header)};
+  while (capture_) {
+    const std::uint64_t begin = position();
+    pcap_pkthdr* header = nullptr;
+    const u_char* bytes = nullptr;
+    const int outcome = pcap_next_ex(capture_.get(), &header, &bytes);
+    if (outcome != 1) {
+      if (outcome != PCAP_ERROR_BREAK) fail(begin, pcap_geterr(capture_.get()));
+      return std::nullopt;
+    }
+    ++packetCount_;
+    if (header->caplen >= header->len)
+      return CapturedMessage{.bytes = {bytes, header->caplen}, .arrival = arrivalOf(*header)};
+    skipCut(begin, *header);
   }
-  if (outcome != PCAP_ERROR_BREAK) fail(begin, pcap_geterr(capture_.get()));
   return std::nullopt;
+}
+
+void PcapReader::skipCut(std::uint64_t offset, const pcap_pkthdr& packet) {
+  skip({input_->name(), offset,
+        "message " + std::to_string(packetCount_) + " is cut, " + std::to_string(packet.caplen) + " of " +
+            std::to_string(packet.len) + " bytes are there; it is skipped"});
 }
 
 std::uint64_t PcapReader::position() const {

@@ -7,6 +7,7 @@
 #include "Capture/InputBytes.h"
 
 struct pcap;
+struct pcap_pkthdr;
 
 namespace kelvasi {
 
@@ -14,7 +15,7 @@ class PcapReader : public CaptureReader {
  public:
   explicit PcapReader(std::unique_ptr<InputBytes> input);
 
-  // A packet of which the capture holds only the beginning is delivered as far as it goes, and counted.
+  // A packet of which the capture holds only the beginning is skipped.
   std::optional<CapturedMessage> next() override;
 
  private:
@@ -24,10 +25,12 @@ class PcapReader : public CaptureReader {
 
   void open();
   std::uint64_t position() const;
+  void skipCut(std::uint64_t offset, const pcap_pkthdr& packet);
   void fail(std::uint64_t offset, std::string reason);
 
   std::unique_ptr<InputBytes> input_;
   std::unique_ptr<pcap, Close> capture_;  // reads from the input; null after a fault
+  std::uint64_t packetCount_ = 0;
 };
 
 }  // namespace kelvasi

@@ -2,6 +2,8 @@
 
 #include <utility>
 
+#include "Capture/PlistEnd.h"
+
 namespace kelvasi {
 
 namespace {
@@ -21,12 +23,18 @@ const Bytes* dlfAmong(const PlistArray& entries) {
 SnapshotReader::SnapshotReader(InputBytes& input, const PlistSerialiser& plists) : name_(input.name()) {
   const Bytes document = input.readToEnd(largestFile, "a snapshot");
   fault_ = input.fault();
-  if (!fault_) open(plists.parse(document));
+  if (fault_) return;
+  if (const auto snapshot = plists.parse(document)) {
+    open(*snapshot);
+  } else if (endsTooEarly(document)) {
+    fault_ = CaptureFault{name_, document.size(), "the property list ends too early"};
+  } else {
+    fail("no property list that can be read");
+  }
 }
 
-void SnapshotReader::open(const std::optional<PlistValue>& snapshot) {
-  if (!snapshot) return fail("no property list that can be read");
-  const PlistDictionary* top = snapshot->dictionary();
+void SnapshotReader::open(const PlistValue& snapshot) {
+  const PlistDictionary* top = snapshot.dictionary();
   const PlistValue data = top ? top->get("Data") : PlistValue();
   // One that was saved before the baseband was known holds its time only.
   const bool holdsTimeOnly = !data && top && top->find("Timestamp");

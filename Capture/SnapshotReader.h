@@ -25,7 +25,7 @@ class SnapshotReader : public CaptureReader {
   std::optional<CapturedMessage> next() override;
 
  private:
-  void open(const std::optional<PlistValue>& snapshot);
+  void open(const PlistValue& snapshot);
   void fail(std::string reason);
 
   std::string name_;

@@ -18,12 +18,13 @@ constexpr std::size_t comparedMessages = 1024;
 void decodeFile(benchmark::State& state, const Technology& technology, std::size_t size) {
   const std::string path = writeMixedCapture(technology, size);
   Surroundings surroundings;
+  PushedClock clock(surroundings.clock);
   const std::uint64_t before = test::allocationsSoFar();
   for (auto _ : state) {
-    Decode decode(LogGenerator::generatorFromTechnology(technology.id, surroundings.platform()),
+    Decode decode(LogGenerator::generatorFromTechnology(technology.id, surroundings.platform()), clock,
                   [](TickSchedule::Time, const PlistValue&) {});
     const auto capture = openCapture(path, surroundings.platform().plists);
-    decode.take(*capture);
+    while (const auto message = capture->next()) decode.take(*message);
     decode.finish();
     if (capture->fault() || !decode.display()) return state.SkipWithError("the capture was not decoded");
   }

@@ -16,7 +16,7 @@ bool isNumber(std::string_view text) {
 }
 }  // namespace
 
-LogLevel::LogLevel(std::string_view text) {
+LogLevel::LogLevel(std::string_view text) : LogLevel() {
   const auto name = std::ranges::find(names, text);
   if (name != names.end()) {
     highest_ = static_cast<int>(name - names.begin());
@@ -28,9 +28,9 @@ LogLevel::LogLevel(std::string_view text) {
   }
 }
 
-LogLevel LogLevel::fromEnvironment() {
+LogLevel LogLevel::fromEnvironment(const LogLevel& unasked) {
   const char* text = std::getenv(variable);
-  return text && *text ? LogLevel(text) : LogLevel();
+  return text && *text ? LogLevel(text) : unasked;
 }
 
 }  // namespace kelvasi

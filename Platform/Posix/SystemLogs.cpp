@@ -53,9 +53,9 @@ void StderrSystemLog::write(LogPriority priority, std::string_view text) {
   writeAll(STDERR_FILENO, {reinterpret_cast<const std::uint8_t*>(line.data()), line.size()});
 }
 
-std::unique_ptr<SystemLog> makeSystemLog(bool isStderr, const std::string& program) {
-  if (isStderr) return std::make_unique<StderrSystemLog>();
-  return std::make_unique<SyslogSystemLog>(program);
+std::unique_ptr<SystemLog> makeSystemLog(bool isStderr, const std::string& program, LogLevel level) {
+  if (isStderr) return std::make_unique<StderrSystemLog>(std::move(level));
+  return std::make_unique<SyslogSystemLog>(program, std::move(level));
 }
 
 }  // namespace kelvasi

@@ -42,6 +42,7 @@ class StderrSystemLog final : public SystemLog {
 };
 
 // Syslog's, under the program's name, or the standard error's.
-std::unique_ptr<SystemLog> makeSystemLog(bool isStderr, const std::string& program);
+std::unique_ptr<SystemLog> makeSystemLog(bool isStderr, const std::string& program,
+                                         LogLevel level = LogLevel::fromEnvironment());
 
 }  // namespace kelvasi

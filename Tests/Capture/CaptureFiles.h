@@ -25,7 +25,7 @@ struct ReadCapture {
   std::vector<Bytes> messages;
   std::vector<std::int64_t> arrivals;  // nanoseconds since 1970
   std::optional<CaptureFault> fault;
-  std::uint64_t cutMessages = 0;
+  std::vector<std::string> complaints;
 };
 
 inline ReadCapture readCapture(const std::string& path) {
@@ -36,7 +36,7 @@ inline ReadCapture readCapture(const std::string& path) {
     capture.arrivals.push_back(message->arrival.count());
   }
   capture.fault = reader->fault();
-  capture.cutMessages = reader->cutMessages();
+  capture.complaints = reader->complaints();
   return capture;
 }
 
@@ -44,6 +44,7 @@ inline ReadCapture readCapture(const std::string& path) {
 class CaptureDirectory {
  public:
   std::string write(const std::string& name, const Bytes& bytes) const {
+    std::filesystem::remove(path(name));  // replacing waits for the disk
     if (const FileError error = writeFile(path(name), bytes)) throw std::runtime_error(*error);
     return path(name);
   }

@@ -75,10 +75,29 @@ TEST_F(PcapReaderTest, KeepsAbsurdStampsInReach) {
   EXPECT_THAT(capture.arrivals, ElementsAre(::testing::AllOf(::testing::Ge(0), ::testing::Lt(1ll << 62))));
 }
 
-TEST_F(PcapReaderTest, DeliversAndCountsPacketsCutByTheSnapshotLength) {
-  const ReadCapture capture = read(fileHeader + hex("01000000 00000000 01000000 09000000 AA") + firstPacket);
-  EXPECT_THAT(capture.messages, ElementsAre(hex("AA"), hex("AABBCC")));
-  EXPECT_EQ(capture.cutMessages, 1u);
+// One of nine bytes.
+const Bytes cutPacket = hex("01000000 00000000 01000000 09000000 AA");
+
+TEST_F(PcapReaderTest, SkipsAndNamesMessagesThatAreNotThereAsAWhole) {
+  const ReadCapture capture = read(fileHeader + firstPacket + cutPacket + secondPacket + cutPacket);
+  EXPECT_THAT(capture.messages, ElementsAre(hex("AABBCC"), hex("DD")));
+  EXPECT_FALSE(capture.fault);
+  const std::string file = directory.path("a.pcap");
+  EXPECT_THAT(capture.complaints,
+              ElementsAre(file + ": byte 43: message 2 is cut, 1 of 9 bytes are there; it is skipped",
+                          file + ": byte 77: message 4 is cut, 1 of 9 bytes are there; it is skipped"));
+}
+
+TEST_F(PcapReaderTest, CountsCutMessagesBeyondTheFirstFew) {
+  Bytes bytes = fileHeader;
+  for (int count = 0; count < 9; ++count) bytes = bytes + cutPacket;
+  bytes.pop_back();
+  const ReadCapture capture = read(bytes);
+  EXPECT_THAT(capture.messages, IsEmpty());
+  ASSERT_EQ(capture.complaints.size(), 7u);
+  EXPECT_EQ(capture.complaints[5],
+            directory.path("a.pcap") + ": 3 more messages are skipped for the same reason");
+  EXPECT_THAT(capture.complaints[6], ::testing::HasSubstr("a.pcap: byte 160: truncated dump file"));
 }
 
 TEST_F(PcapReaderTest, DeliversWhatPrecedesAPacketThatEndsTooEarly) {

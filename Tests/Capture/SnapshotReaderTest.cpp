@@ -94,7 +94,6 @@ TEST_F(SnapshotReaderTest, HasNoMessagesBeforeAnyArrived) {
 TEST_F(SnapshotReaderTest, RefusesWhatIsNoPropertyList) {
   const std::string reason = ": no property list that can be read";
   EXPECT_EQ(faultOf("no property list"), reason);
-  EXPECT_EQ(faultOf(snapshot.substr(0, snapshot.size() - 1)), reason);
   EXPECT_EQ(faultOf("<?xml version=\"1.0\"?><svg/>"), reason);
   std::string deep = snapshot;
   const auto place = deep.find("<array>");
@@ -104,6 +103,30 @@ TEST_F(SnapshotReaderTest, RefusesWhatIsNoPropertyList) {
   }
   EXPECT_EQ(faultOf(deep), reason);
   EXPECT_EQ(faultOf(""), ": byte 0: an empty file");
+}
+
+TEST_F(SnapshotReaderTest, SaysThatAPropertyListEndsTooEarly) {
+  const std::string declarations =
+      "<?xml version=\"1.0\"?>\n<!DOCTYPE plist PUBLIC \"-//X//DTD PLIST 1.0//EN\" \"http://x/p.dtd\">\n";
+  for (const std::string& whole : {snapshot, "\xef\xbb\xbf \n" + declarations + snapshot + "\n"}) {
+    const std::size_t end = whole.find("</plist>") + 8;
+    for (std::size_t size = 1; size < end; ++size) {
+      EXPECT_EQ(faultOf(whole.substr(0, size)),
+                ": byte " + std::to_string(size) + ": the property list ends too early");
+    }
+  }
+}
+
+TEST_F(SnapshotReaderTest, SaysThatABinaryPropertyListEndsTooEarly) {
+  const LibplistSerialiser plists;
+  const Bytes whole = plists.serialiseBinary(plists.parse(bytesOf(snapshot)).value()).value();
+  for (std::size_t size = 1; size < whole.size(); ++size) {
+    EXPECT_EQ(faultOf(std::string(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(size))),
+              ": byte " + std::to_string(size) + ": the property list ends too early");
+  }
+  Bytes damaged = whole;
+  damaged[8] = 0xF0;  // no kind of object
+  EXPECT_EQ(faultOf(std::string(damaged.begin(), damaged.end())), ": no property list that can be read");
 }
 
 TEST_F(SnapshotReaderTest, RefusesAPropertyListThatIsNoSnapshot) {

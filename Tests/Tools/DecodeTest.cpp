@@ -13,25 +13,6 @@ using ::testing::ElementsAre;
 using namespace std::chrono_literals;
 using test::hex;
 
-class HeldCapture : public CaptureReader {
- public:
-  struct Message {
-    Bytes bytes;
-    std::chrono::nanoseconds arrival;
-  };
-  explicit HeldCapture(std::vector<Message> messages) : messages_(std::move(messages)) {}
-
-  std::optional<CapturedMessage> next() override {
-    if (next_ == messages_.size()) return std::nullopt;
-    const Message& message = messages_[next_++];
-    return CapturedMessage{.bytes = message.bytes, .arrival = message.arrival};
-  }
-
- private:
-  std::vector<Message> messages_;
-  std::size_t next_ = 0;
-};
-
 // Shows how many messages came before each tick.
 class CountingGenerator : public LogGenerator {
  public:
@@ -48,30 +29,35 @@ class CountingGenerator : public LogGenerator {
 };
 
 struct DecodeTest : ::testing::Test {
+  void take(const Bytes& message, std::chrono::nanoseconds arrival) { decode.take({message, arrival}); }
+
   test::TestPlatform surroundings;
+  PushedClock clock{surroundings.clock};
   std::vector<std::pair<double, std::int64_t>> ticks;
-  Decode decode{std::make_unique<CountingGenerator>(surroundings.platform()),
+  std::vector<double> tickClocks;
+  Decode decode{std::make_unique<CountingGenerator>(surroundings.platform()), clock,
                 [this](TickSchedule::Time time, const PlistValue& display) {
                   ticks.emplace_back(std::chrono::duration<double>(time).count(), *display.integer());
+                  tickClocks.push_back(clock.now().secondsSince1970);
                 }};
 };
 
 TEST_F(DecodeTest, TicksBetweenMessagesAndAfterTheLast) {
-  HeldCapture capture({{hex("01"), 10s}, {hex("01"), 11s}, {hex("01"), 13s}});
-  decode.take(capture);
+  for (const auto arrival : {10s, 11s, 13s}) take(hex("01"), arrival);
   decode.finish();
   EXPECT_THAT(ticks, ElementsAre(std::pair(12.0, 2), std::pair(13.0, 3)));
   EXPECT_EQ(decode.display(), PlistValue(3));
   EXPECT_EQ(decode.saveContents(), PlistValue("contents"));
 }
 
-TEST_F(DecodeTest, GoesOnFromOneCaptureToTheNext) {
-  HeldCapture first({{hex("01"), 10s}});
-  HeldCapture second({{hex("01"), 11s}, {hex("01"), 60s}});
-  decode.take(first);
-  decode.take(second);
+TEST_F(DecodeTest, TheClockFollowsMessagesAndTicks) {
+  take(hex("01"), 10s + 250ms);
+  EXPECT_EQ(clock.now().secondsSince1970, 10.25);
+  take(hex("01"), 60s);
+  EXPECT_THAT(tickClocks, ElementsAre(12.25));
+  EXPECT_EQ(clock.now().secondsSince1970, 60);
   decode.finish();
-  EXPECT_THAT(ticks, ElementsAre(std::pair(12.0, 2), std::pair(60.0, 3)));
+  EXPECT_THAT(tickClocks, ElementsAre(12.25, 60));
 }
 
 TEST_F(DecodeTest, HasNoDisplayWithoutAMessage) {
@@ -81,8 +67,7 @@ TEST_F(DecodeTest, HasNoDisplayWithoutAMessage) {
 }
 
 TEST_F(DecodeTest, EndsTheProcessByAnExceptionOfADecoder) {
-  HeldCapture capture({{hex("EE"), 10s}});
-  EXPECT_EXIT(decode.take(capture), ::testing::KilledBySignal(SIGABRT), "record EE");
+  EXPECT_EXIT(take(hex("EE"), 10s), ::testing::KilledBySignal(SIGABRT), "record EE");
 }
 
 }  // namespace

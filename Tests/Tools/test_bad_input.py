@@ -2,10 +2,11 @@
 
 import json
 import os
+import struct
 import subprocess
 import unittest
 
-from support import GMM_REGISTERED, MM_IDLE, PROGRAM, TEMPLATES, KelvasictlTest, pcap
+from support import GMM_REGISTERED, MM_IDLE, PROGRAM, START, TEMPLATES, KelvasictlTest, pcap
 
 
 class BadCaptures(KelvasictlTest):
@@ -30,17 +31,47 @@ class BadCaptures(KelvasictlTest):
 
     def test_the_captures_fault_is_named_even_where_a_later_step_fails_too(self):
         empty = self.write("empty.pcap", b"")
-        self.assert_fault(self.decode(empty, "--format", "plist"), "empty.pcap: byte 0: ", "no display")
-        cut = self.write("cut.pcap", pcap(MM_IDLE)[:-1])
-        self.assert_fault(self.decode(cut, "--dlf", "/nonexistent/x"), "cut.pcap: byte 24: ", "/nonexistent/x")
+        for result, pieces in ((self.decode(empty, "--format", "plist"), ("empty.pcap: byte 0: ", "no display")),
+                               (self.decode(empty, "--dlf", "/nonexistent/x"), ("empty.pcap: byte 0: ", "/nonexistent/x"))):
+            said = result.stderr.decode().splitlines()
+            self.assertEqual((len(said), result.returncode), (2, 1), said)
+            for line, piece in zip(said, pieces):
+                self.assertIn(piece, line)
 
-    def test_a_fault_ends_the_decoding_before_the_next_capture(self):
+    def test_the_captures_after_a_bad_one_are_read_all_the_same(self):
         broken = self.write("a.pcap", pcap(MM_IDLE)[:-1])
-        result = self.decode(broken, self.write("b.pcap", pcap(GMM_REGISTERED)))
-        self.assert_fault(result, "a.pcap: byte 24: ", "; the 1 after it was not read")
-        self.assertEqual(result.stdout, b"null\n")
-        missing = self.decode(self.path("missing.pcap"), broken, broken)
-        self.assert_fault(missing, "missing.pcap: No such file or directory; the 2 after it were not read")
+        good = self.write("b.pcap", pcap(GMM_REGISTERED))
+        result = self.decode(broken, good)
+        self.assert_fault(result, "a.pcap: byte 24: ")
+        self.assertEqual(json.loads(result.stdout)["Process PS"]["MM State"], "GMM_REGISTERED")
+        result = self.decode(self.path("missing.pcap"), broken, good)
+        said = result.stderr.decode().splitlines()
+        self.assertEqual(len(said), 2)
+        self.assertTrue(said[0].endswith("missing.pcap: No such file or directory"), said[0])
+        self.assertEqual(result.returncode, 1)
+        self.assertEqual(json.loads(result.stdout)["Process PS"]["MM State"], "GMM_REGISTERED")
+
+    def test_a_message_that_is_not_whole_is_named_and_skipped(self):
+        contents = bytearray(pcap(MM_IDLE, GMM_REGISTERED))
+        contents[24 + 12] += 1  # the length that it had before it was captured
+        result = self.decode(self.write("a.pcap", bytes(contents)))
+        self.assert_fault(result, f"a.pcap: byte 24: message 1 is cut, {len(MM_IDLE)} of {len(MM_IDLE) + 1} bytes are there")
+        display = json.loads(result.stdout)
+        self.assertEqual(display["Process CS"], {})
+        self.assertEqual(display["Process PS"]["MM State"], "GMM_REGISTERED")
+
+    def test_the_beginning_of_a_message_ends_no_decoder(self):
+        display = b"<plist><dict><key>A</key><string>" + bytes(300_000).replace(b"\0", b"x") + b"</string></dict></plist>"
+        contents = pcap(b"<plist><string>whole</string></plist>")
+        contents += struct.pack("<IIII", START, 0, 262144, len(display)) + display[:262144]
+        result = self.decode(self.write("a.pcap", contents), technology="IFX")
+        self.assert_fault(result, f"message 2 is cut, 262144 of {len(display)} bytes are there; it is skipped")
+        self.assertEqual(json.loads(result.stdout), "whole")
+
+    def test_a_cut_snapshot_is_named_with_its_end(self):
+        contents = b"<?xml version=\"1.0\"?><plist><dict><key>Data</key><array>"
+        result = self.decode(self.write("a.kelvasi", contents))
+        self.assert_fault(result, f"a.kelvasi: byte {len(contents)}: the property list ends too early")
 
     def test_another_link_type_is_refused(self):
         result = self.decode(self.write("a.pcap", pcap(MM_IDLE, link_type=1)))

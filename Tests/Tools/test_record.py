@@ -198,8 +198,10 @@ class Record(LiveTest):
         in_part = bytearray(pcap(MM_IDLE, MM_IDLE, MM_IDLE))
         for number in (1, 2):  # the length that the packet had before it was captured
             in_part[24 + number * (16 + len(MM_IDLE)) + 12] += 1
+        cut = f"is cut, {len(MM_IDLE)} of {len(MM_IDLE) + 1} bytes are there; it is skipped"
         self.assertEqual(self.replayed(bytes(in_part)), [
-            "telvon-sim: FILE: 2 messages are not in the capture as a whole",
+            f"telvon-sim: FILE: byte {24 + 16 + len(MM_IDLE)}: message 2 {cut}",
+            f"telvon-sim: FILE: byte {24 + 2 * (16 + len(MM_IDLE))}: message 3 {cut}",
             "telvon-sim: the capture has been played",
         ])
 

@@ -3,10 +3,11 @@
 import datetime
 import os
 import plistlib
+import stat
 import struct
 import unittest
 
-from support import GMM_REGISTERED, MM_IDLE, KelvasictlTest, pcap, record
+from support import GMM_REGISTERED, MM_IDLE, START, KelvasictlTest, pcap, record
 
 
 class Dlf(KelvasictlTest):
@@ -33,6 +34,13 @@ class Dlf(KelvasictlTest):
         self.assertEqual(len(self.read("a.dlf")), 161 + len(MM_IDLE) - 1)
         self.assertEqual(sorted(os.listdir(self.directory.name)), ["a.dlf", "a.pcap"])
 
+    def test_outputs_are_their_owners_alone(self):
+        os.chmod(self.write("older.dlf", b"older"), 0o644)
+        for name in ("new.dlf", "older.dlf"):
+            self.decode("--dlf", self.path(name), "--snapshot", self.path("a.kelvasi"), self.write("a.pcap", pcap(MM_IDLE)))
+            for written in (name, "a.kelvasi"):
+                self.assertEqual(stat.S_IMODE(os.stat(self.path(written)).st_mode), 0o600)
+
     def test_a_place_that_cannot_be_written_is_named_after_the_display(self):
         capture = self.write("a.pcap", pcap(MM_IDLE))
         for option in ("--dlf", "--snapshot"):
@@ -58,6 +66,18 @@ class Snapshot(KelvasictlTest):
         self.assertEqual(sorted(first), ["Date", "Description", "Display", "DisplayState", "ExtraInfo"])
         self.assertEqual(second["DisplayState"], GMM_REGISTERED)
         self.assertEqual(dlf["Description"], f"DLF binary ({len(dlf['DLF'])} bytes)")
+
+    def test_all_times_are_the_captures(self):
+        capture = self.write("a.pcap", pcap((0.0, MM_IDLE), (3.0, GMM_REGISTERED), (5.5, MM_IDLE)))
+        snapshot = self.snapshot("--dlf", self.path("a.dlf"), capture)
+        dates = [f"2024-03-05 14:07:{second} +0000" for second in ("11", "13", "14")]  # its ticks: after 2.0, 4.0 and 5.5 s
+        self.assertEqual([entry["Date"] for entry in snapshot["Data"][:-1]], dates)
+        self.assertEqual([entry["Description"] for entry in snapshot["Data"][:-1]],
+                         [f"Snapshot ({date})" for date in dates])
+        self.assertEqual(snapshot["Timestamp"], dates[-1])
+        created = struct.unpack_from("<I", self.read("a.dlf"), 81)[0]
+        self.assertEqual(created, START + 5)
+        self.assertEqual(snapshot["Data"][-1]["DLF"], self.read("a.dlf"))
 
     def test_keeps_the_last_five_ticks(self):
         messages = [(3.0 * count, MM_IDLE) for count in range(8)]

@@ -2,11 +2,10 @@
 
 namespace kelvasi {
 
-void Decode::take(CaptureReader& capture) {
-  while (const auto message = capture.next()) {
-    if (const auto time = schedule_.tickBefore(message->arrival)) tick(*time);
-    update(message->bytes);
-  }
+void Decode::take(const CapturedMessage& message) {
+  if (const auto time = schedule_.tickBefore(message.arrival)) tick(*time);
+  clock_.set(message.arrival);
+  update(message.bytes);
 }
 
 void Decode::finish() {
@@ -14,6 +13,7 @@ void Decode::finish() {
 }
 
 void Decode::tick(TickSchedule::Time time) {
+  clock_.set(time);
   display_ = generate();
   if (onTick_) onTick_(time, display_);
 }

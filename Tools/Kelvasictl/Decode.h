@@ -6,6 +6,7 @@
 
 #include "Capture/CaptureReader.h"
 #include "LogGenerator/LogGenerator.h"
+#include "Platform/PushedClock.h"
 #include "Tools/Kelvasictl/TickSchedule.h"
 
 namespace kelvasi {
@@ -15,11 +16,12 @@ class Decode {
   // Called after each tick with its time, since 1970, and its display, which lasts for the call.
   using TickHandler = std::function<void(TickSchedule::Time time, const PlistValue& display)>;
 
-  Decode(std::unique_ptr<LogGenerator> generator, TickHandler onTick)
-      : generator_(std::move(generator)), onTick_(std::move(onTick)) {}
+  // `clock`, the generator's, follows the messages and the ticks.
+  Decode(std::unique_ptr<LogGenerator> generator, PushedClock& clock, TickHandler onTick)
+      : generator_(std::move(generator)), clock_(clock), onTick_(std::move(onTick)) {}
 
-  // All messages of a capture, up to its end or fault. An exception of the generator ends the process.
-  void take(CaptureReader& capture);
+  // The next message. An exception of the generator ends the process.
+  void take(const CapturedMessage& message);
   // The tick after the last message; none when there was no message.
   void finish();
 
@@ -33,6 +35,7 @@ class Decode {
   void tick(TickSchedule::Time time);
 
   std::unique_ptr<LogGenerator> generator_;
+  PushedClock& clock_;
   TickHandler onTick_;
   PlistValue::Dictionary state_ = PlistDictionary::make();
   TickSchedule schedule_;

@@ -5,6 +5,7 @@
 #include <system_error>
 #include <vector>
 
+#include "Capture/CaptureInput.h"
 #include "Model/SnapshotFile.h"
 #include "Platform/Posix/Files.h"
 #include "Telvon/TechnologyName.h"
@@ -62,18 +63,13 @@ class DecodeVerb {
       printOut(inXml(generator->getStartCommand(), surroundings_.plists));
       return exitSuccess;
     }
-    Decode decode(std::move(generator), tickHandler());
-    const auto fault = decodeCaptures(decode);
+    Decode decode(std::move(generator), surroundings_.captureClock, tickHandler());
+    CaptureInput input(options_.captures, surroundings_.plists, complain);
+    while (const auto message = input.next()) decode.take(*message);
     decode.finish();
-    try {
-      if (!options_.everyTick) printDisplay(decode.display());
-      save(decode.saveContents());
-    } catch (const ToolError& error) {
-      if (!fault) throw;
-      throw ToolError(*fault + "; " + error.what());  // the capture's fault came first
-    }
-    if (fault) throw ToolError(*fault);
-    return exitSuccess;
+    if (!options_.everyTick) printDisplay(decode.display());
+    save(decode.saveContents());
+    return input.hasFault() ? exitFault : exitSuccess;
   }
 
  private:
@@ -82,26 +78,6 @@ class DecodeVerb {
     return [](TickSchedule::Time time, const PlistValue& display) {
       printOut(tickJson(std::chrono::duration<double>(time).count(), display));
     };
-  }
-
-  // Up to the first that has a fault, which it returns.
-  std::optional<std::string> decodeCaptures(Decode& decode) const {
-    std::size_t notRead = options_.captures.size();
-    for (const std::string& path : options_.captures) {
-      --notRead;
-      const auto capture = openCapture(path, surroundings_.plists);
-      decode.take(*capture);
-      if (capture->cutMessages() > 0)
-        complain(path + ": " + std::to_string(capture->cutMessages()) +
-                 " messages are not in the capture as a whole");
-      if (capture->fault()) return capture->fault()->text() + saidOf(notRead);
-    }
-    return std::nullopt;
-  }
-
-  static std::string saidOf(std::size_t notRead) {
-    if (notRead == 0) return {};
-    return "; the " + std::to_string(notRead) + " after it " + (notRead == 1 ? "was" : "were") + " not read";
   }
 
   void printDisplay(const PlistValue& display) const {
@@ -113,7 +89,8 @@ class DecodeVerb {
   void save(const PlistValue& saveContents) const {
     if (!options_.dlf.empty()) replace(options_.dlf, dlfIn(saveContents));
     if (options_.snapshot.empty()) return;
-    const auto snapshot = snapshotDictionary(surroundings_.clock.now(), saveContents, options_.description);
+    const auto snapshot =
+        snapshotDictionary(surroundings_.captureClock.now(), saveContents, options_.description);
     const auto xml = surroundings_.plists.serialiseXml(snapshot);
     if (!xml) throw ToolError(options_.snapshot + ": what is to be saved is no property list");
     replace(options_.snapshot, *xml);
@@ -132,7 +109,7 @@ class DecodeVerb {
   }
 
   const DecodeOptions& options_;
-  Surroundings surroundings_;
+  OfflineSurroundings surroundings_;
 };
 
 std::string readTechnology(std::string& text) {

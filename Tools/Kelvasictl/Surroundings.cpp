@@ -42,11 +42,14 @@ void SurroundingsOptions::addTo(CLI::App& verb) {
                 R"(system-log lines go to the standard error, as "<N>text", instead of to syslog)");
 }
 
-Surroundings::Surroundings(const SurroundingsOptions& options)
-    : log(makeSystemLog(options.logsToStderr, "kelvasictl")),
+Surroundings::Surroundings(const SurroundingsOptions& options, const LogLevel& unasked)
+    : log(makeSystemLog(options.logsToStderr, "kelvasictl", LogLevel::fromEnvironment(unasked))),
       trace(makeTrace(options.logsToStderr)),
       resources(resourcesDirectory(options)) {
   installTerminateHandler(*log, options.logsToStderr ? "" : "kelvasictl");
 }
+
+OfflineSurroundings::OfflineSurroundings(const SurroundingsOptions& options)
+    : Surroundings(options, options.logsToStderr ? LogLevel() : LogLevel("err")), captureClock(clock) {}
 
 }  // namespace kelvasi

@@ -7,8 +7,10 @@
 
 #include "Platform/Platform.h"
 #include "Platform/Plist/LibplistSerialiser.h"
+#include "Platform/Posix/LogLevel.h"
 #include "Platform/Posix/PackageResources.h"
 #include "Platform/Posix/PosixClock.h"
+#include "Platform/PushedClock.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TraceOutput.h"
 
@@ -30,7 +32,8 @@ class Surroundings {
  public:
   // Throws ToolError when the resources are not a directory. Lasts to the end of the process: the last words
   // of an uncaught exception go to its log.
-  explicit Surroundings(const SurroundingsOptions& options);
+  // KELVASI_LOG_LEVEL says what is logged, and `unasked` where it does not.
+  explicit Surroundings(const SurroundingsOptions& options, const LogLevel& unasked = LogLevel());
 
   Platform platform() { return {*log, *trace, plists, resources, clock}; }
 
@@ -39,6 +42,17 @@ class Surroundings {
   const LibplistSerialiser plists;
   const PackageResources resources;
   const PosixClock clock;
+};
+
+// Of a verb that is not live: the clock is the capture's, and of the thousands of traces of a drive, which
+// say nothing of this machine, none goes to syslog unless that is asked for.
+class OfflineSurroundings : public Surroundings {
+ public:
+  explicit OfflineSurroundings(const SurroundingsOptions& options);
+
+  Platform platform() { return {*log, *trace, plists, resources, captureClock}; }
+
+  PushedClock captureClock;
 };
 
 }  // namespace kelvasi

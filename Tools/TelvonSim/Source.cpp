@@ -36,18 +36,14 @@ SourceResult scenarioSource(const Options& options, const PlistSerialiser& plist
               [kind, options, &plists] { return begun(*kind, options, plists); })};
 }
 
-void tellFaults(const std::string& path, const CaptureReader& capture) {
-  if (capture.cutMessages() > 0)
-    std::fprintf(stderr, "telvon-sim: %s: %llu messages are not in the capture as a whole\n", path.c_str(),
-                 static_cast<unsigned long long>(capture.cutMessages()));
-  if (capture.fault()) std::fprintf(stderr, "telvon-sim: %s\n", capture.fault()->text().c_str());
+void tellFaults(const CaptureReader& capture) {
+  for (const std::string& line : capture.complaints()) std::fprintf(stderr, "telvon-sim: %s\n", line.c_str());
 }
 
 SourceResult replaySource(const Options& options, const PlistSerialiser& plists) {
   SourceResult result;
   result.source = std::make_unique<sim::ReplaySource>(
-      [path = options.replay, &plists] { return openCapture(path, plists); }, options.isLooping,
-      [path = options.replay](const CaptureReader& capture) { tellFaults(path, capture); });
+      [path = options.replay, &plists] { return openCapture(path, plists); }, options.isLooping, tellFaults);
   if (!result.source->nextAt())
     return {.source = nullptr, .failure = options.replay + ": no messages to play", .exitStatus = 1};
   return result;
