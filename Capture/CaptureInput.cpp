@@ -2,26 +2,83 @@
 
 #include <utility>
 
+#include "Telvon/TechnologyName.h"
+
 namespace kelvasi {
 
-CaptureInput::CaptureInput(std::vector<std::string> paths, const PlistSerialiser& plists, Tell tell)
-    : paths_(std::move(paths)), plists_(plists), tell_(std::move(tell)) {}
+namespace {
 
-std::optional<CapturedMessage> CaptureInput::next() {
-  while (capture_ || nextPath_ < paths_.size()) {
-    if (!capture_) capture_ = openCapture(paths_[nextPath_++], plists_);
-    if (const auto message = capture_->next()) return message;
+std::string fitsNone(const TechnologyCount& count) {
+  return "fits no technology: none asks for any of its messages (" + std::to_string(count.messages()) + ")";
+}
+
+}  // namespace
+
+CaptureInput::CaptureInput(Choice choice, const PlistSerialiser& plists, Tell tell)
+    : choice_(std::move(choice)), plists_(plists), tell_(std::move(tell)) {}
+
+std::optional<InputMessage> CaptureInput::next() {
+  while (capture_ || nextPath_ < choice_.paths.size()) {
+    if (!capture_) openNext();
+    if (!technology_.empty()) {
+      if (const auto message = capture_->next()) return InputMessage{*message, technology_};
+    }
     endCapture();
   }
   return std::nullopt;
 }
 
+void CaptureInput::openNext() {
+  capture_.emplace(openCapture(choice_.paths[nextPath_++], plists_), codes_);
+  isFound_ = !choice_.technology;
+  technology_ = {};
+  if (isFound_) return findTechnology();
+  technology_ = technologyId(*choice_.technology).value();
+}
+
+void CaptureInput::findTechnology() {
+  const auto found = capture_->findTechnology();
+  if (!found) return tellWhyNoneWasFound();
+  technology_ = *found;
+  if (told_ != technology_) tell_(ofCapture(std::string(shortTechnologyName(technology_))));
+  told_ = technology_;
+}
+
+void CaptureInput::tellWhyNoneWasFound() {
+  const TechnologyCount& count = capture_->count();
+  if (count.messages() == 0) return;  // nothing to find it from, and nothing to miss
+  const auto ranking = count.ranking();
+  std::string why = "fits " + count.text(ranking) + " alike";
+  if (ranking.empty()) why = "its messages (" + std::to_string(count.messages()) + ") tell no technology";
+  tellFault(ofCapture((count.fitsNone() ? fitsNone(count) : why) + "; --technology says which it is"));
+}
+
 void CaptureInput::endCapture() {
-  for (const std::string& line : capture_->complaints()) {
-    hasFault_ = true;
-    tell_(line);
-  }
+  for (const std::string& line : capture_->reader().complaints()) tellFault(line);
+  if (!technology_.empty()) tellOfOthers();
   capture_.reset();
+}
+
+void CaptureInput::tellOfOthers() {
+  const TechnologyCount& count = capture_->count();
+  if (count.fitsNone()) return tell_(ofCapture(fitsNone(count)));
+  auto ranking = count.ranking();
+  std::string_view taken = technology_;
+  const bool fitsOther = !ranking.empty() && count.of(ranking.front()) > count.of(taken);
+  const bool fitsMore = ranking.size() > 1;
+  if (!fitsOther && !(fitsMore && isFound_)) return;
+  if (count.of(taken) == 0) ranking.push_back(taken);
+  tell_(ofCapture("fits " + count.text(ranking) + "; taken for " + std::string(shortTechnologyName(taken))));
+}
+
+void CaptureInput::tellFault(const std::string& line) {
+  hasFault_ = true;
+  tell_(line);
+}
+
+std::string CaptureInput::ofCapture(const std::string& text) const {
+  const std::string& path = choice_.paths[nextPath_ - 1];
+  return (path == "-" ? "standard input" : path) + ": " + text;
 }
 
 }  // namespace kelvasi

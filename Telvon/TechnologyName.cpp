@@ -18,6 +18,10 @@ constexpr std::array technologies{kTelvonLogChannelTechnology_IFX, kTelvonLogCha
 
 }  // namespace
 
+std::span<const std::string_view> technologyIds() {
+  return technologies;
+}
+
 std::optional<std::string_view> technologyId(std::string_view name) {
   const auto known = std::ranges::find_if(
       technologies, [&](std::string_view id) { return id == name || shortTechnologyName(id) == name; });

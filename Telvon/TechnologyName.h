@@ -2,9 +2,13 @@
 #pragma once
 
 #include <optional>
+#include <span>
 #include <string_view>
 
 namespace kelvasi {
+
+// All of them, in the order in which a daemon's answer is compared with them.
+std::span<const std::string_view> technologyIds();
 
 // The identifier for its short name, "Orvane_GSM", or for itself; nothing for one that does not exist.
 std::optional<std::string_view> technologyId(std::string_view name);

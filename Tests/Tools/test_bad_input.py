@@ -96,7 +96,7 @@ class WrongUsage(KelvasictlTest):
     def test_has_a_status_of_its_own_and_one_line(self):
         capture = self.write("a.pcap", pcap(MM_IDLE))
         gsm = ["decode", "--technology", "Orvane_GSM"]
-        for arguments in ([], ["unknown"], ["decode", capture], gsm, [*gsm, "--unknown", capture],
+        for arguments in ([], ["unknown"], ["decode"], ["decode", "--start-command"], gsm, [*gsm, "--unknown", capture],
                           [*gsm, "--format", "yaml", capture], ["decode", "--technology", "GSM", capture],
                           [*gsm, "--snapshot", "", capture],
                           [*gsm, "--dlf", "", capture], ["monitor", "--format", "plist"], ["monitor", "--seconds", "x"], ["record"]):

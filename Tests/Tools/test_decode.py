@@ -192,5 +192,47 @@ class EveryTick(KelvasictlTest):
         self.assert_fault(result, "a.pcap: byte 56: ")
 
 
+class Technology(KelvasictlTest):
+    """Found from the messages where it is not given."""
+
+    LTE = record(0xB179, bytes(8))
+
+    def find(self, *captures, **options):
+        return self.run_program("decode", "--resources", TEMPLATES, *captures, **options)
+
+    def test_is_named_on_the_standard_error(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        found = self.find(capture)
+        self.assertEqual((found.returncode, found.stderr.decode()), (0, f"kelvasictl: {capture}: Orvane_GSM\n"))
+        self.assertEqual(found.stdout, self.decode(capture).stdout)
+
+    def test_is_found_in_a_pipe(self):
+        found = self.find("-", input=pcap(MM_IDLE))
+        self.assertEqual((found.returncode, found.stderr), (0, b"kelvasictl: standard input: Orvane_GSM\n"))
+        self.assertIn(b"MM_IDLE", found.stdout)
+
+    def test_of_the_first_capture_is_that_of_the_display(self):
+        first, second = self.write("a.pcap", pcap(MM_IDLE)), self.write("b.pcap", pcap(self.LTE, self.LTE))
+        found = self.find(first, second)
+        self.assertEqual(found.stderr.decode().splitlines(), [
+            f"kelvasictl: {first}: Orvane_GSM",
+            f"kelvasictl: {second}: fits Orvane_LTE (2 of 2 messages) and Orvane_GSM (0); taken for Orvane_GSM"])
+        self.assertEqual(found.returncode, 0)
+        self.assertEqual(found.stdout, self.decode(first).stdout)
+
+    def test_another_than_the_one_that_was_given_is_told(self):
+        capture = self.write("a.pcap", pcap(self.LTE))
+        given = self.decode(capture)
+        self.assertEqual(given.stderr.decode(),
+                         f"kelvasictl: {capture}: fits Orvane_LTE (1 of 1 messages) and Orvane_GSM (0); taken for Orvane_GSM\n")
+        self.assertEqual(given.returncode, 0)
+
+    def test_that_cannot_be_found_is_a_fault(self):
+        capture = self.write("a.pcap", pcap(record(0x1234, bytes(8))))
+        found = self.find(capture)
+        self.assert_fault(found, "fits no technology: none asks for any of its messages (1); --technology says which it is")
+        self.assertEqual(found.stdout, b"null\n")
+
+
 if __name__ == "__main__":
     unittest.main()

@@ -50,29 +50,55 @@ constexpr std::array formats{
     Format{"plist", inXml},
 };
 
+CaptureInput::Choice inputOf(const DecodeOptions& options) {
+  CaptureInput::Choice choice{.paths = options.captures, .technology = {}};
+  if (!options.technology.empty()) choice.technology = options.technology;
+  return choice;
+}
+
 class DecodeVerb {
  public:
   explicit DecodeVerb(const DecodeOptions& options)
       : options_(options), surroundings_(options.surroundings) {}
 
   int run() {
-    auto generator = LogGenerator::generatorFromTechnology(options_.technology, surroundings_.platform());
-    if (!generator)
-      throw ToolError("there is no generator for " + std::string(shortTechnologyName(options_.technology)));
     if (options_.startCommand) {
-      printOut(inXml(generator->getStartCommand(), surroundings_.plists));
+      printOut(inXml(generatorFor(options_.technology)->getStartCommand(), surroundings_.plists));
       return exitSuccess;
     }
-    Decode decode(std::move(generator), surroundings_.captureClock, tickHandler());
-    CaptureInput input(options_.captures, surroundings_.plists, complain);
-    while (const auto message = input.next()) decode.take(*message);
-    decode.finish();
-    if (!options_.everyTick) printDisplay(decode.display());
-    save(decode.saveContents());
-    return input.hasFault() ? exitFault : exitSuccess;
+    if (!options_.technology.empty()) start(options_.technology);
+    const bool isWhole = decodeCaptures();
+    if (decode_) decode_->finish();
+    if (!options_.everyTick) printDisplay(decode_ ? decode_->display() : PlistValue());
+    save(decode_ ? decode_->saveContents() : PlistValue());
+    return isWhole ? exitSuccess : exitFault;
   }
 
  private:
+  std::unique_ptr<LogGenerator> generatorFor(std::string_view technology) {
+    auto generator = LogGenerator::generatorFromTechnology(technology, surroundings_.platform());
+    if (!generator)
+      throw ToolError("there is no generator for " + std::string(shortTechnologyName(technology)));
+    return generator;
+  }
+
+  void start(std::string_view technology) {
+    decode_.emplace(generatorFor(technology), surroundings_.captureClock, tickHandler());
+  }
+
+  // One display has one technology, that of the first message unless it is given.
+  bool decodeCaptures() {
+    CaptureInput input(inputOf(options_), surroundings_.plists, complain);
+    while (const auto message = input.next()) {
+      if (!decode_) {
+        input.keepTechnology(message->technology);
+        start(message->technology);
+      }
+      decode_->take(*message);
+    }
+    return !input.hasFault();
+  }
+
   Decode::TickHandler tickHandler() const {
     if (!options_.everyTick) return {};
     return [](TickSchedule::Time time, const PlistValue& display) {
@@ -110,6 +136,7 @@ class DecodeVerb {
 
   const DecodeOptions& options_;
   OfflineSurroundings surroundings_;
+  std::optional<Decode> decode_;
 };
 
 std::string readTechnology(std::string& text) {
@@ -138,10 +165,10 @@ std::string named(const std::string& file) {
 
 void addOptions(CLI::App& verb, DecodeOptions& options) {
   verb.add_option("--technology", options.technology,
-                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
+                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2; otherwise it is found from the "
+                  "messages")
       ->type_name("TECH")
-      ->transform(CLI::Validator(readTechnology, ""))
-      ->required();
+      ->transform(CLI::Validator(readTechnology, ""));
   verb.add_option("--format", options.format, "json (the default), tree (path TAB value), or plist")
       ->type_name("FORMAT")
       ->check(CLI::IsMember({"json", "tree", "plist"}));
@@ -166,6 +193,8 @@ Action declareDecode(CLI::App& verb) {
   addOptions(verb, *options);
   verb.callback([options] {
     if (!options->startCommand && options->captures.empty()) throw CLI::RequiredError("CAPTURE");
+    if (options->startCommand && options->technology.empty())
+      throw CLI::ValidationError("--start-command", "needs --technology");
     if (options->everyTick && options->format != "json")
       throw CLI::ValidationError("--every-tick", "gives JSON only");
     refuseInput(*options, "--dlf", options->dlf);
