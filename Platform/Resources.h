@@ -14,7 +14,8 @@ class Resources {
  public:
   virtual ~Resources() = default;
 
-  // Paths of all resources of a type ("plist") in the package's root, ordered by name.
+  // Paths of all resources of a type ("plist") in the package's root, ordered by name. A path begins within
+  // the package: where that lies makes no difference.
   virtual std::vector<std::string> pathsOfType(std::string_view type) const = 0;
   // The bytes of resource `name`.`type`; nothing when there is none or it cannot be read.
   virtual std::optional<Bytes> contents(std::string_view name, std::string_view type) const = 0;

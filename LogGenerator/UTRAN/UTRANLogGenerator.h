@@ -1,5 +1,6 @@
 // The generator of the Orvane UTRAN baseband. Its template is the first property-list resource with "UTRAN",
-// in any case, in its path; without one the generator asks for no records and shows nothing.
+// in any case, in its path within the package; without one the generator asks for no records and shows
+// nothing.
 #pragma once
 
 #include <optional>

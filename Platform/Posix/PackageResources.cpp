@@ -56,7 +56,7 @@ std::vector<std::string> PackageResources::pathsOfType(std::string_view type) co
   std::error_code failure;
   for (fs::directory_iterator entry(directory_, failure), end; !failure && entry != end;
        entry.increment(failure)) {
-    if (isResource(*entry, extension)) paths.push_back(entry->path().native());
+    if (isResource(*entry, extension)) paths.push_back(entry->path().filename().native());
   }
   std::ranges::sort(paths, {}, [](const std::string& path) { return fs::path(path).stem(); });
   return paths;

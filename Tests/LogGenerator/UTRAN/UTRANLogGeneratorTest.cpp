@@ -66,7 +66,7 @@ TEST(UTRANLogGenerator, TakesTheFirstTemplateWithItsNameInAnyCase) {
 TEST(UTRANLogGenerator, TheDirectoryOfATemplateCountsAsItsName) {
   struct Elsewhere : test::FakeResources {
     std::vector<std::string> pathsOfType(std::string_view) const override {
-      return {"/opt/UtRaN/first.one.plist", "/opt/UTRAN.plist"};
+      return {"UtRaN/first.one.plist", "UTRAN.plist"};
     }
   };
   EXPECT_EQ(UTRANLogGenerator::templateName(Elsewhere()), "first.one");

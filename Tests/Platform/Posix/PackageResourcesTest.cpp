@@ -34,9 +34,7 @@ TEST_F(PackageResourcesTest, ListsOneTypeByName) {
   for (const char* name : {"b.plist", "a-2.plist", "a.plist", "B.plist", "c.txt", "plist", "d.plist.bak"}) {
     create(name);
   }
-  EXPECT_THAT(resources.pathsOfType("plist"),
-              ElementsAre(directory.file("B.plist"), directory.file("a.plist"), directory.file("a-2.plist"),
-                          directory.file("b.plist")));
+  EXPECT_THAT(resources.pathsOfType("plist"), ElementsAre("B.plist", "a.plist", "a-2.plist", "b.plist"));
 }
 
 TEST_F(PackageResourcesTest, ListsNeitherHiddenFilesNorDirectoriesNorWhatIsInThem) {
@@ -45,6 +43,14 @@ TEST_F(PackageResourcesTest, ListsNeitherHiddenFilesNorDirectoriesNorWhatIsInThe
   std::filesystem::create_directories(directory.path() / "folder.plist");
   create("folder.plist/inner.plist");
   EXPECT_THAT(resources.pathsOfType("plist"), IsEmpty());
+}
+
+TEST_F(PackageResourcesTest, WhereThePackageLiesIsNoPartOfAPath) {
+  const auto package = directory.path() / "UTRAN" / "utran";
+  std::filesystem::create_directories(package);
+  create("UTRAN/utran/LTE.plist");
+  EXPECT_THAT(PackageResources(package).pathsOfType("plist"), ElementsAre("LTE.plist"));
+  EXPECT_THAT(PackageResources(package / "").pathsOfType("plist"), ElementsAre("LTE.plist"));
 }
 
 TEST_F(PackageResourcesTest, AMissingDirectoryHasNoResources) {
@@ -92,7 +98,7 @@ TEST_F(PackageResourcesTest, APipeIsNoResourceAndHoldsNobodyUp) {
 TEST_F(PackageResourcesTest, TheEnvironmentChoosesTheDirectory) {
   const Variable variable("KELVASI_RESOURCES", directory.path().native());
   create("a.plist");
-  EXPECT_THAT(PackageResources().pathsOfType("plist"), ElementsAre(directory.file("a.plist")));
+  EXPECT_THAT(PackageResources().pathsOfType("plist"), ElementsAre("a.plist"));
 }
 
 TEST_F(PackageResourcesTest, WithoutTheVariableItBelongsToTheProgram) {
