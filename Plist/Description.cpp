@@ -103,6 +103,7 @@ std::string description(PlistDate date) {
 std::string description(const PlistValue& value) {
   if (const auto* text = value.string()) return *text;
   if (const auto* integer = value.integer()) return std::to_string(*integer);
+  if (const auto* integer = value.unsignedInteger()) return std::to_string(*integer);
   if (const auto* real = value.real()) return number(*real);
   if (const auto* flag = value.boolean()) return *flag ? "1" : "0";
   if (const auto* date = value.date()) return description(*date);

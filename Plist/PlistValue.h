@@ -8,6 +8,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <variant>
 #include <vector>
 
@@ -46,8 +47,13 @@ class PlistValue {
   PlistValue(DeferredText text) : value_(text) {}
   PlistValue(bool flag) : value_(flag) {}
   template <std::integral Integer>
-  requires(!std::same_as<Integer, bool>) PlistValue(Integer number)
-      : value_(static_cast<std::int64_t>(number)) {}
+  requires(!std::same_as<Integer, bool>) PlistValue(Integer number) {
+    if (std::in_range<std::int64_t>(number)) {
+      value_ = static_cast<std::int64_t>(number);
+    } else {
+      value_ = static_cast<std::uint64_t>(number);
+    }
+  }
   PlistValue(double number) : value_(number) {}
   PlistValue(PlistDate date) : value_(date) {}
   PlistValue(Bytes bytes) : value_(std::make_shared<const Bytes>(std::move(bytes))) {}
@@ -69,6 +75,8 @@ class PlistValue {
     return std::get_if<std::string>(&value_);
   }
   const std::int64_t* integer() const { return std::get_if<std::int64_t>(&value_); }
+  // Integers of 2^63 and more; the others are integer()'s.
+  const std::uint64_t* unsignedInteger() const { return std::get_if<std::uint64_t>(&value_); }
   const double* real() const { return std::get_if<double>(&value_); }
   const bool* boolean() const { return std::get_if<bool>(&value_); }
   const PlistDate* date() const { return std::get_if<PlistDate>(&value_); }
@@ -111,8 +119,8 @@ class PlistValue {
   }
 
   // Mutable for the text that the first look makes.
-  mutable std::variant<std::monostate, std::string, std::int64_t, double, bool, PlistDate, Data, Dictionary,
-                       Array, DeferredText>
+  mutable std::variant<std::monostate, std::string, std::int64_t, std::uint64_t, double, bool, PlistDate,
+                       Data, Dictionary, Array, DeferredText>
       value_;
 };
 

@@ -13,7 +13,7 @@ constexpr const char* source = "LogGenerator/GSM/GSMLogGenerator";
 
 // What an object that does not belong into a display is called in the failure's text.
 const char* className(const PlistValue& object) {
-  if (object.integer()) return "int";
+  if (object.integer() || object.unsignedInteger()) return "int";
   if (object.real()) return "double";
   if (object.boolean()) return "bool";
   if (object.data()) return "bytes";

@@ -19,6 +19,24 @@ Value valueOf(plist_t node) {
   return value;
 }
 
+// The library keeps an integer's sign to itself, and shows it where it writes: the binary format has 16 bytes
+// for what is unsigned.
+bool isUnsigned(plist_t node) {
+  constexpr std::uint32_t markerAt = 8;
+  constexpr char integerOf16Bytes = 0x14;
+  char* content = nullptr;
+  std::uint32_t size = 0;
+  plist_to_bin(node, &content, &size);
+  const std::unique_ptr<char, decltype(&plist_to_bin_free)> owned(content, &plist_to_bin_free);
+  return size > markerAt && content[markerAt] == integerOf16Bytes;
+}
+
+PlistValue integerFrom(plist_t node) {
+  const auto bits = valueOf<std::uint64_t, plist_get_uint_val>(node);
+  const auto number = static_cast<std::int64_t>(bits);
+  return number < 0 && isUnsigned(node) ? PlistValue(bits) : PlistValue(number);
+}
+
 PlistValue stringFrom(plist_t node) {
   const char* text = plist_get_string_ptr(node, nullptr);
   return std::string(text ? text : "");
@@ -52,9 +70,11 @@ PlistValue dictionaryFrom(plist_t node) {
   }
 }
 
-// The library makes its own kind of a dictionary that has but this key.
+// The library makes its own kind of a dictionary that has but this key, and loses whether its number was
+// negative.
 PlistValue uidFrom(plist_t node) {
-  return PlistDictionary::make({{"CF$UID", valueOf<std::uint64_t, plist_get_uid_val>(node)}});
+  const auto bits = valueOf<std::uint64_t, plist_get_uid_val>(node);
+  return PlistDictionary::make({{"CF$UID", static_cast<std::int64_t>(bits)}});
 }
 
 }  // namespace
@@ -64,7 +84,7 @@ PlistValue fromLibplist(plist_t node) {
     case PLIST_BOOLEAN:
       return valueOf<std::uint8_t, plist_get_bool_val>(node) != 0;
     case PLIST_UINT:
-      return valueOf<std::uint64_t, plist_get_uint_val>(node);
+      return integerFrom(node);
     case PLIST_REAL:
       return valueOf<double, plist_get_real_val>(node);
     case PLIST_STRING:

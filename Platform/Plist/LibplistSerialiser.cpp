@@ -7,6 +7,7 @@
 
 #include "Platform/Plist/BinaryGuard.h"
 #include "Platform/Plist/LibplistNode.h"
+#include "Platform/Plist/XmlEmptyKeys.h"
 #include "Platform/Plist/XmlGuard.h"
 
 namespace kelvasi {
@@ -29,17 +30,40 @@ class PlainLocale {
   locale_t previous_;
 };
 
-LibplistNode nodeFrom(std::span<const std::uint8_t> bytes) {
-  constexpr std::string_view byteOrderMark = "\xef\xbb\xbf";
-  std::string_view text(reinterpret_cast<const char*>(bytes.data()), bytes.size());
+using Reader = void (*)(const char* document, std::uint32_t size, plist_t* node);
+
+// A peer may pad what it sends to a size that it likes.
+bool isPadding(char character) {
+  return std::string_view("\0 \t\r\n", 5).find(character) != std::string_view::npos;
+}
+
+LibplistNode read(Reader reader, std::string_view document) {
   plist_t node = nullptr;
-  if (isSafeBinaryPlist(bytes)) {
-    plist_from_bin(text.data(), static_cast<std::uint32_t>(text.size()), &node);
-    return LibplistNode(node);
-  }
-  if (text.starts_with(byteOrderMark)) text.remove_prefix(byteOrderMark.size());
-  if (isSafeXmlPlist(text)) plist_from_xml(text.data(), static_cast<std::uint32_t>(text.size()), &node);
+  reader(document.data(), static_cast<std::uint32_t>(document.size()), &node);
   return LibplistNode(node);
+}
+
+// What ends a binary document may look like padding: it is the longest that will do.
+LibplistNode nodeFromBinary(std::string_view document) {
+  while (!isSafeBinaryPlist({reinterpret_cast<const std::uint8_t*>(document.data()), document.size()})) {
+    if (document.empty() || !isPadding(document.back())) return nullptr;
+    document.remove_suffix(1);
+  }
+  return read(plist_from_bin, document);
+}
+
+LibplistNode nodeFromXml(std::string_view document) {
+  constexpr std::string_view byteOrderMark = "\xef\xbb\xbf";
+  if (document.starts_with(byteOrderMark)) document.remove_prefix(byteOrderMark.size());
+  while (!document.empty() && isPadding(document.back())) document.remove_suffix(1);
+  if (!isSafeXmlPlist(document)) return nullptr;
+  if (mayHaveEmptyKeys(document)) return read(plist_from_xml, withEmptyKeysOpened(document));
+  return read(plist_from_xml, document);
+}
+
+LibplistNode nodeFrom(std::span<const std::uint8_t> bytes) {
+  const std::string_view document(reinterpret_cast<const char*>(bytes.data()), bytes.size());
+  return document.starts_with(binaryPlistMagic) ? nodeFromBinary(document) : nodeFromXml(document);
 }
 
 // A reader would take a bare carriage return for a line feed (XML 1.0, section 2.11).

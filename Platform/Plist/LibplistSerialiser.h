@@ -12,7 +12,7 @@ namespace kelvasi {
 // Reading. The document is checked as a whole before the library sees it: its bounds are those of
 // PlistLimits.h, XmlGuard.h and BinaryGuard.h say what else is refused. In what is accepted
 // - texts are UTF-8 without NUL;
-// - an integer from 2^63 to 2^64 - 1 keeps its 64 bits and so reads as a negative number;
+// - NUL bytes and white space behind the document are no part of it, as a peer may pad what it sends;
 // - of the entries with one key the last stands, at the place of the first;
 // - a date keeps its fraction of a second, which only the binary format has.
 //

@@ -1,5 +1,6 @@
 #include <chrono>
 #include <cmath>
+#include <string>
 
 #include "Platform/Plist/Allowance.h"
 #include "Platform/Plist/LibplistNode.h"
@@ -37,6 +38,14 @@ LibplistNode dateNode(PlistDate date) {
   return dateToLibplist({whole});
 }
 
+// The library's own call makes a negative number of it.
+LibplistNode unsignedNode(std::uint64_t number) {
+  const std::string document = "<plist><integer>" + std::to_string(number) + "</integer></plist>";
+  plist_t node = nullptr;
+  plist_from_xml(document.data(), static_cast<std::uint32_t>(document.size()), &node);
+  return LibplistNode(node);
+}
+
 LibplistNode Writer::value(const PlistValue& value, int level) {
   if (!allowance_.takeValues(1)) return nullptr;
   const PlistArray* elements = value.array();
@@ -55,6 +64,7 @@ LibplistNode Writer::scalar(const PlistValue& value) {
   if (const auto* integer = value.integer()) {
     return LibplistNode(plist_new_uint(static_cast<std::uint64_t>(*integer)));
   }
+  if (const auto* integer = value.unsignedInteger()) return unsignedNode(*integer);
   return nullptr;
 }
 

@@ -96,7 +96,8 @@ bool Guard::dictionary(int level) {
   for (std::size_t entries = 0; entries <= plistLimits::dictionaryEntries; ++entries) {
     const XmlToken key = nextTag();
     if (isEndOf(key, "dict")) return true;
-    if (key.kind != Kind::startTag || key.text != keyRule.name || !key.attributes.empty()) return false;
+    const bool isTag = key.kind == Kind::startTag || key.kind == Kind::emptyTag;
+    if (!isTag || key.text != keyRule.name || !key.attributes.empty()) return false;
     if (!allowance_.takeValues(1) || !scalar(key, keyRule) || !value(nextTag(), level)) return false;
   }
   return false;

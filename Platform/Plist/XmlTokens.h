@@ -29,6 +29,8 @@ class XmlTokens {
   explicit XmlTokens(std::string_view document) : rest_(document) {}
   // After `end` or `malformed` it stays at that.
   XmlToken next();
+  // The document from the next token on.
+  std::string_view rest() const { return rest_; }
 
  private:
   XmlToken markup();

@@ -22,6 +22,7 @@ TEST(Description, OfADateNoCalendarReachesIsTheCalendarsEnd) {
 TEST(Description, OfScalars) {
   EXPECT_EQ(description(PlistValue("as it stands; even so")), "as it stands; even so");
   EXPECT_EQ(description(PlistValue(-5)), "-5");
+  EXPECT_EQ(description(PlistValue(~std::uint64_t{0})), "18446744073709551615");
   EXPECT_EQ(description(PlistValue(0.25)), "0.25");
   EXPECT_EQ(description(PlistValue(true)), "1");
   EXPECT_EQ(description(PlistValue(Bytes{1, 2, 3, 4, 0xff})), "<01020304 ff>");

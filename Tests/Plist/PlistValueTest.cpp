@@ -24,6 +24,15 @@ TEST(PlistValue, KnowsItsKind) {
   EXPECT_EQ(PlistValue("1").dictionary(), nullptr);
 }
 
+TEST(PlistValue, IntegersBeyondTheSignedOnesAreAKindOfTheirOwn) {
+  constexpr std::uint64_t first = std::uint64_t{1} << 63;
+  EXPECT_EQ(*PlistValue(first).unsignedInteger(), first);
+  EXPECT_EQ(PlistValue(first).integer(), nullptr);
+  EXPECT_EQ(*PlistValue(first - 1).integer(), 9223372036854775807);
+  EXPECT_EQ(PlistValue(first - 1).unsignedInteger(), nullptr);
+  EXPECT_NE(PlistValue(~std::uint64_t{0}), PlistValue(-1));
+}
+
 TEST(PlistValue, NullContainersAreAbsent) {
   EXPECT_TRUE(PlistValue(PlistValue::Dictionary()).isAbsent());
   EXPECT_TRUE(PlistValue(PlistValue::Array()).isAbsent());

@@ -19,6 +19,8 @@ TEST(CellNumber, IsAnIntegerOf32BitsWithSign) {
   EXPECT_EQ(numberOf(std::int64_t{-2147483648}), Number(std::numeric_limits<std::int32_t>::min()));
   EXPECT_EQ(numberOf(std::int64_t{2147483648}), Number());
   EXPECT_EQ(numberOf(std::int64_t{-2147483649}), Number());
+  EXPECT_EQ(numberOf(std::uint64_t{1} << 63), Number());
+  EXPECT_EQ(numberOf(~std::uint64_t{0}), Number());
 }
 
 TEST(CellNumber, MayBeARealThatIsWhole) {

@@ -26,6 +26,7 @@ TEST(DisplayJson, KeepsTheOrderOfKeys) {
 TEST(DisplayJson, TellsIntegersFromReals) {
   EXPECT_EQ(json(PlistArray::make({1, -1, 1.0, 0.5, 1e20, std::numeric_limits<std::int64_t>::min()})),
             "[1,-1,1.0,0.5,1e+20,-9223372036854775808]");
+  EXPECT_EQ(json(PlistArray::make({~std::uint64_t{0}})), "[18446744073709551615]");
 }
 
 TEST(DisplayJson, WritesRealsThatJsonCannotHoldAsTexts) {

@@ -38,6 +38,7 @@ Json toJson(const PlistValue& value) {
   if (const auto* entries = value.dictionary()) return object(*entries);
   if (const auto* elements = value.array()) return array(*elements);
   if (const auto* integer = value.integer()) return *integer;
+  if (const auto* integer = value.unsignedInteger()) return *integer;
   if (const auto* number = value.real()) return real(*number);
   if (const auto* flag = value.boolean()) return *flag;
   if (const auto* bytes = value.data()) return Json{{"$data", base64(*bytes)}};

@@ -9,6 +9,8 @@
 namespace kelvasi {
 namespace {
 
+using namespace std::string_literals;
+using namespace std::string_view_literals;
 using testing::BinaryDocument;
 using testing::bytesOf;
 using testing::canonical;
@@ -92,10 +94,77 @@ TEST(Parse, BinaryDatesKeepTheirFraction) {
   EXPECT_EQ(binary({0x33, 0x42, 0x4d, 0x62, 0xd2, 0x3c, 0x7f, 0x80, 0}), PlistValue(PlistDate{253402300799}));
 }
 
-TEST(Parse, IntegersBeyondTheSignedOnesKeepTheirBits) {
-  EXPECT_EQ(xml("<integer>18446744073709551615</integer>"), PlistValue(-1));
-  EXPECT_EQ(binary({0x14, 0, 0, 0, 0, 0, 0, 0, 0, 0x80, 0, 0, 0, 0, 0, 0, 0}),
-            PlistValue(std::numeric_limits<std::int64_t>::min()));
+TEST(Parse, IntegersBeyondTheSignedOnesAreUnsigned) {
+  constexpr std::uint64_t largest = std::numeric_limits<std::uint64_t>::max();
+  constexpr std::uint64_t first = std::uint64_t{1} << 63;
+  EXPECT_EQ(xml("<integer>18446744073709551615</integer>"), PlistValue(largest));
+  EXPECT_EQ(xml("<integer>9223372036854775808</integer>"), PlistValue(first));
+  EXPECT_EQ(xml("<integer>0xffffffffffffffff</integer>"), PlistValue(largest));
+  EXPECT_EQ(binary({0x14, 0, 0, 0, 0, 0, 0, 0, 0, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff}),
+            PlistValue(largest));
+  EXPECT_EQ(binary({0x14, 0, 0, 0, 0, 0, 0, 0, 0, 0x80, 0, 0, 0, 0, 0, 0, 0}), PlistValue(first));
+}
+
+TEST(Parse, IntegersUpToThemAreSigned) {
+  using Limits = std::numeric_limits<std::int64_t>;
+  EXPECT_EQ(xml("<integer>-1</integer>"), PlistValue(-1));
+  EXPECT_EQ(xml("<integer>9223372036854775807</integer>"), PlistValue(Limits::max()));
+  EXPECT_EQ(xml("<integer>-9223372036854775808</integer>"), PlistValue(Limits::min()));
+  EXPECT_EQ(binary({0x13, 0x80, 0, 0, 0, 0, 0, 0, 0}), PlistValue(Limits::min()));
+  EXPECT_EQ(binary({0x13, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff}), PlistValue(-1));
+  EXPECT_EQ(binary({0x14, 0, 0, 0, 0, 0, 0, 0, 0, 0x7f, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff, 0xff}),
+            PlistValue(Limits::max()));
+}
+
+TEST(Parse, PaddingBehindAnXmlDocumentIsForgiven) {
+  const std::string document = xmlPlist("<true/>");
+  for (const std::string_view padding : {"\0"sv, "\0\0\0"sv, " "sv, "\n\n"sv, "\r\n\t \0\n\0"sv}) {
+    EXPECT_EQ(parse(bytesOf(document + std::string(padding))), PlistValue(true)) << padding.size();
+  }
+  EXPECT_EQ(parse(bytesOf(document + std::string(100'000, '\0'))), PlistValue(true));
+}
+
+TEST(Parse, PaddingBehindABinaryDocumentIsForgiven) {
+  const Bytes document = BinaryDocument().addText("hi").bytes();
+  for (const std::uint8_t padding : {'\0', ' ', '\n', '\r', '\t'}) {
+    Bytes padded = document;
+    for (int count = 1; count <= 40; ++count) {
+      padded.push_back(padding);
+      EXPECT_EQ(parse(padded), PlistValue("hi")) << count << " of " << unsigned{padding};
+    }
+  }
+}
+
+TEST(Parse, NothingElseBehindADocumentIsForgiven) {
+  const std::string document = xmlPlist("<true/>");
+  for (const std::string_view rest :
+       {"x"sv, "\0x"sv, "\xff"sv, "\x01"sv, "\f"sv, "\v"sv, "<"sv, "\0<true/>"sv}) {
+    EXPECT_EQ(parse(bytesOf(document + std::string(rest))), std::nullopt) << rest.size();
+  }
+  Bytes binary = BinaryDocument().addText("hi").bytes();
+  binary.push_back('x');
+  EXPECT_EQ(parse(binary), std::nullopt);
+}
+
+TEST(Parse, PaddingElsewhereIsNotForgiven) {
+  EXPECT_EQ(parse(bytesOf("\0"s + xmlPlist("<true/>"))), std::nullopt);
+  EXPECT_EQ(parse(bytesOf("<plist><true/>\0</plist>"s)), std::nullopt);
+  EXPECT_EQ(parse(bytesOf("<plist><string>a\0</string></plist>"s)), std::nullopt);
+  EXPECT_EQ(parse(bytesOf("<plist>\0\0"s)), std::nullopt);
+  EXPECT_EQ(parse(bytesOf(std::string(1000, '\0'))), std::nullopt);
+}
+
+TEST(Parse, AnEmptyKeyMayBeAnEmptyTag) {
+  EXPECT_EQ(canonical(xml("<dict><key/><true/><key>a</key><string>b</string></dict>")), "{s=true,s61=s62,}");
+  EXPECT_EQ(canonical(xml("<array><dict><key /><dict><key\n/><string/></dict></dict></array>")),
+            "[{s={s=s,},},]");
+  EXPECT_EQ(canonical(xml("<dict><key/><true/><key></key><false/></dict>")), "{s=false,}");
+}
+
+TEST(Parse, WhatLooksLikeAnEmptyKeyInATextIsText) {
+  EXPECT_EQ(xml("<string><![CDATA[<key/>]]></string>"), PlistValue("<key/>"));
+  EXPECT_EQ(xml("<string>&lt;key/><!-- <key/> --></string>"), PlistValue("<key/>"));
+  EXPECT_EQ(canonical(xml("<dict><key/><string><![CDATA[<key/>]]></string></dict>")), "{s=s3c6b65792f3e,}");
 }
 
 TEST(Parse, BinaryContainersShareTheirObjects) {

@@ -71,8 +71,19 @@ PlistValue PlistSamples::dictionary(int levels) {
   return result;
 }
 
-PlistValue PlistSamples::value(int levels) {
+PlistValue PlistSamples::integer() {
   constexpr std::int64_t farAway = std::numeric_limits<std::int64_t>::max();
+  switch (number(0, 3)) {
+    case 0:
+      return number(-farAway - 1, farAway);
+    case 1:
+      return static_cast<std::uint64_t>(number(0, farAway)) + static_cast<std::uint64_t>(farAway);
+    default:
+      return number(-300, 300);
+  }
+}
+
+PlistValue PlistSamples::value(int levels) {
   switch (number(levels > 0 ? 0 : 4, 10)) {
     case 0:
     case 1:
@@ -89,7 +100,7 @@ PlistValue PlistSamples::value(int levels) {
     case 7:
       return PlistDate{static_cast<double>(number(-30'610'224'000, 253'402'300'799))};
     case 8:
-      return number(0, 1) == 1 ? number(-farAway - 1, farAway) : number(-300, 300);
+      return integer();
     default:
       return text();
   }
@@ -98,6 +109,7 @@ PlistValue PlistSamples::value(int levels) {
 std::string canonical(const PlistValue& value) {
   if (const auto* text = value.string()) return "s" + hexadecimal(bytesOf(*text));
   if (const auto* integer = value.integer()) return "i" + std::to_string(*integer);
+  if (const auto* integer = value.unsignedInteger()) return "i" + std::to_string(*integer);
   if (const auto* real = value.real()) return "r" + bits(*real);
   if (const auto* flag = value.boolean()) return *flag ? "true" : "false";
   if (const auto* date = value.date()) return "t" + bits(date->secondsSince1970);

@@ -21,6 +21,7 @@ class PlistSamples {
 
  private:
   std::int64_t number(std::int64_t least, std::int64_t most);
+  PlistValue integer();
   std::string text();
   Bytes bytes();
   double real();

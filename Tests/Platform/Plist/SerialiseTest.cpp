@@ -107,6 +107,9 @@ TEST(Serialise, IntegersFromEndToEnd) {
                                      std::int64_t{0}, std::numeric_limits<std::int64_t>::max()}) {
     EXPECT_EQ(again(integer), PlistValue(integer));
   }
+  for (const std::uint64_t integer : {std::uint64_t{1} << 63, ~std::uint64_t{0}}) {
+    EXPECT_EQ(again(integer), PlistValue(integer));
+  }
 }
 
 TEST(Serialise, DatesLoseTheirFractionDownwards) {

@@ -49,12 +49,27 @@ TEST(XmlGuard, RefusesWhatIsNoPlistDocument) {
 }
 
 TEST(XmlGuard, RefusesElementsOutOfPlace) {
-  for (const char* body :
-       {"<unknown/>", "<key>a</key>", "<array><key>a</key></array>", "<dict><string>a</string></dict>",
-        "<dict><key>a</key></dict>", "<dict><key>a</key><key>b</key></dict>", "<dict><key/><true/></dict>",
-        "<array></dict>", "<array><true/></array></array>", "<array>text</array>", "<string><true/></string>",
-        "<integer>1<!-- c --></integer>", "<integer><![CDATA[1]]></integer>", "<true>x</true>", "<integer/>",
-        "<true a=\"b\"/>", "<?pi?><true/>", "<array><![CDATA[]]></array>", "<array><?pi?></array>"}) {
+  for (const char* body : {"<unknown/>",
+                           "<key>a</key>",
+                           "<array><key>a</key></array>",
+                           "<dict><string>a</string></dict>",
+                           "<dict><key>a</key></dict>",
+                           "<dict><key>a</key><key>b</key></dict>",
+                           "<dict><key/></dict>",
+                           "<key/>",
+                           "<dict><key a=\"b\"/><true/></dict>",
+                           "<array></dict>",
+                           "<array><true/></array></array>",
+                           "<array>text</array>",
+                           "<string><true/></string>",
+                           "<integer>1<!-- c --></integer>",
+                           "<integer><![CDATA[1]]></integer>",
+                           "<true>x</true>",
+                           "<integer/>",
+                           "<true a=\"b\"/>",
+                           "<?pi?><true/>",
+                           "<array><![CDATA[]]></array>",
+                           "<array><?pi?></array>"}) {
     EXPECT_FALSE(isSafeXmlPlist(xmlPlist(body))) << body;
   }
 }
