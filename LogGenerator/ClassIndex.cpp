@@ -51,6 +51,10 @@ ClassIndex::~ClassIndex() {
   platform_.trace.writeLine("Deallocing ClassIndex");
 }
 
+void ClassIndex::unbindSections() {
+  for (const auto& decoder : decoders_) decoder->moveToSection({});
+}
+
 void ClassIndex::status() const {
   platform_.log.print(LogPriority::warning, "Dictionary = %d", 1);
   platform_.log.print(LogPriority::warning, "String = %d", 0);

@@ -47,6 +47,8 @@ class ClassIndex {
   // In order of registration; empty when nobody wants the code.
   std::span<Base* const> getSubscribers(LogCode logCode) const { return codeDictionary_.find(logCode); }
   std::vector<std::string> getAllLogCodes() const { return codeDictionary_.keys(); }
+  // From now on no decoder has anywhere to write.
+  void unbindSections();
   // A debugging aid: writes to the system log what kind of thing the class dictionary is.
   void status() const;
 

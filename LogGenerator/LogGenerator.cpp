@@ -52,6 +52,10 @@ PlistValue LogGenerator::getSaveContentsFromState(const PlistDictionary&) const 
   throw UnimplementedMethodError("LogGenerator::getSaveContentsFromState");
 }
 
+bool LogGenerator::ownsDisplay(const PlistDictionary&) const {
+  return true;
+}
+
 void LogGenerator::updateHistoryInState(PlistDictionary& state, const Clock& clock) {
   if (!state.get("History").array()) state.set("History", PlistArray::make());
   PlistArray& history = *state.get("History").array();

@@ -45,6 +45,10 @@ class LogGenerator {
   // The array that goes into a snapshot.
   virtual PlistValue getSaveContentsFromState(const PlistDictionary& state) const;
 
+  // Whether what the state shows is this generator's: made by it, or by one of the same technology before it.
+  // True while nothing is shown.
+  virtual bool ownsDisplay(const PlistDictionary& state) const;
+
   // Appends one history entry made of the state as it is, dropping the oldest past five. An entry ends before
   // the first of its keys that the state lacks.
   static void updateHistoryInState(PlistDictionary& state, const Clock& clock);

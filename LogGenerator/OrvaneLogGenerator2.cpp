@@ -6,6 +6,7 @@
 #include <utility>
 
 #include "LogGenerator/RecordFraming.h"
+#include "LogGenerator/TemplateShape.h"
 #include "Platform/PlistSerialiser.h"
 #include "Platform/Resources.h"
 #include "Platform/SystemLog.h"
@@ -23,7 +24,8 @@ PlistValue storable(PlistValue value) {
 }
 
 bool isSameContainer(const PlistValue& one, const PlistValue& other) {
-  return one.dictionary() == other.dictionary() && one.array() == other.array();
+  const bool isContainer = one.dictionary() || one.array();
+  return isContainer && one.dictionary() == other.dictionary() && one.array() == other.array();
 }
 
 // Logs ahead of what the base's construction logs.
@@ -96,11 +98,7 @@ PlistValue OrvaneLogGenerator2::getStartCommand() const {
 
 PlistValue OrvaneLogGenerator2::getDisplayFromState(PlistDictionary& state) {
   if (const PlistValue* display = state.find("Display")) {
-    if (!isSameContainer(*display, bound_)) {
-      const PlistValue* shape = state.find("Template");
-      bindSections(shape ? *shape : *display, *display);
-      bound_ = *display;
-    }
+    bindTo(state, *display);
     return *display;
   }
   if (!cIndex_ || !state.find("Template")) {
@@ -117,9 +115,26 @@ PlistValue OrvaneLogGenerator2::getDisplayFromState(PlistDictionary& state) {
   const PlistValue display = processTemplate(state.get("Template"));
   printDict(display);
   bound_ = display;
+  isOwn_ = true;
   state.set("Display", display);
   state.set("ExtraInfo", PlistDictionary::make());
   return {};
+}
+
+bool OrvaneLogGenerator2::ownsDisplay(const PlistDictionary& state) const {
+  const PlistValue* display = state.find("Display");
+  if (!display) return true;
+  if (isSameContainer(*display, bound_)) return isOwn_;
+  const PlistValue* displayTemplate = state.find("Template");
+  return displayTemplate && hasShapeOf(*displayTemplate, *display) && *displayTemplate == loadTemplate();
+}
+
+void OrvaneLogGenerator2::bindTo(const PlistDictionary& state, const PlistValue& display) {
+  if (isSameContainer(display, bound_)) return;
+  isOwn_ = ownsDisplay(state);
+  bound_ = display;
+  if (cIndex_) cIndex_->unbindSections();
+  if (isOwn_) bindSections(*state.find("Template"), display);
 }
 
 PlistValue OrvaneLogGenerator2::loadTemplate() const {

@@ -26,6 +26,8 @@ class OrvaneLogGenerator2 : public OrvaneLogGenerator {
   void updateState(PlistDictionary& state, std::span<const std::uint8_t> data) override;
   PlistValue generateLogUsingState(PlistDictionary& state) override;
   PlistValue getStartCommand() const override;
+  // A display is of this technology when the state's template is, by value, and the display has its shape.
+  bool ownsDisplay(const PlistDictionary& state) const override;
 
   // A mutable copy of a template, its sections bound to their decoders. Throws std::invalid_argument when a
   // dictionary or an array holds anything but strings, dictionaries and arrays.
@@ -33,19 +35,21 @@ class OrvaneLogGenerator2 : public OrvaneLogGenerator {
   // Complains in the system log about every element of a processed template that does not belong into one.
   void printDict(const PlistValue& object) const;
   // The state's display. The call that builds it returns nothing; every later one returns it. A display that
-  // the state already held, left there by another generator, stays as it is: the decoders are bound to those
-  // of its sections that are theirs, and the others have nowhere to write.
+  // the state already held, left there by another generator, stays as it is: the decoders are bound to its
+  // sections when it is of this technology, and otherwise have nowhere to write.
   PlistValue getDisplayFromState(PlistDictionary& state);
 
  private:
   PlistValue loadTemplate() const;
-  // Binds the decoders to the sections of a display that stands, as far as it has the template's shape. What
-  // decoders added to it is not looked into.
+  void bindTo(const PlistDictionary& state, const PlistValue& display);
+  // Binds the decoders to the sections of a display of this template. What decoders added to it is not looked
+  // into.
   void bindSections(const PlistValue& displayTemplate, const PlistValue& display);
 
   std::string pListName_;
   std::unique_ptr<ClassIndex> cIndex_;  // null without template
-  PlistValue bound_;                    // the display that the decoders write into
+  PlistValue bound_;                    // the display last seen
+  bool isOwn_ = false;                  // the decoders write into it
 };
 
 }  // namespace kelvasi

@@ -1,5 +1,9 @@
 #include "Model/KelvasiModel.h"
 
+#include <utility>
+
+#include "Platform/SystemLog.h"
+
 namespace kelvasi {
 
 KelvasiModel::KelvasiModel(const Platform& platform, const LinkPlatform& link,
@@ -35,7 +39,17 @@ NodeRef KelvasiModel::topLevelNodes() {
   const PlistValue display = logGenerator_->generateLogUsingState(*state_);
   nodesByPath_.clear();
   nodes_ = KelvasiModelNode::makeTreeFromObject(display, nodesByPath_);
+  lookWhoseDisplayItIs();
   return nodes_;
+}
+
+// Told once each time that it becomes so.
+void KelvasiModel::lookWhoseDisplayItIs() {
+  const bool wasAnother = std::exchange(showsAnotherTechnology_, !logGenerator_->ownsDisplay(*state_));
+  if (showsAnotherTechnology_ && !wasAnother)
+    platform_.log.print(
+        LogPriority::notice,
+        "The display is that of another technology than the daemon's, and stays until a new start");
 }
 
 NodeRef KelvasiModel::nodeAtPath(const std::string& path) {

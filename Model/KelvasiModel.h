@@ -58,6 +58,9 @@ class KelvasiModel {
   // The generator's state; its keys are those of LogGenerator.
   const PlistDictionary& state() const { return *state_; }
   const LogGenerator* logGenerator() const { return logGenerator_.get(); }
+  // Whether the tree last built shows what a generator of another technology has left. A session's records
+  // have nowhere to go then.
+  bool showsAnotherTechnology() const { return showsAnotherTechnology_; }
 
  private:
   void retryMonitor();
@@ -65,6 +68,7 @@ class KelvasiModel {
   std::optional<Bytes> askForTechnology();
   bool sendStartCommand();
   void portWasInvalidated(const void* port);
+  void lookWhoseDisplayItIs();
   // A task that does nothing once the model is gone.
   Task whileAlive(std::function<void()> task) const;
 
@@ -80,7 +84,8 @@ class KelvasiModel {
   bool updated_ = false;                       // data arrived since the last tick that consumed it
   std::unique_ptr<LogGenerator> logGenerator_;
   PlistValue::Dictionary state_ = PlistDictionary::make();  // survives reconnections and changes of generator
-  NodeRef nodes_;                                           // set and dropped together with its index
+  bool showsAnotherTechnology_ = false;
+  NodeRef nodes_;  // set and dropped together with its index
   PathDictionary nodesByPath_;
 
   std::shared_ptr<const bool> alive_ = std::make_shared<const bool>(true);

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 
+#include "LogGenerator/C2K/C2KLookup.h"
 #include "LogGenerator/C2K/C2KRecords.h"
 #include "LogGenerator/C2K/DeviceStatus.h"
 #include "LogGenerator/C2K/EvdoActiveSet.h"
@@ -53,10 +54,21 @@ std::unique_ptr<LogGenerator> C2KLogGenerator::generator(const Platform& platfor
 }
 
 void C2KLogGenerator::updateState(PlistDictionary& state, std::span<const std::uint8_t> data) {
-  getDisplayFromState(state, platform());
-  const PlistValue lookup = state.get("Lookup");
+  const PlistValue display = getDisplayFromState(state, platform());
+  if (!display.dictionary() || display.dictionary() != seen_.dictionary()) {
+    isOwn_ = ownsDisplay(state);
+    seen_ = display;
+  }
+  const PlistValue lookup = isOwn_ ? state.get("Lookup") : PlistValue();
   if (lookup.dictionary()) return updateFromLog(data, *lookup.dictionary(), state);
   updateFromLog(data, PlistDictionary(), state);
+}
+
+bool C2KLogGenerator::ownsDisplay(const PlistDictionary& state) const {
+  const PlistValue* display = state.find("Display");
+  const PlistValue* lookup = state.find("Lookup");
+  if (!display) return true;
+  return lookup && lookup->dictionary() && leadsInto(*display, *lookup->dictionary());
 }
 
 void C2KLogGenerator::updateFromLog(std::span<const std::uint8_t> data, const PlistDictionary& lookup,

@@ -19,6 +19,9 @@ class C2KLogGenerator : public OrvaneLogGenerator {
   void updateState(PlistDictionary& state, std::span<const std::uint8_t> data) override;
   PlistValue generateLogUsingState(PlistDictionary& state) override;
   PlistValue getStartCommand() const override;
+  // A display is of this technology when all leaves of the state's lookup table are in it. Into another's
+  // display nothing is written.
+  bool ownsDisplay(const PlistDictionary& state) const override;
 
   // Frames a message and hands the record to its parser. A record of a known code is kept, without the
   // prefix, for the raw log, whatever its parser made of it.
@@ -33,6 +36,10 @@ class C2KLogGenerator : public OrvaneLogGenerator {
   // entries ("key" and "dict") of the leaves that it fills, in the order of the walk.
   static void processTemplate(const PlistDictionary& displayTemplate, const PlistValue& display,
                               PlistDictionary& lookup, SystemLog& log);
+
+ private:
+  PlistValue seen_;  // the display last looked at
+  bool isOwn_ = false;
 };
 
 }  // namespace kelvasi

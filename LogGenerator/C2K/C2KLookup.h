@@ -12,4 +12,7 @@ namespace kelvasi {
 // not whole ends the name's turn.
 void setByLookup(std::string_view name, const PlistValue& value, const PlistDictionary& lookup);
 
+// Whether every leaf that the lookup table knows is in a dictionary of this display.
+bool leadsInto(const PlistValue& display, const PlistDictionary& lookup);
+
 }  // namespace kelvasi

@@ -49,6 +49,12 @@ PlistValue GSMLogGenerator::getStartCommand() const {
   return PlistDictionary::make({{"SetState", "Streaming"}});
 }
 
+// The Orvane generators keep raw messages there, or nothing before their first tick.
+bool GSMLogGenerator::ownsDisplay(const PlistDictionary& state) const {
+  const PlistValue* message = state.find("DisplayState");
+  return !state.find("Display") || (message && !message->data());
+}
+
 PlistValue GSMLogGenerator::getSaveContentsFromState(const PlistDictionary& state) const {
   const PlistValue history = state.get("History");
   return history.array() ? history.shallowCopy() : PlistArray::make();

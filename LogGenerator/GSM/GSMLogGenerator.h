@@ -17,6 +17,8 @@ class GSMLogGenerator : public LogGenerator {
   void updateState(PlistDictionary& state, std::span<const std::uint8_t> data) override;
   PlistValue generateLogUsingState(PlistDictionary& state) override;
   PlistValue getStartCommand() const override;
+  // A display is this technology's once it was made from a message.
+  bool ownsDisplay(const PlistDictionary& state) const override;
   PlistValue getSaveContentsFromState(const PlistDictionary& state) const override;
 
   // A copy in which every dictionary with one entry, below the top, is replaced by that entry's value, one

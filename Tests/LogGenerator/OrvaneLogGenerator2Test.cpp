@@ -56,6 +56,13 @@ PlistValue displayWith(PlistValue rows) {
   return PlistDictionary::make({{"Recorded", std::move(rows)}, {"Label", "text"}});
 }
 
+TEST(OrvaneLogGenerator2, OwnsTheDisplayThatItMakes) {
+  Fixture fixture(simpleTemplate());
+  EXPECT_TRUE(fixture.generator.ownsDisplay(fixture.state));
+  fixture.take(record(0xB0C0, "", 20));
+  EXPECT_TRUE(fixture.generator.ownsDisplay(fixture.state));
+}
+
 TEST(OrvaneLogGenerator2, TheFirstTickWithoutAMessageReturnsNothingTheSecondTheDisplay) {
   Fixture fixture(simpleTemplate());
   EXPECT_TRUE(fixture.tick().isAbsent());
@@ -213,7 +220,11 @@ TEST(OrvaneLogGenerator2, ANewStateBuildsANewDisplayAndBindsTheDecodersToIt) {
 
 // Another generator for a state that has been filled before, as after a reconnection.
 struct Successor {
-  explicit Successor(Fixture& before) : state(before.state) { surroundings.log.clear(); }
+  explicit Successor(Fixture& before) : Successor(before, before.state.get("Template")) {}
+  Successor(Fixture& before, PlistValue displayTemplate) : state(before.state) {
+    surroundings.log.clear();
+    surroundings.resources.files["T.plist"] = surroundings.plists.standFor(std::move(displayTemplate));
+  }
   void take(const Bytes& message) { generator.updateState(state, message); }
   PlistValue tick() { return generator.generateLogUsingState(state); }
 
@@ -272,24 +283,79 @@ TEST(OrvaneLogGenerator2, RowsThatADecoderAddedAreNotTakenForSections) {
   EXPECT_TRUE(entry.dictionary()->get("Recorded").dictionary()->empty());
 }
 
-TEST(OrvaneLogGenerator2, ADisplayOfAnotherTechnologyStaysAndTheSectionsThatItLacksAreUnbound) {
-  Fixture before(PlistDictionary::make({{"Other", PlistDictionary::make({{"row", "text"}})}}));
-  before.tick();
-  Successor after(before);
-  after.surroundings.resources.files["T.plist"] = after.surroundings.plists.standFor(simpleTemplate());
-  after.take(record(0xB0C0, "", 20));
-  EXPECT_EQ(after.tick(),
-            PlistValue(PlistDictionary::make({{"Other", PlistDictionary::make({{"row", "text"}})}})));
-  EXPECT_THAT(after.surroundings.log.errors(), IsEmpty());
+// Of another technology, though it has a section of the same name.
+PlistValue otherTemplate() {
+  return PlistDictionary::make({{"Recorded", PlistDictionary::make({{"45248", "of before"}})}});
 }
 
-TEST(OrvaneLogGenerator2, ADisplayWithoutATemplateIsWalkedItself) {
-  Fixture fixture{PlistValue()};
+TEST(OrvaneLogGenerator2, ADisplayOfAnotherTechnologyStaysAndIsNotWrittenInto) {
+  Fixture before(otherTemplate());
+  before.tick();
+  const PlistValue display = before.tick();
+  Successor after(before, simpleTemplate());
+  EXPECT_FALSE(after.generator.ownsDisplay(after.state));
+  after.take(record(0xB0C0, "", 20));
+  EXPECT_EQ(after.tick(), otherTemplate());
+  EXPECT_EQ(after.tick().dictionary(), display.dictionary());
+  EXPECT_FALSE(after.generator.ownsDisplay(after.state));
+  EXPECT_THAT(after.surroundings.log.errors(), IsEmpty());
+  EXPECT_THAT(after.surroundings.log.warnings(), IsEmpty());
+}
+
+TEST(OrvaneLogGenerator2, HistoryEntriesOfAnotherTechnologyAreNotRewritten) {
+  Fixture before(otherTemplate());
+  before.tick();
+  before.tick();
+  Successor after(before, simpleTemplate());
+  after.take(record(0xB0C0, "", 20));
+  after.tick();
+  const PlistArray& history = *after.state.find("History")->array();
+  for (std::size_t place = 0; place < history.size(); ++place)
+    EXPECT_EQ(history.at(place).dictionary()->get("Display"), otherTemplate()) << place;
+}
+
+TEST(OrvaneLogGenerator2, TheFirstTechnologysGeneratorWritesIntoItsDisplayAgain) {
+  Fixture before(otherTemplate());
+  before.tick();
+  Successor other(before, simpleTemplate());
+  other.take(record(0xB0C0, "", 20));
+  Successor again(before, otherTemplate());
+  EXPECT_TRUE(again.generator.ownsDisplay(again.state));
+  again.take(record(0xB0C0, "", 21));
+  EXPECT_EQ(again.tick().dictionary()->get("Recorded"), PlistValue(PlistDictionary::make({{"45248", "21"}})));
+}
+
+TEST(OrvaneLogGenerator2, ADisplayThatAnObjectStreamPutThereIsNotWrittenInto) {
+  Fixture before(simpleTemplate());
+  before.tick();
+  const PlistValue display =
+      PlistDictionary::make({{"Network", PlistDictionary::make({{"Cell", "1"}, {"Channel", "2"}})}});
+  before.state.set("Display", display);
+  Successor after(before);
+  after.take(record(0xB0C0, "", 20));
+  EXPECT_EQ(after.tick().dictionary(), display.dictionary());
+  EXPECT_EQ(after.tick().dictionary()->size(), 1u);
+  EXPECT_FALSE(after.generator.ownsDisplay(after.state));
+}
+
+TEST(OrvaneLogGenerator2, AGeneratorThatMeetsAnotherTechnologysStateLeavesItsOwnDisplayAlone) {
+  Fixture fixture(simpleTemplate());
+  fixture.take(record(0xB0C0, "", 20));
+  PlistDictionary other{{"Template", otherTemplate()}, {"Display", otherTemplate()}};
+  fixture.generator.updateState(other, record(0xB0C0, "", 21));
+  EXPECT_EQ(*fixture.state.find("Display"), displayWith(PlistDictionary::make({{"45248", "20"}})));
+  fixture.take(record(0xB0C0, "", 22));
+  EXPECT_EQ(*fixture.state.find("Display"), displayWith(PlistDictionary::make({{"45248", "22"}})));
+}
+
+TEST(OrvaneLogGenerator2, ADisplayWithoutATemplateIsAnothers) {
+  Fixture fixture(simpleTemplate());
   const auto rows = PlistDictionary::make();
   fixture.state.set("Display",
                     PlistDictionary::make({{"A", PlistArray::make({"text"})}, {"Recorded", rows}}));
   fixture.take(record(0xB0C0, "", 20));
-  EXPECT_EQ(PlistValue(rows), PlistValue(PlistDictionary::make({{"45248", "20"}})));
+  EXPECT_TRUE(rows->empty());
+  EXPECT_FALSE(fixture.generator.ownsDisplay(fixture.state));
 }
 
 TEST(OrvaneLogGenerator2, ADisplayThatIsATextStays) {
@@ -297,6 +363,7 @@ TEST(OrvaneLogGenerator2, ADisplayThatIsATextStays) {
   fixture.state.set("Display", "text");
   fixture.take(record(0xB0C0, "", 20));
   EXPECT_EQ(fixture.tick(), PlistValue("text"));
+  EXPECT_FALSE(fixture.generator.ownsDisplay(fixture.state));
 }
 
 TEST(OrvaneLogGenerator2, BuildingTheDisplayNamesIndexAndGeneratorThenTheIndexsStatus) {

@@ -297,6 +297,49 @@ TEST_F(Session, AfterAChangeOfTechnologyTheOldDisplayStays) {
   EXPECT_EQ(model.topLevelNodes()->childNodes()->size(), 2u);
 }
 
+constexpr const char* otherTechnology =
+    "The display is that of another technology than the daemon's, and stays until a new start";
+
+// The daemon comes back with another technology, whose template has a section of the same name and kind.
+TEST_F(Session, AfterAChangeOfTechnologyNothingIsMixedAndTheLogSaysSoOnce) {
+  surroundings.log.isMasked = false;
+  resources.files["Orvane_GSM.plist"] =
+      plists.standFor(PlistDictionary::make({{"Process CO", PlistDictionary::make()},
+                                             {"RRC Info", PlistDictionary::make({{"State", "of before"}})}}));
+  model.startMonitor();
+  link.receive(0, test::record(0x7131, "13", 16));
+  queue.advance(2s);
+  EXPECT_FALSE(model.showsAnotherTechnology());
+  answerTechnology(kTelvonLogChannelTechnology_Orvane_UTRAN2);
+  resources.files["UTRAN.plist"] =
+      plists.standFor(PlistDictionary::make({{"RRC Info", PlistDictionary::make()}}));
+  *link.remoteValid = false;
+  queue.advance(2s);
+  for (int tick = 0; tick < 3; ++tick) {
+    link.receive(0, test::record(0xD0E0, "", 40));
+    queue.advance(2s);
+    EXPECT_EQ(*model.nodeAtPath("/RRC Info/State")->value(), "of before");
+  }
+  EXPECT_TRUE(model.showsAnotherTechnology());
+  EXPECT_THAT(surroundings.log.lines(LogPriority::notice), ElementsAre(otherTechnology));
+}
+
+TEST_F(Session, ADisplayOfTheFirstTechnologyMovesOnWhenThatComesBack) {
+  surroundings.log.isMasked = false;
+  model.startMonitor();
+  link.receive(0, test::record(0x7131, "13", 16));
+  for (const auto technology : {kTelvonLogChannelTechnology_IFX, kTelvonLogChannelTechnology_Orvane_GSM}) {
+    answerTechnology(technology);
+    *link.remoteValid = false;
+    queue.advance(2s);
+    EXPECT_EQ(*model.nodeAtPath("/Process CO/MM State")->value(), "MM_IDLE");
+  }
+  link.receive(0, test::record(0x7131, "06", 16));
+  queue.advance(2s);
+  EXPECT_EQ(*model.nodeAtPath("/Process CO/MM State")->value(), "MM_CONNECTION_ACTIVE");
+  EXPECT_FALSE(model.showsAnotherTechnology());
+}
+
 TEST_F(Session, RestartsWhenTheReceivePortIsInvalidatedFromOutside) {
   model.startMonitor();
   link.localPort->invalidate();

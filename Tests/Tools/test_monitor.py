@@ -7,7 +7,7 @@ import signal
 import unittest
 
 from live_support import PATIENCE, LiveTest
-from support import GMM_REGISTERED, MM_IDLE, pcap
+from support import GMM_REGISTERED, MM_IDLE, pcap, record
 
 
 class Monitor(LiveTest):
@@ -48,6 +48,20 @@ class Monitor(LiveTest):
         display = json.loads(monitor.stdout.readline())["display"]
         self.assertEqual(display["Process CS"]["MM State"], "MM_IDLE")
         self.assertEqual(display["Process PS"]["MM State"], "GMM_REGISTERED")
+
+    def test_a_display_of_another_technology_stays_and_is_said_to_be_it(self):
+        daemon = self.replay(MM_IDLE)
+        monitor = self.start_live("monitor", "--format", "json", "--log-stderr")
+        first = json.loads(monitor.stdout.readline())["display"]
+        daemon.kill()
+        daemon.wait()
+        measured = record(0xB17F, bytes(40))
+        self.start_daemon("--replay", self.write("lte.pcap", pcap(measured)), technology="Orvane_LTE")
+        self.assertEqual(json.loads(monitor.stdout.readline())["display"], first)
+        status, _, error = self.end(monitor)
+        self.assertEqual(status, 0)
+        self.assertEqual(error.count("kelvasictl: the daemon's technology has changed; "), 1, error)
+        self.assertEqual(error.count("<5>The display is that of another technology than the daemon's"), 1, error)
 
     def test_a_signal_ends_it_well(self):
         for number in (signal.SIGINT, signal.SIGTERM):

@@ -2,6 +2,7 @@
 #include <unistd.h>
 
 #include <CLI/CLI.hpp>
+#include <utility>
 
 #include "Platform/Clock.h"
 #include "Tools/Kelvasictl/DisplayJson.h"
@@ -66,6 +67,7 @@ class MonitorVerb {
     if (!root) return;
     try {
       status_.show(true);
+      tellWhoseDisplayItIs();
       if (options_.format == "json") {
         const double now = session_.clock().now().secondsSince1970;
         printOut(tickJson(now, session_.model().state().get("Display")));
@@ -78,7 +80,17 @@ class MonitorVerb {
     }
   }
 
+  // Once each time that it becomes so.
+  void tellWhoseDisplayItIs() {
+    const bool wasAnother = std::exchange(showsAnother_, session_.model().showsAnotherTechnology());
+    if (showsAnother_ && !wasAnother)
+      complain(
+          "the daemon's technology has changed; the display stays the one before until monitor is started "
+          "anew");
+  }
+
   const MonitorOptions& options_;
+  bool showsAnother_ = false;
   MonitorView view_;
   ConnectionStatus status_;
   LiveSession session_;

@@ -211,7 +211,25 @@ TEST(C2KLogGenerator, ADisplayOfAnotherTechnologyStaysAsItIs) {
   fixture.take(emptyActiveSet());
   EXPECT_EQ(fixture.text("kActiveSetPilots"), "not a leaf of the lookup");
   EXPECT_EQ(fixture.state.find("Lookup"), nullptr);
+  EXPECT_FALSE(fixture.generator.ownsDisplay(fixture.state));
   EXPECT_THAT(fixture.errors(), IsEmpty());
+}
+
+TEST(C2KLogGenerator, ALookupThatLeadsIntoAnotherDisplayIsNotWrittenBy) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  const PlistValue own = fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_TRUE(fixture.generator.ownsDisplay(fixture.state));
+  const PlistValue other = PlistDictionary::make({{"kActiveSetPilots", PlistDictionary::make()}});
+  fixture.state.set("Display", other);
+  EXPECT_FALSE(fixture.generator.ownsDisplay(fixture.state));
+  fixture.take(emptyActiveSet());
+  EXPECT_EQ(test::asText(own), "kActiveSetPilots=\n");
+  EXPECT_EQ(fixture.state.find("Display")->dictionary(), other.dictionary());
+  fixture.generator.generateLogUsingState(fixture.state);
+  EXPECT_EQ(*fixture.state.find("DisplayState")->data(), emptyActiveSet());
+  fixture.state.set("Display", own);
+  fixture.take(emptyActiveSet());
+  EXPECT_EQ(fixture.text("kActiveSetPilots"), "(none)");
 }
 
 TEST(C2KLogGenerator, WithoutATemplateRecordsAreKeptAndNothingIsShown) {

@@ -100,6 +100,17 @@ TEST(GSMLogGenerator, WithoutAMessageThereIsNoDisplay) {
   EXPECT_TRUE(stream.generator.generateLogUsingState(stream.state).isAbsent());
 }
 
+TEST(GSMLogGenerator, OwnsADisplayOnceAMessageMadeIt) {
+  Stream stream;
+  EXPECT_TRUE(stream.generator.ownsDisplay(stream.state));
+  stream.state.set("Display", one("Section", "of an Orvane technology"));
+  EXPECT_FALSE(stream.generator.ownsDisplay(stream.state));
+  stream.state.set("DisplayState", Bytes{1, 2});
+  EXPECT_FALSE(stream.generator.ownsDisplay(stream.state));
+  stream.take(one("A", "x"));
+  EXPECT_TRUE(stream.generator.ownsDisplay(stream.state));
+}
+
 TEST(GSMLogGenerator, SavesTheHistoryAlone) {
   Stream stream;
   EXPECT_TRUE(stream.generator.getSaveContentsFromState(stream.state).array()->empty());
