@@ -29,9 +29,8 @@ struct InputMessage : CapturedMessage {
 class CaptureInput {
  public:
   struct Choice {
-    std::vector<std::string> paths;  // as openCapture() takes them
-    std::optional<std::string>
-        technology;  // an identifier, for all captures; otherwise each capture's is found
+    std::vector<std::string> paths;         // as openCapture() takes them
+    std::optional<std::string> technology;  // an identifier; otherwise that of each capture is found
   };
   // Is given each line for people as it comes up, without a line feed: "FILE: ...".
   using Tell = std::function<void(const std::string& line)>;

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <string_view>
 #include <utility>
 
 #include "Capture/DlfReader.h"
@@ -16,12 +17,20 @@ namespace {
 
 constexpr std::array<std::uint8_t, 4> versionReportStart{0xA1, 0x00, 0xFD, 0x1F};
 
-bool isDlf(const std::string& path, InputBytes& input) {
+// Without what says how a file is packed.
+std::string_view bareName(std::string_view path) {
+  for (const std::string_view ending : {".gz", ".zst"}) {
+    if (path.ends_with(ending)) path.remove_suffix(ending.size());
+  }
+  return path;
+}
+
+bool isDlf(std::string_view path, InputBytes& input) {
   return path.ends_with(".dlf") ||
          std::ranges::equal(input.firstBytes(versionReportStart.size()), versionReportStart);
 }
 
-bool isSnapshot(const std::string& path, InputBytes& input) {
+bool isSnapshot(std::string_view path, InputBytes& input) {
   return path.ends_with(".kelvasi") || beginsAsPlist(input);
 }
 
@@ -49,8 +58,8 @@ void CaptureReader::skip(CaptureFault message) {
 
 std::unique_ptr<CaptureReader> openCapture(const std::string& path, const PlistSerialiser& plists) {
   auto input = std::make_unique<InputBytes>(path);
-  if (isDlf(path, *input)) return std::make_unique<DlfReader>(*input);
-  if (isSnapshot(path, *input)) return std::make_unique<SnapshotReader>(*input, plists);
+  if (isDlf(bareName(path), *input)) return std::make_unique<DlfReader>(*input);
+  if (isSnapshot(bareName(path), *input)) return std::make_unique<SnapshotReader>(*input, plists);
   return std::make_unique<PcapReader>(std::move(input));
 }
 

@@ -9,6 +9,7 @@
 #include <string>
 #include <vector>
 
+#include "Capture/CaptureFault.h"
 #include "Platform/PlistSerialiser.h"
 
 namespace kelvasi {
@@ -16,17 +17,6 @@ namespace kelvasi {
 struct CapturedMessage {
   std::span<const std::uint8_t> bytes;  // last until the next read
   std::chrono::nanoseconds arrival{0};  // since 1 January 1970 UTC, never negative
-};
-
-// What of a capture could not be read.
-struct CaptureFault {
-  std::string file;
-  std::optional<std::uint64_t> offset;  // of what could not be read; nothing when the file was not opened,
-                                        // and where it is wrong as a whole
-  std::string reason;
-
-  // One line: "drive.pcap: byte 1024: truncated dump file"
-  std::string text() const;
 };
 
 class CaptureReader {
@@ -53,7 +43,8 @@ class CaptureReader {
   std::uint64_t skippedCount_ = 0;
 };
 
-// Opens a pcap, pcapng or DLF file or a snapshot; "-" is the standard input. A DLF file is told by its
+// Opens a pcap, pcapng or DLF file or a snapshot, each also packed with gzip or zstd; "-" is the standard
+// input. A DLF file is told by its
 // version report or by its name's ending ".dlf", a snapshot as a property list or by ".kelvasi". Never null:
 // what cannot be opened or read is a capture without messages and with a fault. `plists` is needed until the
 // call returns.

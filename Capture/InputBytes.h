@@ -1,41 +1,40 @@
-// A file or the standard input, read from its beginning to its end. The first bytes can be looked at before
-// anybody reads them, and the place that was read up to is known for pipes too.
+// A file or the standard input, read from its beginning to its end, unpacked where it is packed (gzip, zstd).
+// The first bytes can be looked at before anybody reads them, and the place that was read up to is known for
+// pipes too.
 #pragma once
 
-#include <array>
-#include <cstddef>
-#include <cstdint>
 #include <cstdio>
 #include <memory>
 #include <optional>
-#include <span>
 #include <string>
 #include <string_view>
 
-#include "Capture/CaptureReader.h"
-#include "Platform/Posix/FileDescriptor.h"
+#include "Capture/FileBytes.h"
+#include "Capture/PeekedBytes.h"
+#include "Capture/UnpackedBytes.h"
 #include "Plist/PlistValue.h"
 
 namespace kelvasi {
 
 class InputBytes {
  public:
-  static constexpr std::size_t mostFirstBytes = 256;
-
   // "-" is the standard input. A failure is kept in fault().
   explicit InputBytes(const std::string& path);
   InputBytes(const InputBytes&) = delete;
   InputBytes& operator=(const InputBytes&) = delete;
 
-  const std::string& name() const { return name_; }
-  const std::optional<CaptureFault>& fault() const { return fault_; }
-  // At most `mostFirstBytes`; less when the file is shorter. Waits for these bytes and no more, and they are
-  // read all the same. Not to be called after reading has begun. A failure is kept in fault().
-  std::span<const std::uint8_t> firstBytes(std::size_t count);
-  std::uint64_t position() const { return position_; }
+  // For the places in what the input holds: "drive.pcap", of a packed file "drive.pcap.gz, unpacked".
+  std::string name() const;
+  const std::optional<CaptureFault>& fault() const { return fault_ ? fault_ : content().fault(); }
+  // As PeekedBytes has it.
+  std::span<const std::uint8_t> firstBytes(std::size_t count) { return content().firstBytes(count); }
+  // In what the input holds.
+  std::uint64_t position() const { return content().position(); }
+  // In the file itself.
+  std::uint64_t filePosition() const { return file_.position(); }
 
-  // The number of bytes read, 0 at the end, negative with errno set on failure.
-  std::ptrdiff_t read(std::span<std::uint8_t> block);
+  // The number of bytes read, 0 at the end, negative on failure.
+  std::ptrdiff_t read(std::span<std::uint8_t> block) { return content().read(block); }
 
   // All bytes from here on. More than `largest`, none at all and a failure are kept in fault(); `kind`, as in
   // "a DLF file", says what may not be as large.
@@ -49,16 +48,15 @@ class InputBytes {
   std::unique_ptr<std::FILE, Close> stream();
 
  private:
-  std::ptrdiff_t readDescriptor(std::span<std::uint8_t> block);
+  PeekedBytes& content() { return unpackedFirst_ ? *unpackedFirst_ : fileFirst_; }
+  const PeekedBytes& content() const { return unpackedFirst_ ? *unpackedFirst_ : fileFirst_; }
   void fail(std::uint64_t offset, std::string reason);
 
-  std::string name_;
-  FileDescriptor file_;
+  FileBytes file_;
+  PeekedBytes fileFirst_;
+  std::optional<UnpackedBytes> unpacked_;
+  std::optional<PeekedBytes> unpackedFirst_;
   std::optional<CaptureFault> fault_;
-  std::array<std::uint8_t, mostFirstBytes> first_{};
-  std::size_t firstCount_ = 0;
-  bool endsInFirst_ = false;
-  std::uint64_t position_ = 0;
 };
 
 }  // namespace kelvasi

@@ -83,6 +83,7 @@ std::uint64_t PcapReader::position() const {
 
 void PcapReader::fail(std::uint64_t offset, std::string reason) {
   fault_ = CaptureFault{input_->name(), offset, std::move(reason)};
+  if (input_->fault()) fault_ = input_->fault();  // the library does not know the true reason
   capture_.reset();
 }
 

@@ -93,7 +93,7 @@ TEST(InputBytes, TellsASnapshotInAPipeByItsContent) {
 TEST(InputBytes, ShowsNoMoreThanItsFirstBytesAndTakesNoneAway) {
   const CaptureDirectory directory;
   InputBytes input(directory.write("a", Bytes(300, 7)));
-  EXPECT_EQ(input.firstBytes(1000).size(), InputBytes::mostFirstBytes);
+  EXPECT_EQ(input.firstBytes(1000).size(), PeekedBytes::mostFirstBytes);
   EXPECT_EQ(input.readToEnd(300, "a test"), Bytes(300, 7));
   EXPECT_FALSE(input.fault());
 }

@@ -1,5 +1,6 @@
 """kelvasictl decode: what it prints."""
 
+import gzip
 import json
 import os
 import plistlib
@@ -190,6 +191,22 @@ class EveryTick(KelvasictlTest):
         result = self.decode("--every-tick", self.write("a.pcap", contents[:-1]))
         self.assertEqual(len(result.stdout.splitlines()), 1)
         self.assert_fault(result, "a.pcap: byte 56: ")
+
+
+class Packed(KelvasictlTest):
+    def test_files_and_the_standard_input_are_unpacked(self):
+        capture = pcap(MM_IDLE, GMM_REGISTERED)
+        plain = self.decode(self.write("a.pcap", capture))
+        packed = gzip.compress(capture)
+        for result in (self.decode(self.write("a.pcap.gz", packed)), self.decode("-", input=packed)):
+            self.assertEqual((result.returncode, result.stderr), (0, b""))
+            self.assertEqual(result.stdout, plain.stdout)
+
+    def test_a_cut_one_is_named_with_its_end(self):
+        packed = gzip.compress(pcap(MM_IDLE, GMM_REGISTERED))[:-9]
+        result = self.decode(self.write("a.pcap.gz", packed))
+        self.assert_fault(result, f"a.pcap.gz: byte {len(packed)}: the gzip data end too early")
+        self.assertIn(b"MM_IDLE", result.stdout)
 
 
 class Technology(KelvasictlTest):
