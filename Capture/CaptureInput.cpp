@@ -8,20 +8,25 @@ namespace kelvasi {
 
 namespace {
 
+constexpr std::uint64_t messagesToAdvance = 64;
+
 std::string fitsNone(const TechnologyCount& count) {
   return "fits no technology: none asks for any of its messages (" + std::to_string(count.messages()) + ")";
 }
 
 }  // namespace
 
-CaptureInput::CaptureInput(Choice choice, const PlistSerialiser& plists, Tell tell)
-    : choice_(std::move(choice)), plists_(plists), tell_(std::move(tell)) {}
+CaptureInput::CaptureInput(Choice choice, const PlistSerialiser& plists, Tell tell, Advance advance)
+    : choice_(std::move(choice)), plists_(plists), tell_(std::move(tell)), advance_(std::move(advance)) {}
 
 std::optional<InputMessage> CaptureInput::next() {
   while (capture_ || nextPath_ < choice_.paths.size()) {
     if (!capture_) openNext();
     if (!technology_.empty()) {
-      if (const auto message = capture_->next()) return InputMessage{*message, technology_};
+      if (const auto message = capture_->next()) {
+        if (++newMessages_ == messagesToAdvance) advance();
+        return InputMessage{*message, technology_};
+      }
     }
     endCapture();
   }
@@ -56,7 +61,16 @@ void CaptureInput::tellWhyNoneWasFound() {
 void CaptureInput::endCapture() {
   for (const std::string& line : capture_->reader().complaints()) tellFault(line);
   if (!technology_.empty()) tellOfOthers();
+  advance();
+  advancedPosition_ = 0;
   capture_.reset();
+}
+
+void CaptureInput::advance() {
+  const std::uint64_t position = capture_->reader().filePosition();
+  if (advance_) advance_(newMessages_, position - advancedPosition_);
+  newMessages_ = 0;
+  advancedPosition_ = position;
 }
 
 void CaptureInput::tellOfOthers() {

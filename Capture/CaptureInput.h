@@ -32,16 +32,18 @@ class CaptureInput {
     std::vector<std::string> paths;         // as openCapture() takes them
     std::optional<std::string> technology;  // an identifier; otherwise that of each capture is found
   };
+  // Is told now and then how many messages, and bytes of the files, were read since it was last told.
+  using Advance = std::function<void(std::uint64_t messages, std::uint64_t bytes)>;
   // Is given each line for people as it comes up, without a line feed: "FILE: ...".
   using Tell = std::function<void(const std::string& line)>;
 
-  // `plists` outlives the input.
+  // `plists` outlives the input. `advance` may be empty.
   //
   // Told are: what cannot be read, with the place in the file; the technology that was found, by its short
   // name, where it is another than the capture before had; a capture that fits two technologies, or another
   // than it is taken for, with the counts of messages. A capture of which no technology can be found is
   // passed over.
-  CaptureInput(Choice choice, const PlistSerialiser& plists, Tell tell);
+  CaptureInput(Choice choice, const PlistSerialiser& plists, Tell tell, Advance advance = {});
 
   // Nothing at the end of the last capture. A message's bytes last until the next call.
   std::optional<InputMessage> next();
@@ -53,6 +55,7 @@ class CaptureInput {
  private:
   void openNext();
   void endCapture();
+  void advance();
   void findTechnology();
   void tellWhyNoneWasFound();
   void tellOfOthers();
@@ -62,6 +65,7 @@ class CaptureInput {
   Choice choice_;
   const PlistSerialiser& plists_;
   Tell tell_;
+  Advance advance_;
   const TechnologyCodes codes_;
   std::size_t nextPath_ = 0;
   std::optional<ProbedCapture> capture_;
@@ -69,6 +73,8 @@ class CaptureInput {
   bool isFound_ = false;         // and not given
   std::string_view told_;        // the technology that was last told
   bool hasFault_ = false;
+  std::uint64_t newMessages_ = 0;       // since the last advance
+  std::uint64_t advancedPosition_ = 0;  // in the capture's file
 };
 
 }  // namespace kelvasi

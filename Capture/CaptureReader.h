@@ -26,6 +26,8 @@ class CaptureReader {
   // The next whole message. Nothing at the end and after a fault; what was read before a fault has been
   // delivered by then.
   virtual std::optional<CapturedMessage> next() = 0;
+  // How much of the file was read, to show how far that is.
+  virtual std::uint64_t filePosition() const { return 0; }
   // Why the capture ends before its end. Set at the latest when next() has returned nothing.
   const std::optional<CaptureFault>& fault() const { return fault_; }
   // Everything that could not be read, in lines for people: messages of which the capture holds only the

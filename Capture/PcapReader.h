@@ -17,6 +17,7 @@ class PcapReader : public CaptureReader {
 
   // A packet of which the capture holds only the beginning is skipped.
   std::optional<CapturedMessage> next() override;
+  std::uint64_t filePosition() const override { return input_->filePosition(); }
 
  private:
   struct Close {

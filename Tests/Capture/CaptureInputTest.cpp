@@ -85,6 +85,22 @@ TEST_F(CaptureInputTest, AMessageThatIsSkippedIsAFault) {
   EXPECT_TRUE(hasFault);
 }
 
+TEST_F(CaptureInputTest, TellsHowFarItIs) {
+  const Bytes bytes = fileHeader + packets(100, lte);
+  const std::string path = directory.write("a.pcap", bytes);
+  std::vector<std::uint64_t> messageCounts;
+  std::uint64_t fileBytes = 0;
+  CaptureInput input({.paths = {path, path}, .technology = technology}, plists, {},
+                     [&](std::uint64_t messages, std::uint64_t read) {
+                       messageCounts.push_back(messages);
+                       fileBytes += read;
+                     });
+  while (input.next()) {
+  }
+  EXPECT_THAT(messageCounts, ElementsAre(64, 36, 64, 36));
+  EXPECT_EQ(fileBytes, 2 * bytes.size());
+}
+
 struct CaptureInputFindsTechnology : CaptureInputTest {
   CaptureInputFindsTechnology() { technology.reset(); }
 

@@ -4,12 +4,15 @@ import gzip
 import json
 import os
 import plistlib
+import pty
 import signal
 import stat
+import subprocess
+import time
 import unittest
 
-from support import CAPTURES, GMM_DEREGISTERED, GMM_REGISTERED, MM_IDLE, START, TEMPLATES, KelvasictlTest, pcap, pcapng
-from support import record
+from support import CAPTURES, GMM_DEREGISTERED, GMM_REGISTERED, MM_IDLE, PROGRAM, START, TEMPLATES, KelvasictlTest
+from support import packet, pcap, pcapng, record
 
 
 class Decode(KelvasictlTest):
@@ -207,6 +210,44 @@ class Packed(KelvasictlTest):
         result = self.decode(self.write("a.pcap.gz", packed))
         self.assert_fault(result, f"a.pcap.gz: byte {len(packed)}: the gzip data end too early")
         self.assertIn(b"MM_IDLE", result.stdout)
+
+
+class ProgressLine(KelvasictlTest):
+    """Beside a capture that comes slowly, on a terminal and elsewhere."""
+
+    def decode_slowly(self, error):
+        program = subprocess.Popen(
+            [PROGRAM, "decode", "--technology", "Orvane_GSM", "--resources", TEMPLATES, "-"], env=self.environment,
+            stdin=subprocess.PIPE, stdout=subprocess.PIPE, stderr=error)
+        self.addCleanup(program.stdout.close)
+        program.stdin.write(pcap(*[MM_IDLE] * 100))
+        program.stdin.flush()
+        time.sleep(0.5)
+        program.stdin.write(b"".join([packet(MM_IDLE)] * 100) + b"rest")
+        program.stdin.close()
+        self.assertIn(b"MM_IDLE", program.stdout.read())
+        self.assertEqual(program.wait(60), 1)
+
+    def test_is_shown_on_a_terminal_and_taken_away(self):
+        ours, terminal = pty.openpty()
+        self.decode_slowly(terminal)
+        os.close(terminal)
+        written = b""
+        try:
+            while piece := os.read(ours, 65536):
+                written += piece
+        except OSError:  # how a terminal ends
+            pass
+        os.close(ours)
+        self.assertRegex(written, rb"\A(\r\x1b\[K\d+ messages, 0.0 MB, \d+ messages/s)+"
+                                  rb"\r\x1b\[Kkelvasictl: standard input: byte \d+: truncated.*\r\n\r\x1b\[K\Z")
+
+    def test_is_not_shown_in_a_pipe(self):
+        reading, writing = os.pipe()
+        self.decode_slowly(writing)
+        os.close(writing)
+        with os.fdopen(reading, "rb") as pipe:
+            self.assertRegex(pipe.read(), rb"\Akelvasictl: standard input: byte \d+: truncated.*\n\Z")
 
 
 class Technology(KelvasictlTest):

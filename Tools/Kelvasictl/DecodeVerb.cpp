@@ -11,6 +11,7 @@
 #include "Telvon/TechnologyName.h"
 #include "Tools/Kelvasictl/Decode.h"
 #include "Tools/Kelvasictl/DisplayJson.h"
+#include "Tools/Kelvasictl/Progress.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/Surroundings.h"
 #include "Tools/Kelvasictl/ToolError.h"
@@ -88,7 +89,10 @@ class DecodeVerb {
 
   // One display has one technology, that of the first message unless it is given.
   bool decodeCaptures() {
-    CaptureInput input(inputOf(options_), surroundings_.plists, complain);
+    Progress progress(options_.captures,
+                      options_.everyTick ? Progress::Output::meanwhile : Progress::Output::atTheEnd);
+    CaptureInput input(inputOf(options_), surroundings_.plists, complain,
+                       [&](std::uint64_t messages, std::uint64_t bytes) { progress.add(messages, bytes); });
     while (const auto message = input.next()) {
       if (!decode_) {
         input.keepTechnology(message->technology);

@@ -41,7 +41,9 @@ void printOut(std::string_view text) {
 }
 
 void complain(std::string_view text) {
-  write(STDERR_FILENO, "kelvasictl: " + std::string(text) + "\n");
+  // A terminal may have a line there that shows how things stand.
+  const std::string begin = ::isatty(STDERR_FILENO) == 1 ? "\r\x1b[K" : "";
+  write(STDERR_FILENO, begin + "kelvasictl: " + std::string(text) + "\n");
 }
 
 }  // namespace kelvasi
