@@ -239,7 +239,7 @@ class ProgressLine(KelvasictlTest):
         except OSError:  # how a terminal ends
             pass
         os.close(ours)
-        self.assertRegex(written, rb"\A(\r\x1b\[K\d+ messages, 0.0 MB, \d+ messages/s)+"
+        self.assertRegex(written, rb"\A(\r\x1b\[K\d+ messages, 0.0 MB, \d+/s)+"
                                   rb"\r\x1b\[Kkelvasictl: standard input: byte \d+: truncated.*\r\n\r\x1b\[K\Z")
 
     def test_is_not_shown_in_a_pipe(self):

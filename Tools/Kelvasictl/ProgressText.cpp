@@ -35,7 +35,7 @@ std::string duration(double seconds) {
 }
 
 std::string bar(double part) {
-  constexpr std::size_t width = 20;
+  constexpr std::size_t width = 10;
   const auto done = static_cast<std::size_t>(part * width);
   return "[" + std::string(done, '#') + std::string(width - done, ' ') + "] " +
          std::to_string(static_cast<int>(part * 100)) + " %";
@@ -49,14 +49,14 @@ std::string progressText(const ProgressFigures& figures, std::size_t columns) {
   const auto done = static_cast<double>(figures.bytes);
   const double part = isPartKnown ? std::min(done / all, 1.0) : 0;
   std::string text = isPartKnown ? bar(part) + ", " : "";
+  if (part > 0) text += duration(figures.seconds * (1 - part) / part) + " left, ";
   text += grouped(figures.messages) + " messages, " + megabytes(figures.bytes);
   if (isPartKnown) text += " of " + megabytes(*figures.bytesInAll);
   text += " MB";
   if (figures.seconds > 0) {
     const double rate = static_cast<double>(figures.messages) / figures.seconds;
-    text += ", " + grouped(static_cast<std::uint64_t>(rate)) + " messages/s";
+    text += ", " + grouped(static_cast<std::uint64_t>(rate)) + "/s";
   }
-  if (part > 0) text += ", " + duration(figures.seconds * (1 - part) / part) + " left";
   return text.substr(0, columns);
 }
 

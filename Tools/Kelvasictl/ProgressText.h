@@ -14,8 +14,8 @@ struct ProgressFigures {
   double seconds = 0;                         // since the beginning
 };
 
-// "[##########          ] 50 %, 1,560,000 messages, 64.0 of 127.9 MB, 2,100,000 messages/s, 0:03 left", and
-// without what nobody knows. At most so many columns.
+// "[#####     ] 50 %, 0:03 left, 1,560,000 messages, 63.9 of 127.9 MB, 520,000/s", and without what nobody
+// knows. At most so many columns.
 std::string progressText(const ProgressFigures& figures, std::size_t columns);
 
 }  // namespace kelvasi
