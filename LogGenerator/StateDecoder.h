@@ -6,7 +6,7 @@
 #include <string_view>
 
 #include "LogGenerator/Base.h"
-#include "LogGenerator/CellRows.h"
+#include "LogGenerator/Daemon/CellRows.h"
 #include "LogGenerator/Row.h"
 
 namespace kelvasi {

@@ -2,10 +2,10 @@
 #include <array>
 
 #include "LogGenerator/C2K/C2KLogGenerator.h"
-#include "LogGenerator/GSM/GSMLogGenerator.h"
 #include "LogGenerator/GSM/Orvane_GSMLogGenerator.h"
 #include "LogGenerator/LTE/LTELogGenerator.h"
 #include "LogGenerator/LogGenerator.h"
+#include "LogGenerator/ObjectStream/GSMLogGenerator.h"
 #include "LogGenerator/UTRAN/UTRANLogGenerator.h"
 #include "Telvon/Technology.h"
 

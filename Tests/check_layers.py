@@ -1,8 +1,8 @@
 #!/usr/bin/env python3
 """Checks the one rule of direction: a folder includes only what stands below it.
 
-Also that headers other than the C++ standard library's are included only where the platform, captures or tools are,
-and that every test is built.
+Also that one technology includes nothing of another, that headers other than the C++ standard library's are included
+only where the platform, captures or tools are, and that every test is built.
 """
 
 import pathlib
@@ -10,7 +10,11 @@ import re
 import sys
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent
-HOUSE = ["Plist", "Platform", "Radio", "Telvon", "Dlf", "LogGenerator", "Model", "Survey", "App", "Capture", "Simulator", "Tools"]
+HOUSE = ["Plist", "Platform", "Radio", "Telvon", "Dlf", "LogGenerator", "Model", "Survey", "Cockpit", "App", "Capture",
+         "Modem", "Simulator", "Tools"]
+# Rooms of LogGenerator/ and Simulator/, and beside them in Tests/ and Bench/.
+TECHNOLOGIES = {"GSM", "LTE", "UTRAN", "C2K", "ObjectStream"}
+MIRRORS = ["Tests", "Bench"]
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
 STANDARD = re.compile(r"^[a-z_]+$")  # <vector>, <cstdint>; neither <syslog.h> nor <QTimer>
 
@@ -22,42 +26,70 @@ def may_use_libraries(path: pathlib.Path) -> bool:
     return path.parts[0] == "Platform" and len(path.parts) > 2 and path.parts[1] != "UserInterface"
 
 
-def faults(path: pathlib.Path):
-    rank = HOUSE.index(path.parts[0])
+def technology(path: pathlib.Path):
+    rooms = [part for part in path.parts[:-1] if part in TECHNOLOGIES]
+    return rooms[0] if rooms else None
+
+
+def includes(path: pathlib.Path):
     for number, line in enumerate((ROOT / path).read_text().splitlines(), start=1):
         match = INCLUDE.match(line)
-        if not match:
-            continue
-        kind, name = match.groups()
+        if match:
+            yield f"{path}:{number}", *match.groups()
+
+
+def faults_of_direction(path: pathlib.Path):
+    rank = HOUSE.index(path.parts[0])
+    for place, kind, name in includes(path):
         if kind == "<":
             if not STANDARD.match(name) and not may_use_libraries(path):
-                yield f"{path}:{number}: <{name}> is no standard header"
+                yield f"{place}: <{name}> is no standard header"
         elif name.split("/")[0] in HOUSE:
             if HOUSE.index(name.split("/")[0]) > rank:
-                yield f'{path}:{number}: "{name}" stands above {path.parts[0]}/'
+                yield f'{place}: "{name}" stands above {path.parts[0]}/'
         elif not may_use_libraries(path):
-            yield f'{path}:{number}: "{name}" is not written from the root'
+            yield f'{place}: "{name}" is not written from the root'
+
+
+# What several technologies need lies in a room of its own, as Daemon/ does.
+def faults_of_technology(path: pathlib.Path):
+    own = technology(path)
+    for place, _, name in includes(path):
+        other = technology(pathlib.Path(name))
+        if own and other and own != other:
+            yield f'{place}: "{name}" is of another technology'
+        if other and path.parts[:2] == ("LogGenerator", "Daemon"):
+            yield f'{place}: "{name}" is of one technology, and the daemon serves all of them'
 
 
 def tests_not_built():
     for path in sorted((ROOT / "Tests").rglob("*Test.cpp")):
-        lists = [folder / "CMakeLists.txt" for folder in path.parents if ROOT in folder.parents]
-        if not any(path.name in file.read_text() for file in lists if file.exists()):
+        lists = [folder / "CMakeLists.txt" for folder in path.parents if (folder / "CMakeLists.txt").exists()]
+        if not builds(lists[0], path.name):
             yield f"{path.relative_to(ROOT)}: is not built"
 
 
+# A test program names its sources, or takes all of its folder but those that it names.
+def builds(targets: pathlib.Path, name: str) -> bool:
+    calls = re.findall(r"kelvasi_test\(([^)]*)\)", targets.read_text())
+    return any(("SOURCES" in call) == (name in call) for call in calls)
+
+
+def sources(folders):
+    for folder in folders:
+        for path in sorted((ROOT / folder).rglob("*")):
+            if path.suffix in (".h", ".cpp"):
+                yield path.relative_to(ROOT)
+
+
 def main() -> int:
-    sources = [
-        path.relative_to(ROOT)
-        for folder in HOUSE
-        for path in sorted((ROOT / folder).rglob("*"))
-        if path.suffix in (".h", ".cpp")
-    ]
-    found = [fault for path in sources for fault in faults(path)]
+    house = list(sources(HOUSE))
+    found = [fault for path in house for fault in faults_of_direction(path)]
+    found += [fault for path in [*house, *sources(MIRRORS)] for fault in faults_of_technology(path)]
     found += tests_not_built()
     for fault in found:
         print(fault, file=sys.stderr)
-    print(f"{len(sources)} files, {len(found)} faults of structure")
+    print(f"{len(house)} files, {len(found)} faults of structure")
     return 1 if found else 0
 
 

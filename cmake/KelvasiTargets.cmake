@@ -10,24 +10,40 @@ if(KELVASI_SANITIZE)
   target_link_options(kelvasi_options INTERFACE -fsanitize=${KELVASI_SANITIZE})
 endif()
 
-# kelvasi_library(NAME SOURCES ... [LINK ...]): one folder of the house; the target is kelvasi_NAME.
+# kelvasi_sources(OUT [EXCEPT ...]): the sources of the folder and of the rooms in it, found anew when some come or go.
+# A room with a CMakeLists.txt is a target of its own.
+function(kelvasi_sources OUT)
+  cmake_parse_arguments(ARG "" "" "EXCEPT" ${ARGN})
+  file(GLOB_RECURSE FOUND CONFIGURE_DEPENDS RELATIVE ${CMAKE_CURRENT_SOURCE_DIR} *.cpp)
+  file(GLOB_RECURSE TARGETS CONFIGURE_DEPENDS RELATIVE ${CMAKE_CURRENT_SOURCE_DIR} CMakeLists.txt)
+  list(REMOVE_ITEM TARGETS CMakeLists.txt)
+  foreach(TARGET ${TARGETS})
+    cmake_path(GET TARGET PARENT_PATH ROOM)
+    list(FILTER FOUND EXCLUDE REGEX "^${ROOM}/")
+  endforeach()
+  list(REMOVE_ITEM FOUND ${ARG_EXCEPT})
+  set(${OUT} ${FOUND} PARENT_SCOPE)
+endfunction()
+
+# kelvasi_library(NAME [PRECOMPILED set] [ALSO ...] [LINK ...]): one folder of the house, all but its main(), and also
+# these sources; the target is kelvasi_NAME.
 function(kelvasi_library NAME)
-  cmake_parse_arguments(ARG "" "" "SOURCES;LINK" ${ARGN})
-  add_library(kelvasi_${NAME} STATIC ${ARG_SOURCES})
+  cmake_parse_arguments(ARG "" "PRECOMPILED" "ALSO;LINK" ${ARGN})
+  kelvasi_sources(SOURCES EXCEPT main.cpp)
+  add_library(kelvasi_${NAME} STATIC ${SOURCES} ${ARG_ALSO})
   target_link_libraries(kelvasi_${NAME} PUBLIC kelvasi_options ${ARG_LINK})
+  kelvasi_precompiled(kelvasi_${NAME} ${ARG_PRECOMPILED} standard)
 endfunction()
 
-# kelvasi_headers(NAME [LINK ...]): a folder that has headers only.
-function(kelvasi_headers NAME)
-  cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
-  add_library(kelvasi_${NAME} INTERFACE)
-  target_link_libraries(kelvasi_${NAME} INTERFACE kelvasi_options ${ARG_LINK})
-endfunction()
-
-# kelvasi_test(NAME SOURCES ... [LINK ...]): a GoogleTest program whose cases CTest runs one by one.
+# kelvasi_test(NAME [PRECOMPILED set] [SOURCES ... | EXCEPT ... ALSO ...] [LINK ...]): a GoogleTest program of the
+# folder's sources, or of those given, whose cases CTest runs one by one.
 function(kelvasi_test NAME)
-  cmake_parse_arguments(ARG "" "" "SOURCES;LINK" ${ARGN})
-  add_executable(${NAME} ${ARG_SOURCES})
+  cmake_parse_arguments(ARG "" "PRECOMPILED" "SOURCES;EXCEPT;ALSO;LINK" ${ARGN})
+  if(NOT ARG_SOURCES)
+    kelvasi_sources(ARG_SOURCES EXCEPT ${ARG_EXCEPT})
+  endif()
+  add_executable(${NAME} ${ARG_SOURCES} ${ARG_ALSO})
   target_link_libraries(${NAME} PRIVATE kelvasi_options ${ARG_LINK} GTest::gmock GTest::gtest_main)
+  kelvasi_precompiled(${NAME} ${ARG_PRECOMPILED} test)
   gtest_discover_tests(${NAME} DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 120)
 endfunction()

@@ -7,6 +7,8 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
+#include "LogGenerator/Daemon/PDPContextList.h"
+#include "LogGenerator/Daemon/SimInfo.h"
 #include "LogGenerator/GSM/ActiveSet.h"
 #include "LogGenerator/GSM/BLER.h"
 #include "LogGenerator/GSM/CellChangeCounters.h"
@@ -23,12 +25,10 @@
 #include "LogGenerator/GSM/NeighboringCells.h"
 #include "LogGenerator/GSM/NonRankedGSMSet.h"
 #include "LogGenerator/GSM/NonRankedUMTSSet.h"
-#include "LogGenerator/GSM/PDPContextList.h"
 #include "LogGenerator/GSM/ProcessCO.h"
 #include "LogGenerator/GSM/ProcessCS.h"
 #include "LogGenerator/GSM/ProcessPS.h"
 #include "LogGenerator/GSM/ServingPLMN.h"
-#include "LogGenerator/GSM/SimInfo.h"
 #include "LogGenerator/GSM/UMTSRRInfo.h"
 #include "LogGenerator/GSM/UMTSRRMeasurement.h"
 #include "LogGenerator/GSM/UMTSSet.h"

@@ -5,8 +5,8 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
-#include "LogGenerator/GSM/PDPContextList.h"
-#include "LogGenerator/GSM/SimInfo.h"
+#include "LogGenerator/Daemon/PDPContextList.h"
+#include "LogGenerator/Daemon/SimInfo.h"
 #include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
 #include "LogGenerator/LTE/DetectedCells.h"
 #include "LogGenerator/LTE/LTEServingCellInfo.h"

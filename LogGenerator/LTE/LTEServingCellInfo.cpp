@@ -1,6 +1,6 @@
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
 
-#include "LogGenerator/CellRows.h"
+#include "LogGenerator/Daemon/CellRows.h"
 #include "LogGenerator/LTE/ServingCell.h"
 #include "LogGenerator/LTE/TransmitAntennas.h"
 #include "Telvon/CellMonitor.h"

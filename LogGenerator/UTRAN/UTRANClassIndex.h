@@ -5,8 +5,8 @@
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
-#include "LogGenerator/GSM/PDPContextList.h"
-#include "LogGenerator/GSM/SimInfo.h"
+#include "LogGenerator/Daemon/PDPContextList.h"
+#include "LogGenerator/Daemon/SimInfo.h"
 #include "LogGenerator/UTRAN/CCTRCHSIRMeasurement.h"
 #include "LogGenerator/UTRAN/GSMNeighbhorMeasurements.h"
 #include "LogGenerator/UTRAN/RRC_State.h"

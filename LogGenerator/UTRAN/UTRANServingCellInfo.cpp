@@ -1,6 +1,6 @@
 #include "LogGenerator/UTRAN/UTRANServingCellInfo.h"
 
-#include "LogGenerator/CellRows.h"
+#include "LogGenerator/Daemon/CellRows.h"
 #include "LogGenerator/UTRAN/ServingCell.h"
 #include "Telvon/CellMonitor.h"
 

@@ -6,7 +6,7 @@
 #include "LogGenerator/GSM/CellSets.h"
 #include "LogGenerator/GSM/NeighbourSets.h"
 #include "Simulator/EntryWriter.h"
-#include "Simulator/GSM/CellSelection.h"
+#include "Simulator/Handset/CellSelection.h"
 
 namespace kelvasi::sim::gsm {
 
@@ -43,12 +43,6 @@ Places withServing(const World& world, const Places& neighbours) {
   Places places{*world.serving()};
   places.insert(places.end(), neighbours.begin(), neighbours.end());
   return places;
-}
-
-MeasuredCell measured(const World& world, std::size_t place) {
-  MeasuredCell result{.cell = world.cell(place), .level = whole(world.reception(place).level), .ecNo = {}};
-  if (result.cell.technology == Technology::umts) result.ecNo = whole(world.reception(place).ecNo);
-  return result;
 }
 
 }  // namespace
@@ -92,15 +86,6 @@ std::optional<Bytes> neighbourSetsRecord(const World& world) {
                  });
   }
   return record.bytes();
-}
-
-CellList cellListOf(const World& world) {
-  CellList list;
-  if (!world.serving()) return list;
-  list.serving = measured(world, *world.serving());
-  for (const std::size_t place : world.umtsNeighbours()) list.neighbours.push_back(measured(world, place));
-  for (const std::size_t place : world.gsmNeighbours()) list.neighbours.push_back(measured(world, place));
-  return list;
 }
 
 }  // namespace kelvasi::sim::gsm

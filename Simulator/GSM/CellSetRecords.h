@@ -3,8 +3,8 @@
 
 #include <optional>
 
-#include "Simulator/GSM/World.h"
-#include "Simulator/Radio/CellList.h"
+#include "Plist/PlistValue.h"
+#include "Simulator/Handset/World.h"
 
 namespace kelvasi::sim::gsm {
 
@@ -14,8 +14,5 @@ std::optional<Bytes> cellSetsRecord(const World& world);  // 0x417A
 // The serving cell and its neighbours. Of the serving technology only: both lists of the record begin at the
 // same byte, so one of them is always empty.
 std::optional<Bytes> neighbourSetsRecord(const World& world);  // 0x4005
-
-// The same cells for the telephony daemon's list, and those of the other technology.
-CellList cellListOf(const World& world);
 
 }  // namespace kelvasi::sim::gsm

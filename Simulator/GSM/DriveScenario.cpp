@@ -2,11 +2,13 @@
 
 #include <array>
 
+#include "Simulator/Daemon/PdpContextRecord.h"
+#include "Simulator/Daemon/SimRecord.h"
+#include "Simulator/Daemon/WorldCells.h"
 #include "Simulator/GSM/CellSetRecords.h"
 #include "Simulator/GSM/GprsRecords.h"
 #include "Simulator/GSM/GsmRecords.h"
 #include "Simulator/GSM/RegistrationRecords.h"
-#include "Simulator/GSM/SimRecord.h"
 #include "Simulator/GSM/UmtsRecords.h"
 
 namespace kelvasi::sim::gsm {

@@ -3,7 +3,7 @@
 #pragma once
 
 #include "Simulator/Drive.h"
-#include "Simulator/GSM/World.h"
+#include "Simulator/Handset/World.h"
 
 namespace kelvasi::sim::gsm {
 

@@ -4,7 +4,7 @@
 #include <optional>
 
 #include "Plist/PlistValue.h"
-#include "Simulator/GSM/World.h"
+#include "Simulator/Handset/World.h"
 
 namespace kelvasi::sim::gsm {
 

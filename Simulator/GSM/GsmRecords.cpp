@@ -9,8 +9,8 @@
 #include "LogGenerator/GSM/GSMRRRecords.h"
 #include "LogGenerator/GSM/HoppingList.h"
 #include "Simulator/EntryWriter.h"
-#include "Simulator/GSM/CellLayout.h"
-#include "Simulator/GSM/CellSelection.h"
+#include "Simulator/Handset/CellLayout.h"
+#include "Simulator/Handset/CellSelection.h"
 
 namespace kelvasi::sim::gsm {
 

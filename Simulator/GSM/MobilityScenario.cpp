@@ -3,8 +3,9 @@
 #include <algorithm>
 #include <array>
 
-#include "Simulator/GSM/CellLayout.h"
+#include "Simulator/Daemon/PdpContextRecord.h"
 #include "Simulator/GSM/RegistrationRecords.h"
+#include "Simulator/Handset/CellLayout.h"
 
 namespace kelvasi::sim::gsm {
 

@@ -4,8 +4,8 @@
 
 #include <vector>
 
-#include "Simulator/GSM/Registration.h"
-#include "Simulator/Radio/CellList.h"
+#include "Simulator/Daemon/CellList.h"
+#include "Simulator/Handset/Registration.h"
 #include "Simulator/RecordFeed.h"
 #include "Simulator/Scenario.h"
 

@@ -6,8 +6,7 @@
 #include "LogGenerator/GSM/RegisteredPLMN.h"
 #include "LogGenerator/GSM/RegistrationState.h"
 #include "LogGenerator/RecordWriter.h"
-#include "Simulator/GSM/CellLayout.h"
-#include "Simulator/PropertyListRecord.h"
+#include "Simulator/Handset/CellLayout.h"
 
 namespace kelvasi::sim::gsm {
 
@@ -35,13 +34,6 @@ Bytes equivalentEntry(Plmn plmn) {
       .set("MCC units", units(plmn.mcc))
       .set("MNC units", units(plmn.mnc))
       .bytes();
-}
-
-PlistValue contextEntry(const PdpContext& context) {
-  return PlistDictionary::make({{"NSAPI", std::to_string(context.nsapi)},
-                                {"Access Point Name", context.accessPoint},
-                                {"PDP Type", "IPv4"},
-                                {"PDP Address", context.address}});
 }
 
 }  // namespace
@@ -97,13 +89,6 @@ Bytes equivalentPlmnRecord(const Registration& registration) {
   const bool isHome = registration.lastCell().locationArea.plmn == homePlmn;
   if (isRegistered) record.append(equivalentEntry(isHome ? partnerPlmn : homePlmn));
   return record.bytes();
-}
-
-std::optional<Bytes> pdpContextRecord(const std::vector<PdpContext>& contexts,
-                                      const PlistSerialiser& plists) {
-  const auto list = PlistArray::make();
-  for (const PdpContext& context : contexts) list->append(contextEntry(context));
-  return propertyListRecord(pdpContextLogCode, list, plists);
 }
 
 }  // namespace kelvasi::sim::gsm

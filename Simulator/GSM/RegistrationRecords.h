@@ -1,8 +1,8 @@
 // The mobility-management records, from the registration that they report.
 #pragma once
 
-#include "Platform/PlistSerialiser.h"
-#include "Simulator/GSM/Registration.h"
+#include "Plist/PlistValue.h"
+#include "Simulator/Handset/Registration.h"
 
 namespace kelvasi::sim::gsm {
 
@@ -11,7 +11,5 @@ Bytes mmStateRecord(const Registration& registration);            // 0x7131
 Bytes registrationStateRecord(const Registration& registration);  // 0x7132
 Bytes registeredPlmnRecord(const Registration& registration);     // 0x7135
 Bytes equivalentPlmnRecord(const Registration& registration);     // 0x7150
-// 0xFF0002; nothing when the contexts cannot be serialised.
-std::optional<Bytes> pdpContextRecord(const std::vector<PdpContext>& contexts, const PlistSerialiser& plists);
 
 }  // namespace kelvasi::sim::gsm

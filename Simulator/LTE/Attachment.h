@@ -5,8 +5,8 @@
 #include <optional>
 #include <vector>
 
-#include "Simulator/GSM/PacketSwitched.h"
-#include "Simulator/GSM/Phase.h"
+#include "Simulator/Handset/PacketSwitched.h"
+#include "Simulator/Handset/Phase.h"
 #include "Simulator/Radio/Cell.h"
 
 namespace kelvasi::sim::lte {

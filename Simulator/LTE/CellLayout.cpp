@@ -1,6 +1,6 @@
 #include "Simulator/LTE/CellLayout.h"
 
-#include "Simulator/GSM/CellLayout.h"
+#include "Simulator/Handset/CellLayout.h"
 #include "Simulator/LTE/Layers.h"
 #include "Simulator/Radio/EutraBand.h"
 

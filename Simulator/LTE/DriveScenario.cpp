@@ -2,8 +2,8 @@
 
 #include <array>
 
-#include "Simulator/GSM/RegistrationRecords.h"
-#include "Simulator/GSM/SimRecord.h"
+#include "Simulator/Daemon/PdpContextRecord.h"
+#include "Simulator/Daemon/SimRecord.h"
 #include "Simulator/LTE/LteRecords.h"
 
 namespace kelvasi::sim::lte {

@@ -3,8 +3,8 @@
 
 #include <optional>
 
+#include "Simulator/Daemon/CellList.h"
 #include "Simulator/LTE/World.h"
-#include "Simulator/Radio/CellList.h"
 
 namespace kelvasi::sim::lte {
 

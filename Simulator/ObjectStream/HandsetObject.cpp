@@ -3,9 +3,6 @@
 #include <cmath>
 #include <string>
 
-#include "LogGenerator/GSM/GMMState.h"
-#include "LogGenerator/GSM/MMState.h"
-
 namespace kelvasi::sim::objectStream {
 
 namespace {
@@ -75,19 +72,17 @@ PlistValue neighbourLists(const World& world) {
 PlistValue network(const World& world) {
   const auto& registration = world.registration();
   const auto& area = registration.lastCell().locationArea;
-  const Object packet =
-      PlistDictionary::make({{"State", gmmState::states.at(registration.packetSwitched().state())}});
+  const Object packet = PlistDictionary::make({{"State", registration.packetSwitched().stateName()}});
   const auto contexts = PlistArray::make();
   for (const auto& context : registration.packetSwitched().contexts()) {
     contexts->append(
         PlistDictionary::make({{"Access Point", context.accessPoint}, {"Address", context.address}}));
   }
   if (!contexts->empty()) packet->set("Contexts", contexts);
-  return PlistDictionary::make(
-      {{"PLMN",
-        PlistDictionary::make({{"MCC", std::to_string(area.plmn.mcc)}, {"MNC", ofTwoDigits(area.plmn.mnc)}})},
-       {"Circuit Switched", stateOnly(mmState::states.at(registration.circuitSwitched().state()))},
-       {"Packet Switched", packet}});
+  return PlistDictionary::make({{"PLMN", PlistDictionary::make({{"MCC", std::to_string(area.plmn.mcc)},
+                                                                {"MNC", ofTwoDigits(area.plmn.mnc)}})},
+                                {"Circuit Switched", stateOnly(registration.circuitSwitched().stateName())},
+                                {"Packet Switched", packet}});
 }
 
 std::string_view connectionState(const RadioConnection& connection) {

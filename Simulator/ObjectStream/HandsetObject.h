@@ -2,7 +2,7 @@
 #pragma once
 
 #include "Plist/PlistValue.h"
-#include "Simulator/GSM/World.h"
+#include "Simulator/Handset/World.h"
 
 namespace kelvasi::sim::objectStream {
 

@@ -2,7 +2,7 @@
 // property list that holds everything.
 #pragma once
 
-#include "Simulator/GSM/World.h"
+#include "Simulator/Handset/World.h"
 #include "Simulator/Scenario.h"
 
 namespace kelvasi::sim::objectStream {

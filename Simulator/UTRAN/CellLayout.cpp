@@ -2,7 +2,7 @@
 
 #include <array>
 
-#include "Simulator/GSM/CellLayout.h"
+#include "Simulator/Handset/CellLayout.h"
 
 namespace kelvasi::sim::utran {
 

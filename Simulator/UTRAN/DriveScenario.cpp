@@ -2,9 +2,9 @@
 
 #include <array>
 
-#include "Simulator/GSM/CellSetRecords.h"
-#include "Simulator/GSM/RegistrationRecords.h"
-#include "Simulator/GSM/SimRecord.h"
+#include "Simulator/Daemon/PdpContextRecord.h"
+#include "Simulator/Daemon/SimRecord.h"
+#include "Simulator/Daemon/WorldCells.h"
 #include "Simulator/UTRAN/CellLayout.h"
 #include "Simulator/UTRAN/UtranRecords.h"
 

@@ -1,5 +1,6 @@
 #include "Bench/LogGenerator/GSM/GSMSamples.h"
 
+#include "LogGenerator/Daemon/SimFiles.h"
 #include "LogGenerator/GSM/BSICList.h"
 #include "LogGenerator/GSM/CellSets.h"
 #include "LogGenerator/GSM/EquivalentPLMN.h"
@@ -15,7 +16,6 @@
 #include "LogGenerator/GSM/NeighbourSets.h"
 #include "LogGenerator/GSM/RegisteredPLMN.h"
 #include "LogGenerator/GSM/RegistrationState.h"
-#include "LogGenerator/GSM/SimFiles.h"
 #include "LogGenerator/GSM/TransportChannelCRC.h"
 #include "LogGenerator/GSM/UMTSRRRecords.h"
 #include "Telvon/CellMonitor.h"

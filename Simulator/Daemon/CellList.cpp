@@ -1,8 +1,8 @@
-#include "Simulator/Radio/CellList.h"
+#include "Simulator/Daemon/CellList.h"
 
-#include "LogGenerator/CellRows.h"
+#include "LogGenerator/Daemon/CellRows.h"
 #include "LogGenerator/LogCode.h"
-#include "Simulator/PropertyListRecord.h"
+#include "Simulator/Daemon/PropertyListRecord.h"
 #include "Simulator/Radio/EutraBand.h"
 #include "Telvon/CellMonitor.h"
 

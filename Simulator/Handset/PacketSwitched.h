@@ -3,9 +3,10 @@
 
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
-#include "Simulator/GSM/Phase.h"
+#include "Simulator/Handset/Phase.h"
 #include "Simulator/Radio/Cell.h"
 
 namespace kelvasi::sim::gsm {
@@ -46,6 +47,7 @@ class PacketSwitched {
   bool isOff() const { return phase() == Phase::off; }
   bool isRegistered() const { return registeredIn_.has_value(); }
   std::uint8_t state() const { return clock_.row().state; }
+  std::string_view stateName() const;
   std::uint8_t subState() const { return clock_.row().subState; }
   UpdateStatus updateStatus() const { return updateStatus_; }
   Need need() const { return clock_.row().need; }

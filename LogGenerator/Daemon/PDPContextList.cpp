@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/PDPContextList.h"
+#include "LogGenerator/Daemon/PDPContextList.h"
 
 #include <array>
 

@@ -1,4 +1,4 @@
-#include "Simulator/GSM/World.h"
+#include "Simulator/Handset/World.h"
 
 #include <algorithm>
 #include <utility>

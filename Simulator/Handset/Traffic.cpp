@@ -1,4 +1,4 @@
-#include "Simulator/GSM/Traffic.h"
+#include "Simulator/Handset/Traffic.h"
 
 #include <algorithm>
 #include <array>

@@ -4,12 +4,12 @@
 
 #include <vector>
 
-#include "Simulator/GSM/ActiveSet.h"
-#include "Simulator/GSM/CellLayout.h"
-#include "Simulator/GSM/CellSelection.h"
-#include "Simulator/GSM/RadioConnection.h"
-#include "Simulator/GSM/Registration.h"
-#include "Simulator/GSM/Traffic.h"
+#include "Simulator/Handset/ActiveSet.h"
+#include "Simulator/Handset/CellLayout.h"
+#include "Simulator/Handset/CellSelection.h"
+#include "Simulator/Handset/RadioConnection.h"
+#include "Simulator/Handset/Registration.h"
+#include "Simulator/Handset/Traffic.h"
 #include "Simulator/Radio/RadioModel.h"
 #include "Simulator/Radio/Route.h"
 

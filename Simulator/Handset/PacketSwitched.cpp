@@ -1,4 +1,4 @@
-#include "Simulator/GSM/PacketSwitched.h"
+#include "Simulator/Handset/PacketSwitched.h"
 
 #include <array>
 
@@ -43,6 +43,10 @@ constexpr std::array<std::string_view, 2> accessPoints{"internet", "mms"};
 }  // namespace
 
 PacketSwitched::PacketSwitched(Random random) : random_(random), clock_(rows, Phase::off) {}
+
+std::string_view PacketSwitched::stateName() const {
+  return gmmState::states.at(state());
+}
 
 void PacketSwitched::switchOn() {
   if (isOff()) enter(Phase::searching);

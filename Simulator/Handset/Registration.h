@@ -1,8 +1,8 @@
 // The handset's registration with its network: both domains, and the user who switches it on and off.
 #pragma once
 
-#include "Simulator/GSM/CircuitSwitched.h"
-#include "Simulator/GSM/PacketSwitched.h"
+#include "Simulator/Handset/CircuitSwitched.h"
+#include "Simulator/Handset/PacketSwitched.h"
 
 namespace kelvasi::sim::gsm {
 

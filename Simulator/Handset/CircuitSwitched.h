@@ -2,8 +2,9 @@
 #pragma once
 
 #include <optional>
+#include <string_view>
 
-#include "Simulator/GSM/Phase.h"
+#include "Simulator/Handset/Phase.h"
 #include "Simulator/Radio/Cell.h"
 
 namespace kelvasi::sim::gsm {
@@ -40,6 +41,7 @@ class CircuitSwitched {
   bool isRegistered() const { return registeredIn_.has_value(); }
   bool isBusy() const { return need() != Need::none; }
   std::uint8_t state() const { return clock_.row().state; }
+  std::string_view stateName() const;
   std::uint8_t subState() const { return clock_.row().subState; }
   UpdateStatus updateStatus() const { return updateStatus_; }
   Need need() const { return clock_.row().need; }

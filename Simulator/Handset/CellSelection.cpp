@@ -1,4 +1,4 @@
-#include "Simulator/GSM/CellSelection.h"
+#include "Simulator/Handset/CellSelection.h"
 
 namespace kelvasi::sim::gsm {
 

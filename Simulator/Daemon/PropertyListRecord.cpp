@@ -1,4 +1,4 @@
-#include "Simulator/PropertyListRecord.h"
+#include "Simulator/Daemon/PropertyListRecord.h"
 
 #include "LogGenerator/RecordWriter.h"
 

@@ -1,12 +1,12 @@
-#include "Simulator/GSM/SimRecord.h"
+#include "Simulator/Daemon/SimRecord.h"
 
 #include <algorithm>
 #include <array>
 #include <string_view>
 
-#include "LogGenerator/GSM/SimFiles.h"
+#include "LogGenerator/Daemon/SimFiles.h"
 #include "LogGenerator/LogCode.h"
-#include "Simulator/PropertyListRecord.h"
+#include "Simulator/Daemon/PropertyListRecord.h"
 
 namespace kelvasi::sim::gsm {
 

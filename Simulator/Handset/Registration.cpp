@@ -1,8 +1,8 @@
-#include "Simulator/GSM/Registration.h"
+#include "Simulator/Handset/Registration.h"
 
 #include "LogGenerator/GSM/RegisteredPLMN.h"
 #include "LogGenerator/GSM/RegistrationState.h"
-#include "Simulator/GSM/CellLayout.h"
+#include "Simulator/Handset/CellLayout.h"
 
 namespace kelvasi::sim::gsm {
 

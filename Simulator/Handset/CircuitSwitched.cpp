@@ -1,4 +1,4 @@
-#include "Simulator/GSM/CircuitSwitched.h"
+#include "Simulator/Handset/CircuitSwitched.h"
 
 #include <array>
 
@@ -45,6 +45,10 @@ constexpr double shareOfFailures = 0.04;
 }  // namespace
 
 CircuitSwitched::CircuitSwitched(Random random) : random_(random), clock_(rows, Phase::off) {}
+
+std::string_view CircuitSwitched::stateName() const {
+  return mmState::states.at(state());
+}
 
 void CircuitSwitched::switchOn() {
   if (isOff()) enter(Phase::searching);

@@ -1,4 +1,4 @@
-#include "Simulator/GSM/RadioConnection.h"
+#include "Simulator/Handset/RadioConnection.h"
 
 #include <algorithm>
 

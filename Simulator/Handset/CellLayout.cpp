@@ -1,4 +1,4 @@
-#include "Simulator/GSM/CellLayout.h"
+#include "Simulator/Handset/CellLayout.h"
 
 namespace kelvasi::sim::gsm {
 

@@ -1,7 +1,7 @@
-#include "LogGenerator/GSM/SimInfo.h"
+#include "LogGenerator/Daemon/SimInfo.h"
 
+#include "LogGenerator/Daemon/SimFiles.h"
 #include "LogGenerator/Exceptions.h"
-#include "LogGenerator/GSM/SimFiles.h"
 #include "Platform/PlistSerialiser.h"
 #include "Platform/SystemLog.h"
 

@@ -1,4 +1,4 @@
-#include "LogGenerator/CellRows.h"
+#include "LogGenerator/Daemon/CellRows.h"
 
 #include <algorithm>
 

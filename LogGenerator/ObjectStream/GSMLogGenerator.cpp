@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/GSMLogGenerator.h"
+#include "LogGenerator/ObjectStream/GSMLogGenerator.h"
 
 #include <string>
 
@@ -9,6 +9,7 @@ namespace kelvasi {
 
 namespace {
 
+// The name that its assertions give, wherever the file lies.
 constexpr const char* source = "LogGenerator/GSM/GSMLogGenerator";
 
 // What an object that does not belong into a display is called in the failure's text.

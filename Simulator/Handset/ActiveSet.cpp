@@ -1,8 +1,8 @@
-#include "Simulator/GSM/ActiveSet.h"
+#include "Simulator/Handset/ActiveSet.h"
 
 #include <algorithm>
 
-#include "Simulator/GSM/CellSelection.h"
+#include "Simulator/Handset/CellSelection.h"
 
 namespace kelvasi::sim::gsm {
 

@@ -4,7 +4,7 @@
 #include <cstdint>
 #include <optional>
 
-#include "Simulator/GSM/Phase.h"
+#include "Simulator/Handset/Phase.h"
 #include "Simulator/Radio/Cell.h"
 
 namespace kelvasi::sim::gsm {

@@ -1,4 +1,4 @@
-#include "LogGenerator/GSM/SimInfo.h"
+#include "LogGenerator/Daemon/SimInfo.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
