@@ -1,7 +1,10 @@
 #include "Platform/Plist/BinaryObject.h"
 
+#include <algorithm>
 #include <bit>
 #include <cmath>
+#include <string>
+#include <string_view>
 
 #include "Platform/Plist/BinaryTable.h"
 #include "Platform/Plist/Utf8.h"
@@ -12,33 +15,55 @@ namespace {
 
 using Span = std::span<const std::uint8_t>;
 
-bool isSafeAscii(Span content) {
-  return isCleanUtf8({reinterpret_cast<const char*>(content.data()), content.size()});
+constexpr double from1970To2001 = 978307200;
+
+PlistValue asciiText(Span content) {
+  const std::string_view text(reinterpret_cast<const char*>(content.data()), content.size());
+  return isCleanUtf8(text) ? PlistValue(text) : PlistValue();
 }
 
-bool isSafeUtf16(Span content) {
-  bool expectsLow = false;
+PlistValue utf16Text(Span content) {
+  std::string text;
+  char32_t high = 0;  // the first of a pair, until the second comes
   for (std::size_t at = 0; at + 1 < content.size(); at += 2) {
-    const std::uint64_t unit = bigEndian(content.subspan(at, 2));
+    const auto unit = static_cast<char32_t>(bigEndian(content.subspan(at, 2)));
     const bool isLow = unit >= 0xdc00 && unit <= 0xdfff;
-    if (unit == 0 || isLow != expectsLow) return false;
-    expectsLow = unit >= 0xd800 && unit <= 0xdbff;
+    if (unit == 0 || isLow != (high != 0)) return {};
+    const bool isHigh = unit >= 0xd800 && unit <= 0xdbff;
+    if (!isHigh) appendUtf8(text, isLow ? 0x10000 + ((high & 0x3ff) << 10) + (unit & 0x3ff) : unit);
+    high = isHigh ? unit : 0;
   }
-  return !expectsLow;
+  return high == 0 ? PlistValue(std::move(text)) : PlistValue();
 }
 
-bool isSafeInteger(const BinaryObject& object) {
-  if (object.count > 4 || object.content.size() >> object.count == 0) return false;
-  return object.count < 4 || bigEndian(object.content.first(8)) == 0;
+// Up to four bytes without a sign, eight with one; sixteen for those beyond.
+PlistValue integerOf(const BinaryObject& object) {
+  const std::size_t size = std::size_t{1} << object.count;
+  if (object.count > 4 || object.content.size() < size) return {};
+  const std::uint64_t number = bigEndian(object.content.first(size).last(std::min<std::size_t>(size, 8)));
+  if (object.count == 3) return static_cast<std::int64_t>(number);
+  if (object.count == 4 && bigEndian(object.content.first(8)) != 0) return {};
+  return number;
 }
 
-bool isSafeDate(const BinaryObject& object) {
-  if (object.count != 3 || object.content.size() < 8) return false;
-  return std::isfinite(std::bit_cast<double>(bigEndian(object.content.first(8))));
+PlistValue realOf(const BinaryObject& object) {
+  if (object.count == 2 && object.content.size() >= 4)
+    return double{std::bit_cast<float>(static_cast<std::uint32_t>(bigEndian(object.content.first(4))))};
+  if (object.count == 3 && object.content.size() >= 8)
+    return std::bit_cast<double>(bigEndian(object.content.first(8)));
+  return {};
 }
 
-bool isSafeReal(const BinaryObject& object) {
-  return (object.count == 2 || object.count == 3) && object.content.size() >> object.count != 0;
+PlistValue dateOf(const BinaryObject& object) {
+  if (object.count != 3 || object.content.size() < 8) return {};
+  const auto seconds = std::bit_cast<double>(bigEndian(object.content.first(8)));
+  return std::isfinite(seconds) ? PlistValue(PlistDate{seconds + from1970To2001}) : PlistValue();
+}
+
+PlistValue flagOf(const BinaryObject& object) {
+  constexpr std::uint64_t no = 8;
+  constexpr std::uint64_t yes = 9;
+  return object.count == no || object.count == yes ? PlistValue(object.count == yes) : PlistValue();
 }
 
 }  // namespace
@@ -56,31 +81,31 @@ std::optional<BinaryObject> binaryObjectIn(Span bytes) {
   return object;
 }
 
-bool isSafeScalar(const BinaryObject& object) {
+PlistValue scalarOf(const BinaryObject& object) {
   switch (object.kind) {
     case BinaryObject::simple:
-      return object.count == 8 || object.count == 9;  // false and true
+      return flagOf(object);
     case BinaryObject::integer:
-      return isSafeInteger(object);
+      return integerOf(object);
     case BinaryObject::real:
-      return isSafeReal(object);
+      return realOf(object);
     case BinaryObject::date:
-      return isSafeDate(object);
+      return dateOf(object);
     default:
-      return false;
+      return {};
   }
 }
 
-bool isSafeContent(BinaryObject::Kind kind, Span content) {
+PlistValue contentOf(BinaryObject::Kind kind, Span content) {
   switch (kind) {
     case BinaryObject::data:
-      return true;
+      return Bytes(content.begin(), content.end());
     case BinaryObject::ascii:
-      return isSafeAscii(content);
+      return asciiText(content);
     case BinaryObject::utf16:
-      return isSafeUtf16(content);
+      return utf16Text(content);
     default:
-      return false;
+      return {};
   }
 }
 

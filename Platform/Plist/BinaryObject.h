@@ -5,6 +5,8 @@
 #include <optional>
 #include <span>
 
+#include "Plist/PlistValue.h"
+
 namespace kelvasi {
 
 struct BinaryObject {
@@ -32,10 +34,11 @@ struct BinaryObject {
 // The object that begins with the first of `bytes`; nothing when its count is not all there.
 std::optional<BinaryObject> binaryObjectIn(std::span<const std::uint8_t> bytes);
 
-// Whether an object that is not counted is a value, and all there. Integers fit 64 bits, dates are finite.
-bool isSafeScalar(const BinaryObject& object);
+// The value of an object that is not counted; absent when it is none or not all there. Integers fit 64 bits,
+// dates are finite.
+PlistValue scalarOf(const BinaryObject& object);
 
-// Whether these are the bytes of data or of a string: UTF-8, or big-endian UTF-16, free of NUL.
-bool isSafeContent(BinaryObject::Kind kind, std::span<const std::uint8_t> content);
+// The string or data that has this content; absent for text that is not clean, and for other kinds.
+PlistValue contentOf(BinaryObject::Kind kind, std::span<const std::uint8_t> content);
 
 }  // namespace kelvasi

@@ -1,9 +1,7 @@
 // A date goes through a binary document that holds nothing else, where it is a double.
 #include <array>
 #include <bit>
-#include <cstring>
 
-#include "Platform/Plist/BinaryTable.h"
 #include "Platform/Plist/LibplistNode.h"
 
 namespace kelvasi {
@@ -25,17 +23,6 @@ constexpr std::array<std::uint8_t, 50> emptyDate{
     0,         0,   0,   0,   0,   0,   0,   datePlace + dateSize};
 
 }  // namespace
-
-PlistDate dateFromLibplist(plist_t node) {
-  char* document = nullptr;
-  std::uint32_t size = 0;
-  plist_to_bin(node, &document, &size);
-  const std::unique_ptr<char, decltype(&plist_to_bin_free)> owned(document, &plist_to_bin_free);
-  if (size < datePlace + dateSize) return {};
-  std::array<std::uint8_t, 8> bytes{};
-  std::memcpy(bytes.data(), document + datePlace + 1, bytes.size());
-  return {std::bit_cast<double>(bigEndian(bytes)) + from1970To2001};
-}
 
 LibplistNode dateToLibplist(PlistDate date) {
   std::array<std::uint8_t, emptyDate.size()> document = emptyDate;

@@ -1,69 +1,36 @@
 #include "Platform/Plist/LibplistSerialiser.h"
 
-#include <locale.h>  // NOLINT(modernize-deprecated-headers): for newlocale, which is POSIX and not C
-
 #include <memory>
 #include <string_view>
 
-#include "Platform/Plist/BinaryGuard.h"
+#include "Platform/Plist/BinaryReader.h"
 #include "Platform/Plist/LibplistNode.h"
-#include "Platform/Plist/XmlEmptyKeys.h"
-#include "Platform/Plist/XmlGuard.h"
+#include "Platform/Plist/PlainLocale.h"
+#include "Platform/Plist/XmlReader.h"
 
 namespace kelvasi {
 
 namespace {
-
-// The library reads reals as the locale writes them: under one with a decimal comma, 1.5 would be 1.
-class PlainLocale {
- public:
-  PlainLocale() : plain_(newlocale(LC_ALL_MASK, "C", nullptr)), previous_(uselocale(plain_)) {}
-  ~PlainLocale() {
-    uselocale(previous_);
-    if (plain_) freelocale(plain_);
-  }
-  PlainLocale(const PlainLocale&) = delete;
-  PlainLocale& operator=(const PlainLocale&) = delete;
-
- private:
-  locale_t plain_;
-  locale_t previous_;
-};
-
-using Reader = void (*)(const char* document, std::uint32_t size, plist_t* node);
 
 // A peer may pad what it sends to a size that it likes.
 bool isPadding(char character) {
   return std::string_view("\0 \t\r\n", 5).find(character) != std::string_view::npos;
 }
 
-LibplistNode read(Reader reader, std::string_view document) {
-  plist_t node = nullptr;
-  reader(document.data(), static_cast<std::uint32_t>(document.size()), &node);
-  return LibplistNode(node);
-}
-
 // What ends a binary document may look like padding: it is the longest that will do.
-LibplistNode nodeFromBinary(std::string_view document) {
-  while (!isSafeBinaryPlist({reinterpret_cast<const std::uint8_t*>(document.data()), document.size()})) {
-    if (document.empty() || !isPadding(document.back())) return nullptr;
-    document.remove_suffix(1);
+std::optional<PlistValue> readBinary(std::span<const std::uint8_t> document) {
+  while (true) {
+    if (auto value = readBinaryPlist(document)) return value;
+    if (document.empty() || !isPadding(static_cast<char>(document.back()))) return std::nullopt;
+    document = document.first(document.size() - 1);
   }
-  return read(plist_from_bin, document);
 }
 
-LibplistNode nodeFromXml(std::string_view document) {
+std::optional<PlistValue> readXml(std::string_view document) {
   constexpr std::string_view byteOrderMark = "\xef\xbb\xbf";
   if (document.starts_with(byteOrderMark)) document.remove_prefix(byteOrderMark.size());
   while (!document.empty() && isPadding(document.back())) document.remove_suffix(1);
-  if (!isSafeXmlPlist(document)) return nullptr;
-  if (mayHaveEmptyKeys(document)) return read(plist_from_xml, withEmptyKeysOpened(document));
-  return read(plist_from_xml, document);
-}
-
-LibplistNode nodeFrom(std::span<const std::uint8_t> bytes) {
-  const std::string_view document(reinterpret_cast<const char*>(bytes.data()), bytes.size());
-  return document.starts_with(binaryPlistMagic) ? nodeFromBinary(document) : nodeFromXml(document);
+  return readXmlPlist(document);
 }
 
 // A reader would take a bare carriage return for a line feed (XML 1.0, section 2.11).
@@ -84,10 +51,8 @@ Bytes withCarriageReturnsKept(std::string_view text) {
 }  // namespace
 
 std::optional<PlistValue> LibplistSerialiser::parse(std::span<const std::uint8_t> bytes) const {
-  const PlainLocale locale;
-  const LibplistNode node = nodeFrom(bytes);
-  if (!node) return std::nullopt;
-  return fromLibplist(node.get());
+  const std::string_view document(reinterpret_cast<const char*>(bytes.data()), bytes.size());
+  return document.starts_with(binaryPlistMagic) ? readBinary(bytes) : readXml(document);
 }
 
 std::optional<Bytes> LibplistSerialiser::serialiseXml(const PlistValue& value) const {

@@ -1,4 +1,4 @@
-// Property lists through libplist.
+// Property lists: read by XmlReader.h and BinaryReader.h, written through libplist.
 #pragma once
 
 #include <cstdint>
@@ -9,8 +9,7 @@
 
 namespace kelvasi {
 
-// Reading. The document is checked as a whole before the library sees it: its bounds are those of
-// PlistLimits.h, XmlGuard.h and BinaryGuard.h say what else is refused. In what is accepted
+// Reading. The bounds are those of PlistLimits.h; the readers say what else is refused. In what is accepted
 // - texts are UTF-8 without NUL;
 // - NUL bytes and white space behind the document are no part of it, as a peer may pad what it sends;
 // - of the entries with one key the last stands, at the place of the first;

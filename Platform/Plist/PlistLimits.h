@@ -1,5 +1,4 @@
-// How much of a property list from outside is accepted before the library that parses it sees a byte. The
-// library recurses through what it builds, so an unbounded document ends the process.
+// How much of a property list from outside is accepted.
 #pragma once
 
 #include <cstddef>
@@ -9,7 +8,7 @@ namespace kelvasi::plistLimits {
 constexpr std::size_t documentBytes = std::size_t{16} << 20;
 constexpr int levels = 128;                       // dictionaries and arrays inside one another
 constexpr std::size_t values = 1'000'000;         // keys and values, each as often as it is referred to
-constexpr std::size_t dictionaryEntries = 16384;  // the library's look-up slows down beyond
+constexpr std::size_t dictionaryEntries = 16384;  // the library that writes them slows down beyond
 // Bytes of all strings and data of a binary document, each as often as it is referred to.
 constexpr std::size_t contentBytes = std::size_t{64} << 20;
 

@@ -1,6 +1,8 @@
 #include "Platform/Plist/Utf8.h"
 
 #include <algorithm>
+#include <cstdint>
+#include <cstring>
 
 namespace kelvasi {
 
@@ -18,10 +20,6 @@ unsigned char byteAt(std::string_view text, std::size_t at) {
   return static_cast<unsigned char>(text[at]);
 }
 
-bool isScalarValue(char32_t code) {
-  return code <= 0x10ffff && (code < 0xd800 || code > 0xdfff);
-}
-
 bool isXmlCharacter(char32_t code) {
   return code >= 0x20 ? code != 0xfffe && code != 0xffff : code == '\t' || code == '\n' || code == '\r';
 }
@@ -37,13 +35,42 @@ Utf8Character read(std::string_view text, const Form& form) {
   return {code, form.length};
 }
 
+// Eight characters at once: whether all are ASCII and none is NUL. A byte of `less` has its highest bit set
+// where the character is NUL or no ASCII; behind a NUL others may have, too.
+bool isAsciiWord(const char* characters) {
+  constexpr std::uint64_t highest = 0x8080808080808080;
+  constexpr std::uint64_t ones = 0x0101010101010101;
+  std::uint64_t word = 0;
+  std::memcpy(&word, characters, sizeof word);
+  const std::uint64_t less = word - ones;
+  return ((less | word) & highest) == 0;
+}
+
 // Most texts are nothing else, and need no closer look.
 std::size_t asciiPrefix(std::string_view text) {
+  std::size_t words = 0;
+  while (words + 8 <= text.size() && isAsciiWord(text.data() + words)) words += 8;
   const auto isOther = [](unsigned char byte) { return byte == 0 || byte >= 0x80; };
-  return static_cast<std::size_t>(std::ranges::find_if(text, isOther) - text.begin());
+  return static_cast<std::size_t>(std::ranges::find_if(text.substr(words), isOther) - text.begin());
 }
 
 }  // namespace
+
+bool isScalarValue(char32_t code) {
+  return code <= 0x10ffff && (code < 0xd800 || code > 0xdfff);
+}
+
+void appendUtf8(std::string& text, char32_t code) {
+  const auto form = std::find_if(std::rbegin(forms), std::rend(forms),
+                                 [&](const Form& each) { return code >= each.least; });
+  unsigned shift = static_cast<unsigned>(form->length - 1) * 6;
+  const auto payload = static_cast<unsigned char>(~form->mask);
+  text += static_cast<char>(form->lead | (code >> shift & payload));
+  while (shift != 0) {
+    shift -= 6;
+    text += static_cast<char>(0x80 | (code >> shift & 0x3f));
+  }
+}
 
 Utf8Character firstCharacter(std::string_view text) {
   for (const Form& form : forms) {

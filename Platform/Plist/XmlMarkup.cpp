@@ -1,9 +1,7 @@
 #include "Platform/Plist/XmlMarkup.h"
 
 #include <algorithm>
-#include <array>
 #include <cctype>
-#include <string>
 
 namespace kelvasi {
 
@@ -16,10 +14,8 @@ bool hasClosedQuotes(std::string_view text) {
 
 }  // namespace
 
-bool isPlistVersion(std::string_view attributes) {
-  constexpr std::array<std::string_view, 5> known{"", "version=\"1.0\"", "version='1.0'", "version=\"0.9\"",
-                                                  "version='0.9'"};
-  return std::ranges::find(known, attributes) != known.end();
+bool isPlistVersion(std::string_view attribute, std::string_view value) {
+  return attribute == "version" && (value == "1.0" || value == "0.9");
 }
 
 bool isPlainComment(std::string_view text) {
@@ -28,15 +24,16 @@ bool isPlainComment(std::string_view text) {
 }
 
 bool isPlainDoctype(std::string_view text) {
-  return text.starts_with("DOCTYPE") && text.find_first_of("[<") == std::string_view::npos &&
-         hasClosedQuotes(text);
+  return text.find_first_of("[<>") == std::string_view::npos && hasClosedQuotes(text);
+}
+
+bool isPlainEncoding(std::string_view name) {
+  return std::ranges::equal(name, std::string_view("utf-8"),
+                            [](unsigned char one, char other) { return std::tolower(one) == other; });
 }
 
 bool isPlainInstruction(std::string_view text) {
-  std::string lower(text);
-  std::ranges::transform(lower, lower.begin(), [](unsigned char letter) { return std::tolower(letter); });
-  return hasClosedQuotes(text) &&
-         (lower.find("encoding") == std::string::npos || lower.find("utf-8") != std::string::npos);
+  return hasClosedQuotes(text);
 }
 
 }  // namespace kelvasi

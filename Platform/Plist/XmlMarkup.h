@@ -1,17 +1,19 @@
-// What may stand around the elements of an XML property list. Readers differ on where odd markup ends, so a
-// document is accepted only where they agree. Each text is the token's (see XmlTokens.h).
+// The markup around the values of an XML property list.
 #pragma once
 
 #include <string_view>
 
 namespace kelvasi {
 
-// The attributes of the plist element: none, or a version of the format.
-bool isPlistVersion(std::string_view attributes);
+// Whether an attribute of the plist element is one that it may have.
+bool isPlistVersion(std::string_view attribute, std::string_view value);
+// Whether a comment is one that all readers take for the same (XML 1.0, section 2.5).
 bool isPlainComment(std::string_view text);
-// A document type without declarations of its own.
+// Whether what follows "<!DOCTYPE" declares nothing itself.
 bool isPlainDoctype(std::string_view text);
-// The XML declaration may name no encoding but UTF-8.
+// Whether an encoding is UTF-8.
+bool isPlainEncoding(std::string_view name);
+// Whether readers agree on where a processing instruction ends.
 bool isPlainInstruction(std::string_view text);
 
 }  // namespace kelvasi

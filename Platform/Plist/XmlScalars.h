@@ -1,20 +1,29 @@
-// What the elements of an XML property list that hold no others may contain. The library takes whatever it
-// finds there for some value or other: letters for 0, the 30th of February for the 1st of March.
+// What the elements of an XML property list that hold no others contain. Each gives nothing for a text that
+// is no such value, white space around it aside.
 #pragma once
 
+#include <optional>
+#include <string>
 #include <string_view>
+
+#include "Plist/PlistValue.h"
 
 namespace kelvasi {
 
-// A decimal or hexadecimal number from -2^63 to 2^64 - 1. Leading zeros, octal to the library, are refused.
-bool isXmlInteger(std::string_view text);
-// A decimal number, an infinity or "nan".
-bool isXmlReal(std::string_view text);
+// A decimal or hexadecimal number from -2^63 to 2^64 - 1. Leading zeros, octal to some readers, are refused.
+std::optional<PlistValue> xmlInteger(std::string_view text);
+// A decimal number, an infinity or "nan"; one too large for a double is an infinity.
+std::optional<PlistValue> xmlReal(std::string_view text);
 // As in 2024-03-05T14:07:09Z.
-bool isXmlDate(std::string_view text);
+std::optional<PlistValue> xmlDate(std::string_view text);
 // Base64, white space anywhere.
-bool isXmlData(std::string_view text);
-// Texts refer to characters and to XML's own five entities only; no reference yields NUL.
-bool isXmlString(std::string_view text);
+std::optional<PlistValue> xmlData(std::string_view text);
+
+// Appends a text with its references resolved: to characters and to XML's own five entities only, none of
+// them NUL. False where it holds another.
+bool appendXmlText(std::string& whole, std::string_view text);
+
+// The text without the white space around it.
+std::string_view trimmed(std::string_view text);
 
 }  // namespace kelvasi

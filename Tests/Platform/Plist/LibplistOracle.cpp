@@ -1,11 +1,21 @@
+#include "Tests/Platform/Plist/LibplistOracle.h"
+
+#include <array>
+#include <bit>
 #include <cstdlib>
+#include <cstring>
 #include <string>
 
+#include "Platform/Plist/BinaryReader.h"
+#include "Platform/Plist/BinaryTable.h"
 #include "Platform/Plist/LibplistNode.h"
+#include "Platform/Plist/PlainLocale.h"
 
-namespace kelvasi {
+namespace kelvasi::testing {
 
 namespace {
+
+PlistValue fromLibplist(plist_t node);
 
 struct Free {
   // NOLINTNEXTLINE(cppcoreguidelines-no-malloc): this is the RAII of what a library allocated
@@ -77,7 +87,20 @@ PlistValue uidFrom(plist_t node) {
   return PlistDictionary::make({{"CF$UID", static_cast<std::int64_t>(bits)}});
 }
 
-}  // namespace
+// The library's own call keeps dates as 32-bit seconds and loses the fraction of those before 2001.
+PlistValue dateFrom(plist_t node) {
+  constexpr double from1970To2001 = 978307200;
+  constexpr std::size_t datePlace = 8;  // after the magic
+  constexpr std::size_t dateSize = 9;   // the object's kind and a double
+  char* document = nullptr;
+  std::uint32_t size = 0;
+  plist_to_bin(node, &document, &size);
+  const std::unique_ptr<char, decltype(&plist_to_bin_free)> owned(document, &plist_to_bin_free);
+  if (size < datePlace + dateSize) return {};
+  std::array<std::uint8_t, 8> bytes{};
+  std::memcpy(bytes.data(), document + datePlace + 1, bytes.size());
+  return PlistDate{std::bit_cast<double>(bigEndian(bytes)) + from1970To2001};
+}
 
 PlistValue fromLibplist(plist_t node) {
   switch (plist_get_node_type(node)) {
@@ -92,7 +115,7 @@ PlistValue fromLibplist(plist_t node) {
     case PLIST_DATA:
       return dataFrom(node);
     case PLIST_DATE:
-      return dateFromLibplist(node);
+      return dateFrom(node);
     case PLIST_ARRAY:
       return arrayFrom(node);
     case PLIST_DICT:
@@ -104,4 +127,17 @@ PlistValue fromLibplist(plist_t node) {
   }
 }
 
-}  // namespace kelvasi
+}  // namespace
+
+std::optional<PlistValue> readWithLibplist(std::span<const std::uint8_t> document) {
+  const PlainLocale locale;
+  const std::string_view text(reinterpret_cast<const char*>(document.data()), document.size());
+  plist_t node = nullptr;
+  const auto read = text.starts_with(binaryPlistMagic) ? plist_from_bin : plist_from_xml;
+  read(text.data(), static_cast<std::uint32_t>(text.size()), &node);
+  const LibplistNode owned(node);
+  if (!node) return std::nullopt;
+  return fromLibplist(node);
+}
+
+}  // namespace kelvasi::testing

@@ -1,0 +1,16 @@
+// XML property lists, read into values.
+#pragma once
+
+#include <optional>
+#include <string_view>
+
+#include "Plist/PlistValue.h"
+
+namespace kelvasi {
+
+// Nothing for a document that is not one property list in UTF-8, is beyond PlistLimits.h, declares entities
+// of its own, or holds something that readers differ on. While it is read it takes at most some ten times its
+// size in memory.
+std::optional<PlistValue> readXmlPlist(std::string_view document);
+
+}  // namespace kelvasi
