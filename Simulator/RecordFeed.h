@@ -17,6 +17,7 @@ struct RecordRule {
   std::optional<Bytes> (*encode)(const World& world, const PlistSerialiser& plists);
   std::chrono::milliseconds atMostEvery{0};       // a measurement that always changes
   std::chrono::milliseconds atLeastEvery{10000};  // repeated although nothing changed
+  bool followsTheOneBefore = false;               // sent as well whenever the record before it is
 };
 
 // An encoder that needs no property lists, as a rule takes it.
@@ -35,14 +36,10 @@ class RecordFeed {
   // `isTurningPoint`: something has changed that several records tell of, so none may be late. A record is
   // due at once when there was none before.
   void advance(WorldTime now, const World& world, bool isTurningPoint, Messages& messages) {
+    bool wasSent = false;
     for (std::size_t place = 0; place < rules_.size(); ++place) {
-      const auto since = now - sent_[place].at;
-      if (!isTurningPoint && sent_[place].record && since < rules_[place].atMostEvery) continue;
-      auto record = rules_[place].encode(world, plists_);
-      if (record == sent_[place].record && since < rules_[place].atLeastEvery) continue;
-      sent_[place] = {record, now};
-      if (!record) continue;
-      append(std::move(*record), now, messages);
+      const bool mustFollow = wasSent && rules_[place].followsTheOneBefore;
+      wasSent = send(place, {now, isTurningPoint, mustFollow}, world, messages);
     }
   }
 
@@ -54,6 +51,25 @@ class RecordFeed {
   }
 
  private:
+  struct Moment {
+    WorldTime now;
+    bool isTurningPoint;
+    bool mustFollow;
+  };
+
+  bool send(std::size_t place, const Moment& moment, const World& world, Messages& messages) {
+    const auto since = moment.now - sent_[place].at;
+    const bool isEarly = sent_[place].record && since < rules_[place].atMostEvery;
+    if (isEarly && !moment.isTurningPoint && !moment.mustFollow) return false;
+    auto record = rules_[place].encode(world, plists_);
+    const bool isOldNews = record == sent_[place].record && since < rules_[place].atLeastEvery;
+    if (isOldNews && !moment.mustFollow) return false;
+    sent_[place] = {record, moment.now};
+    if (!record) return false;
+    append(std::move(*record), moment.now, messages);
+    return true;
+  }
+
   static void append(Bytes record, WorldTime now, Messages& messages) {
     stampRecord(record, now);
     messages.push_back(logMessage(std::move(record)));

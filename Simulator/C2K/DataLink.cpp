@@ -57,6 +57,8 @@ void DataLink::pass(bool isTransferring, double carrierToInterference, double he
   inSecond_ += seconds;
   if (inSecond_ < 1 - seconds / 2) return;
   inSecond_ = 0;
+  const bool isQuiet = forwardNow_.bits == forward_.bits && reverseNow_.bits == reverse_.bits;
+  quietReports_ = isQuiet ? quietReports_ + 1 : 0;
   ++forwardNow_.sequence;
   ++reverseNow_.sequence;
   forward_ = forwardNow_;

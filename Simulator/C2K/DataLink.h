@@ -37,6 +37,9 @@ class DataLink {
   // As of the last whole second.
   const Report<ForwardCounters>& forward() const { return forward_; }
   const Report<ReverseCounters>& reverse() const { return reverse_; }
+  // Whether the report before the last one was the first without new packets: both rates have been told to be
+  // 0.
+  bool isTold() const { return quietReports_ > 1; }
 
  private:
   void receive(double carrierToInterference, double seconds);
@@ -49,6 +52,7 @@ class DataLink {
   Report<ForwardCounters> forwardNow_;
   Report<ReverseCounters> reverseNow_;
   double inSecond_ = 0;
+  int quietReports_ = 2;
 };
 
 }  // namespace kelvasi::sim::c2k

@@ -15,6 +15,11 @@ namespace {
 
 constexpr std::array counterLayout{Field{.name = "packets", .byte = 0, .width = 32}};
 
+// Off, and done with telling that it is.
+bool isSilent(const World& world) {
+  return world.evdo().state() == Evdo::State::inactive && world.dataLink().isTold();
+}
+
 Bytes counterBytes(std::uint32_t packets) {
   return RecordWriter(counterLayout).set("packets", packets).bytes();
 }
@@ -54,7 +59,7 @@ std::optional<Bytes> evdoActiveSetRecord(const World& world) {
 
 std::optional<Bytes> forwardRateRecord(const World& world) {
   using namespace evdoForwardRate;
-  if (world.evdo().state() == Evdo::State::inactive) return std::nullopt;
+  if (isSilent(world)) return std::nullopt;
   const auto& report = world.dataLink().forward();
   RecordWriter record(logCode, layout, firstCounter);
   record.set("sequence number", report.sequence);
@@ -64,7 +69,7 @@ std::optional<Bytes> forwardRateRecord(const World& world) {
 
 std::optional<Bytes> reverseRateRecord(const World& world) {
   using namespace evdoReverseRate;
-  if (world.evdo().state() == Evdo::State::inactive) return std::nullopt;
+  if (isSilent(world)) return std::nullopt;
   const auto& report = world.dataLink().reverse();
   RecordWriter record(logCode, layout, firstCounter);
   record.set("sequence number", report.sequence);

@@ -87,7 +87,7 @@ Bytes activeSetSubPacket(const World& world) {
     const std::size_t energy = pilot + pilotEnergyAt(fingers);
     bytes.resize(energy + 4);
     put16(bytes, pilot + fieldIn(pilotLayout, "PN offset").byte, world.cell(active[place]).code);
-    put16(bytes, energy, pilotEnergy(world.oneXRatios()[active[place]]));
+    put16(bytes, energy, pilotEnergy(reportedRatio(world.oneXRatios()[active[place]])));
   }
   return subPacket(activeSetId, std::move(bytes));
 }

@@ -1,14 +1,21 @@
 #include "Simulator/Daemon/CellList.h"
 
+#include <cmath>
+
 #include "LogGenerator/Daemon/CellRows.h"
 #include "LogGenerator/LogCode.h"
 #include "Simulator/Daemon/PropertyListRecord.h"
 #include "Simulator/Radio/EutraBand.h"
+#include "Simulator/Radio/Reported.h"
 #include "Telvon/CellMonitor.h"
 
 namespace kelvasi::sim {
 
 namespace {
+
+int whole(double value) {
+  return static_cast<int>(std::lround(value));
+}
 
 constexpr int tddBandA = 1;  // 3GPP TS 25.102, 5.2, counted from a
 
@@ -75,6 +82,12 @@ PlistValue::Dictionary entryOf(const MeasuredCell& measured, std::string_view ty
 }
 
 }  // namespace
+
+MeasuredCell measuredCell(const Cell& cell, const Reception& heard) {
+  if (cell.technology == Technology::gsm)
+    return {.cell = cell, .level = whole(reportedGsmLevel(heard)), .ecNo = {}};
+  return {.cell = cell, .level = whole(reportedRscp(heard)), .ecNo = whole(reportedEcNo(heard))};
+}
 
 std::optional<Bytes> cellInfoRecord(const CellList& cells, const PlistSerialiser& plists) {
   const auto list = PlistArray::make();

@@ -6,6 +6,7 @@
 
 #include "Platform/PlistSerialiser.h"
 #include "Simulator/Radio/Cell.h"
+#include "Simulator/Radio/RadioModel.h"
 
 namespace kelvasi::sim {
 
@@ -15,6 +16,9 @@ struct MeasuredCell {
   std::optional<int> level;
   std::optional<int> ecNo;  // whole dB, of a UMTS cell
 };
+
+// As a handset reports it.
+MeasuredCell measuredCell(const Cell& cell, const Reception& heard);
 
 struct CellList {
   std::optional<MeasuredCell> serving;

@@ -18,10 +18,12 @@ struct File {
 };
 
 constexpr std::string_view technologiesKey = "kSimFile_RATMODE";
+constexpr std::string_view operatorsListKey = "kSimFile_OPLMNAcT";
 
-// Of a subscriber of the home network, 999 01; the PLMN lists are in the coding of 3GPP TS 31.102.
+// Of a subscriber of the home network, 999 01; the PLMN lists are in the coding of 3GPP TS 31.102. The last
+// digit of the ICCID checks the others (ITU-T E.118).
 constexpr std::array files{
-    File{"kSimFile_ICCID", "8999901000000000018"},
+    File{"kSimFile_ICCID", "8999901000000000013"},
     File{"kSimFile_MSISDN", "+99901555010"},
     File{"kSimFile_MBDN", "+99901555000"},
     File{"kSimFile_HPPLMN", "05"},
@@ -34,16 +36,20 @@ constexpr std::array files{
     File{technologiesKey, {}},
     File{"kSimFile_PNN", "Test Network"},
     File{"kSimFile_OPL", "99F9100000FFFE01"},
-    File{"kSimFile_OPLMNAcT", "99F9208080FFFFFF0000"},
+    File{operatorsListKey, {}},
 };
 static_assert(std::ranges::equal(files, simFiles::files, {}, &File::key, &simFiles::SimFile::key));
 
 }  // namespace
 
-std::optional<Bytes> simFilesRecord(const PlistSerialiser& plists, std::string_view technologies) {
+const SimTechnologies gsmAndUmts{.names = "GSM and UMTS", .operatorsList = "99F9208080FFFFFF0000"};
+const SimTechnologies gsmUmtsAndLte{.names = "GSM, UMTS and LTE", .operatorsList = "99F920C080FFFFFF0000"};
+
+std::optional<Bytes> simFilesRecord(const PlistSerialiser& plists, const SimTechnologies& technologies) {
   const auto contents = PlistDictionary::make();
   for (const File& file : files) contents->set(file.key, file.contents);
-  contents->set(technologiesKey, technologies);
+  contents->set(technologiesKey, technologies.names);
+  contents->set(operatorsListKey, technologies.operatorsList);
   return propertyListRecord(simFilesLogCode, contents, plists);
 }
 

@@ -8,9 +8,16 @@
 
 namespace kelvasi::sim::gsm {
 
-// Record 0xFF0000, with the radio technologies that the subscriber may use; nothing when the files cannot be
-// serialised.
-std::optional<Bytes> simFilesRecord(const PlistSerialiser& plists,
-                                    std::string_view technologies = "GSM and UMTS");
+// The radio technologies that the subscriber may use, and the file that names the operator's preferred
+// networks with their technologies.
+struct SimTechnologies {
+  std::string_view names;
+  std::string_view operatorsList;
+};
+extern const SimTechnologies gsmAndUmts;
+extern const SimTechnologies gsmUmtsAndLte;
+
+// Record 0xFF0000; nothing when the files cannot be serialised.
+std::optional<Bytes> simFilesRecord(const PlistSerialiser& plists, const SimTechnologies& technologies);
 
 }  // namespace kelvasi::sim::gsm

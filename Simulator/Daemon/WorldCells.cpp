@@ -1,19 +1,11 @@
 #include "Simulator/Daemon/WorldCells.h"
 
-#include <cmath>
-
 namespace kelvasi::sim::gsm {
 
 namespace {
 
-int whole(double value) {
-  return static_cast<int>(std::lround(value));
-}
-
 MeasuredCell measured(const World& world, std::size_t place) {
-  MeasuredCell result{.cell = world.cell(place), .level = whole(world.reception(place).level), .ecNo = {}};
-  if (result.cell.technology == Technology::umts) result.ecNo = whole(world.reception(place).ecNo);
-  return result;
+  return measuredCell(world.cell(place), world.reception(place));
 }
 
 }  // namespace

@@ -30,13 +30,16 @@ Record ofContexts(const World& world, const PlistSerialiser& plists) {
   return pdpContextRecord(world.registration().packetSwitched().contexts(), plists);
 }
 Record ofSim(const World&, const PlistSerialiser& plists) {
-  return simFilesRecord(plists);
+  return simFilesRecord(plists, gsmAndUmts);
 }
 
-// The daemon's own records first: where a section shows both, the baseband's record is the later one.
+// The daemon's own records first: where a section shows both, the baseband's record is the later one. On GSM
+// it is the other way round with the ranked cells, as that record empties the section of the UMTS neighbours,
+// of which only the daemon's list tells there.
 constexpr std::array rules{
     Rule{.encode = ofSim, .atMostEvery = 24h, .atLeastEvery = 24h},
-    Rule{.encode = ofCellList, .atMostEvery = 2s},
+    Rule{.encode = recordOf<rankedGsmCellsRecord>, .atMostEvery = 2s},
+    Rule{.encode = ofCellList, .atMostEvery = 2s, .followsTheOneBefore = true},
     Rule{.encode = ofContexts, .atMostEvery = 2s},
     Rule{.encode = ofRegistration<registrationStateRecord>},
     Rule{.encode = ofRegistration<mmStateRecord>},
@@ -48,7 +51,7 @@ constexpr std::array rules{
     Rule{.encode = recordOf<cipheringRecord>},
     Rule{.encode = recordOf<transmitPowerRecord>, .atMostEvery = 400ms},
     Rule{.encode = recordOf<cellSetsRecord>, .atMostEvery = 400ms},
-    Rule{.encode = recordOf<neighbourSetsRecord>, .atMostEvery = 400ms},
+    Rule{.encode = recordOf<rankedUmtsCellsRecord>, .atMostEvery = 400ms},
     Rule{.encode = recordOf<hsdpaRecord>},
     Rule{.encode = recordOf<blockErrorRecord>},
     Rule{.encode = recordOf<rrStateRecord>},

@@ -62,10 +62,9 @@ std::optional<Bytes> umtsServingCellRecord(const World& world) {
 }
 
 std::optional<Bytes> cipheringRecord(const World& world) {
-  if (!world.isOn(Technology::umts)) return std::nullopt;
   const auto& record = ciphering::record;
   return RecordWriter(record.logCode, record.layout, record.minimumLength)
-      .set("ciphering", world.connection().isCiphered() ? 1 : 0)
+      .set("ciphering", world.isOn(Technology::umts) && world.connection().isCiphered() ? 1 : 0)
       .bytes();
 }
 

@@ -35,8 +35,8 @@ void ActiveSet::keepGoodMembers(std::size_t serving, const std::vector<Reception
 
 void ActiveSet::addNewMembers(std::size_t serving, const std::vector<Reception>& receptions) {
   for (std::size_t cell = 0; cell < cells_.size() && members_.size() < largest; ++cell) {
-    if (cells_[cell].technology == Technology::umts && !contains(cell) &&
-        isSuitable(cells_[cell], receptions[cell]) &&
+    if (cells_[cell].technology == Technology::umts && cells_[cell].frequency == cells_[serving].frequency &&
+        !contains(cell) && isSuitable(cells_[cell], receptions[cell]) &&
         receptions[cell].ecNo > receptions[serving].ecNo - addWindow)
       members_.push_back(cell);
   }

@@ -13,7 +13,8 @@ constexpr LocationArea forbiddenArea{homePlmn, 4199};
 
 constexpr std::uint16_t firstArfcn = 12;
 constexpr std::uint16_t arfcnStep = 4;  // a cell's own BCCH and the three that it hops over
-constexpr std::uint32_t rncId = 0x2A5;
+constexpr std::uint32_t homeRnc = 0x2A5;
+constexpr std::uint32_t partnerRnc = 0x3C1;
 constexpr std::uint16_t firstCellId = 21001;
 constexpr std::uint16_t scramblingCodeStep = 16;
 
@@ -38,8 +39,9 @@ Cell gsmCell(Cell site, std::uint16_t number) {
 Cell umtsCell(Cell site, std::uint16_t number) {
   site.technology = Technology::umts;
   site.megahertz = 2000;
-  site.id = (rncId << 16) | (firstCellId + 500u + number);
-  site.frequency = umtsFrequency;
+  const Plmn network = site.locationArea.plmn;
+  site.id = ((network == homePlmn ? homeRnc : partnerRnc) << 16) | (firstCellId + 500u + number);
+  site.frequency = umtsFrequencyOf(network);
   site.code = static_cast<std::uint16_t>(number * scramblingCodeStep);
   site.hasTwoCarriers = number % 3 == 0;
   return site;

@@ -1,5 +1,7 @@
 #include "Simulator/Handset/CellSelection.h"
 
+#include <algorithm>
+
 namespace kelvasi::sim::gsm {
 
 namespace {
@@ -26,6 +28,14 @@ constexpr double gsmReselectionTime = 5;
 constexpr double handoverTime = 1.5;
 constexpr double technologyTime = 3;
 
+bool isPoor(const Reception& umts) {
+  return umts.level < poorRscp || umts.ecNo < poorEcNo;
+}
+
+bool isGood(const Reception& umts) {
+  return umts.level > goodRscp && umts.ecNo > goodEcNo;
+}
+
 double rank(const Cell& cell, const Reception& reception) {
   return cell.technology == Technology::gsm ? criterionC2(reception) : reception.ecNo;
 }
@@ -45,67 +55,73 @@ bool isSuitable(const Cell& cell, const Reception& reception) {
   return reception.level > leastRscp && reception.ecNo > leastEcNo;
 }
 
-void CellSelection::look(const std::vector<Reception>& receptions, bool isConnected, double seconds) {
-  const auto change = wanted(receptions, isConnected);
-  const bool isSame = change && pending_ && change->to == pending_->to;
-  pendingFor_ = isSame ? pendingFor_ + seconds : 0;
-  pending_ = change;
-  if (!change || pendingFor_ < change->patience) return;
-  serving_ = change->to;
-  pending_.reset();
+void CellSelection::look(const std::vector<Reception>& receptions, const Tie& tie, double seconds) {
+  const auto change = wanted(receptions, tie);
+  if (timer_.pass(change, seconds)) serving_ = change->to;
 }
 
-std::optional<CellSelection::Change> CellSelection::wanted(const std::vector<Reception>& receptions,
-                                                           bool isConnected) const {
+std::optional<CellChange> CellSelection::wanted(const std::vector<Reception>& receptions,
+                                                const Tie& tie) const {
+  const Choice choice{.umts = best(receptions, Technology::umts, tie),
+                      .gsm = best(receptions, Technology::gsm, tie)};
   if (!serving_) {
-    const auto found = bestOfAll(receptions);
-    return found ? std::optional(Change{found, selectionTime}) : std::nullopt;
+    const bool takesUmts = choice.umts && (!choice.gsm || !isPoor(receptions[*choice.umts]));
+    const auto found = takesUmts ? choice.umts : choice.gsm;
+    return found ? std::optional(CellChange{found, selectionTime}) : std::nullopt;
   }
-  if (!isSuitable(cells_[*serving_], receptions[*serving_])) return Change{bestOfAll(receptions), lossTime};
-  return cells_[*serving_].technology == Technology::umts ? fromUmts(receptions, isConnected)
-                                                          : fromGsm(receptions, isConnected);
+  if (!isSuitable(cells_[*serving_], receptions[*serving_])) return refuge(receptions, choice, tie);
+  return cells_[*serving_].technology == Technology::umts ? fromUmts(receptions, choice, tie)
+                                                          : fromGsm(receptions, choice, tie);
 }
 
-std::optional<CellSelection::Change> CellSelection::fromUmts(const std::vector<Reception>& receptions,
-                                                             bool isConnected) const {
+// From an unsuitable cell to any that will do. A connection that has none is lost with its cell.
+CellChange CellSelection::refuge(const std::vector<Reception>& receptions, const Choice& choice,
+                                 const Tie& tie) const {
+  const bool isOnGsm = cells_[*serving_].technology == Technology::gsm;
+  const bool takesUmts = choice.umts && !(tie.isConnected && isOnGsm);
+  if (takesUmts && !isPoor(receptions[*choice.umts])) return {choice.umts};
+  if (choice.gsm) return {choice.gsm};
+  return takesUmts ? CellChange{choice.umts} : CellChange{std::nullopt, lossTime};
+}
+
+std::optional<CellChange> CellSelection::fromUmts(const std::vector<Reception>& receptions,
+                                                  const Choice& choice, const Tie& tie) const {
   const Reception& serving = receptions[*serving_];
-  const auto umts = best(receptions, Technology::umts);
-  if (umts && receptions[*umts].ecNo > serving.ecNo + rankMargin)
-    return Change{umts, isConnected ? 0 : umtsReselectionTime};
-  const auto gsm = best(receptions, Technology::gsm);
-  const bool isPoor = serving.level < poorRscp || serving.ecNo < poorEcNo;
-  if (isPoor && gsm && criterionC1(receptions[*gsm]) > comfortableC1) return Change{gsm, technologyTime};
+  if (choice.umts && receptions[*choice.umts].ecNo > serving.ecNo + rankMargin)
+    return CellChange{choice.umts, tie.softSet.empty() ? umtsReselectionTime : 0};
+  if (isPoor(serving) && choice.gsm && criterionC1(receptions[*choice.gsm]) > comfortableC1)
+    return CellChange{choice.gsm, technologyTime};
   return std::nullopt;
 }
 
-std::optional<CellSelection::Change> CellSelection::fromGsm(const std::vector<Reception>& receptions,
-                                                            bool isConnected) const {
-  const Reception& serving = receptions[*serving_];
-  const auto umts = best(receptions, Technology::umts);
-  if (!isConnected && umts && receptions[*umts].level > goodRscp && receptions[*umts].ecNo > goodEcNo)
-    return Change{umts, technologyTime};
-  const auto gsm = best(receptions, Technology::gsm);
-  const double margin = isConnected ? handoverMargin : reselectHysteresis;
-  if (gsm && criterionC2(receptions[*gsm]) > criterionC2(serving) + margin)
-    return Change{gsm, isConnected ? handoverTime : gsmReselectionTime};
+std::optional<CellChange> CellSelection::fromGsm(const std::vector<Reception>& receptions,
+                                                 const Choice& choice, const Tie& tie) const {
+  if (!tie.isConnected && choice.umts && isGood(receptions[*choice.umts]))
+    return CellChange{choice.umts, technologyTime};
+  const double margin = tie.isConnected ? handoverMargin : reselectHysteresis;
+  if (choice.gsm && criterionC2(receptions[*choice.gsm]) > criterionC2(receptions[*serving_]) + margin)
+    return CellChange{choice.gsm, tie.isConnected ? handoverTime : gsmReselectionTime};
   return std::nullopt;
 }
 
 // Of the suitable ones.
 std::optional<std::size_t> CellSelection::best(const std::vector<Reception>& receptions,
-                                               Technology technology) const {
+                                               Technology technology, const Tie& tie) const {
   std::optional<std::size_t> found;
   for (std::size_t cell = 0; cell < cells_.size(); ++cell) {
     if (cells_[cell].technology != technology || !isSuitable(cells_[cell], receptions[cell])) continue;
+    if (!allows(tie, cell)) continue;
     if (!found || rank(cells_[cell], receptions[cell]) > rank(cells_[*found], receptions[*found]))
       found = cell;
   }
   return found;
 }
 
-std::optional<std::size_t> CellSelection::bestOfAll(const std::vector<Reception>& receptions) const {
-  const auto umts = best(receptions, Technology::umts);
-  return umts ? umts : best(receptions, Technology::gsm);
+bool CellSelection::allows(const Tie& tie, std::size_t cell) const {
+  if (!serving_ || !tie.isConnected) return true;
+  if (!tie.softSet.empty() && cells_[cell].technology == Technology::umts)
+    return std::ranges::find(tie.softSet, cell) != tie.softSet.end();
+  return cells_[cell].locationArea.plmn == cells_[*serving_].locationArea.plmn;
 }
 
 }  // namespace kelvasi::sim::gsm

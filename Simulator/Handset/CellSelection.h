@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "Simulator/Radio/Cell.h"
+#include "Simulator/Radio/CellChange.h"
 #include "Simulator/Radio/RadioModel.h"
 
 namespace kelvasi::sim::gsm {
@@ -18,33 +19,42 @@ bool isSuitable(const Cell& cell, const Reception& reception);
 
 class CellSelection {
  public:
+  // What keeps the handset from any cell that is better.
+  struct Tie {
+    bool isConnected = false;                   // to the network of the serving cell
+    std::span<const std::size_t> softSet = {};  // the active set of a dedicated channel; empty without one
+  };
+
   // The cells outlive the selection.
   explicit CellSelection(std::span<const Cell> cells) : cells_(cells) {}
 
   // Looks at the receptions, `seconds` after the last time. A connection is kept in its technology as long as
-  // that serves at all.
-  void look(const std::vector<Reception>& receptions, bool isConnected, double seconds);
+  // that serves at all; on a dedicated channel of UMTS it moves within its active set.
+  void look(const std::vector<Reception>& receptions, const Tie& tie, double seconds);
 
   // Its place among the cells; nothing without service.
   std::optional<std::size_t> serving() const { return serving_; }
 
  private:
-  // A change for which a reason has to last so long, seconds.
-  struct Change {
-    std::optional<std::size_t> to;
-    double patience = 0;
+  // The best cell of each technology within the tie; nothing where none is suitable.
+  struct Choice {
+    std::optional<std::size_t> umts;
+    std::optional<std::size_t> gsm;
   };
 
-  std::optional<Change> wanted(const std::vector<Reception>& receptions, bool isConnected) const;
-  std::optional<Change> fromUmts(const std::vector<Reception>& receptions, bool isConnected) const;
-  std::optional<Change> fromGsm(const std::vector<Reception>& receptions, bool isConnected) const;
-  std::optional<std::size_t> best(const std::vector<Reception>& receptions, Technology technology) const;
-  std::optional<std::size_t> bestOfAll(const std::vector<Reception>& receptions) const;
+  std::optional<CellChange> wanted(const std::vector<Reception>& receptions, const Tie& tie) const;
+  CellChange refuge(const std::vector<Reception>& receptions, const Choice& choice, const Tie& tie) const;
+  std::optional<CellChange> fromUmts(const std::vector<Reception>& receptions, const Choice& choice,
+                                     const Tie& tie) const;
+  std::optional<CellChange> fromGsm(const std::vector<Reception>& receptions, const Choice& choice,
+                                    const Tie& tie) const;
+  std::optional<std::size_t> best(const std::vector<Reception>& receptions, Technology technology,
+                                  const Tie& tie) const;
+  bool allows(const Tie& tie, std::size_t cell) const;
 
   std::span<const Cell> cells_;
   std::optional<std::size_t> serving_;
-  std::optional<Change> pending_;
-  double pendingFor_ = 0;
+  CellChangeTimer timer_;
 };
 
 }  // namespace kelvasi::sim::gsm

@@ -22,13 +22,13 @@ constexpr std::array rows{
     /* searching */ PhaseRow{state("MM_IDLE"), subState("MM_PLMN_SEARCH"), 2, 6},
     /* updateNeeded */ PhaseRow{state("MM_IDLE"), subState("MM_LOCATION_UPDATE_NEEDED"), 0.4, 1.2},
     /* connectingToUpdate */
-    PhaseRow{state("MM_WAIT_FOR_RR_CONNECTION_LU"), noSubState, 0.4, 1, Need::connecting},
+    PhaseRow{state("MM_WAIT_FOR_RR_CONNECTION_LU"), noSubState, 1.2, 2, Need::connecting},
     /* updating */ PhaseRow{state("MM_LOCATION_UPDATE_INITIATED"), noSubState, 0.8, 2.5, Need::signalling},
     /* rejected */ PhaseRow{state("MM_LOCATION_UPDATE_REJECTED"), noSubState, 0.5, 1, Need::signalling},
     /* limited */ PhaseRow{state("MM_IDLE"), subState("MM_LIMITED_SERVICE"), forEver, forEver},
     /* idle */ PhaseRow{state("MM_IDLE"), subState("MM_NORMAL_SERVICE"), 10, 60},
     /* connectingToCall */
-    PhaseRow{state("MM_WAIT_FOR_RR_CONNECTION_MM"), noSubState, 0.4, 1, Need::connecting},
+    PhaseRow{state("MM_WAIT_FOR_RR_CONNECTION_MM"), noSubState, 1.2, 2, Need::connecting},
     /* requestingCall */
     PhaseRow{state("MM_WAIT_FOR_OUTGOING_MM_CONNECTION"), noSubState, 0.6, 2, Need::signalling},
     /* inCall */ PhaseRow{state("MM_CONNECTION_ACTIVE"), noSubState, 10, 60, Need::speech},

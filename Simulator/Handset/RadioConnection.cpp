@@ -8,8 +8,8 @@ namespace {
 // Seconds.
 constexpr double setUpTime = 0.4;
 constexpr double releaseTime = 0.4;
-constexpr double standbyInFach = 3;
-constexpr double standbyInUraPch = 6;
+constexpr double keptInFachTime = 3;
+constexpr double keptInUraPchTime = 6;
 constexpr double shortestBurst = 2;
 constexpr double longestBurst = 8;
 constexpr double shortestPause = 1;
@@ -17,42 +17,82 @@ constexpr double longestPause = 4;
 }  // namespace
 
 void RadioConnection::pass(const Cell* serving, Need circuitSwitched, Need packetSwitched, double seconds) {
-  const auto technology = serving ? std::optional(serving->technology) : std::nullopt;
-  hasChangedTechnology_ = technology && technology_ && technology != technology_;
-  if (technology) technology_ = technology;
-  circuitSwitched_ = circuitSwitched;
-  packetSwitched_ = packetSwitched;
+  noteNeeds(circuitSwitched, packetSwitched);
   if (!serving) {
     technology_.reset();
-    standby_ = 0;
+    hasChangedTechnology_ = false;
     return enter(Stage::none);
   }
+  const bool isLost = isLeftBehind(*serving);
+  noteCell(*serving);
   inStage_ += seconds;
-  follow(std::max(circuitSwitched, packetSwitched), seconds);
-  connectedFor_ = isConnected() ? connectedFor_ + seconds : 0;
+  enter(isLost ? Stage::none : next());
+  if (isConnected() && packetSwitched_ == Need::data) hasSession_ = true;
+  establishedFor_ = isEstablished() ? establishedFor_ + seconds : 0;
   passBursts(seconds);
 }
 
+void RadioConnection::noteNeeds(Need circuitSwitched, Need packetSwitched) {
+  isHeld_ = (circuitSwitched != Need::none && circuitSwitched_ != Need::none) ||
+            (packetSwitched != Need::none && packetSwitched_ != Need::none);
+  circuitSwitched_ = circuitSwitched;
+  packetSwitched_ = packetSwitched;
+}
+
+// What is kept without a use, when the handset goes to another technology or network.
+bool RadioConnection::isLeftBehind(const Cell& serving) const {
+  return isKept() && (technology_ != serving.technology || plmn_ != serving.locationArea.plmn);
+}
+
+void RadioConnection::noteCell(const Cell& serving) {
+  hasChangedTechnology_ = technology_ && technology_ != serving.technology;
+  technology_ = serving.technology;
+  plmn_ = serving.locationArea.plmn;
+}
+
 void RadioConnection::enter(Stage stage) {
-  if (stage_ != stage) inStage_ = 0;
+  if (stage == stage_) return;
+  inStage_ = 0;
   stage_ = stage;
+  if (!isEstablished()) hasSession_ = false;
 }
 
-void RadioConnection::follow(Need need, double seconds) {
-  if (need == Need::none) return release(seconds);
-  if (isConnected()) return;
-  const bool isSetUp = isConnecting() && need > Need::connecting &&
-                       (circuitSwitched_ > Need::connecting || inStage_ >= setUpTime);
-  // What is kept in standby is at hand at once.
-  const bool isKept = standby_ > 0 && need > Need::connecting;
-  enter(isSetUp || isKept ? Stage::connected : Stage::connecting);
+Need RadioConnection::need() const {
+  return std::max(circuitSwitched_, packetSwitched_);
 }
 
-void RadioConnection::release(double seconds) {
-  standby_ = std::max(0.0, standby_ - seconds);
-  if (stage_ == Stage::connecting) return enter(Stage::none);
-  if (stage_ == Stage::connected) return enter(Stage::releasing);
-  if (stage_ == Stage::releasing && inStage_ >= releaseTime) enter(Stage::none);
+RadioConnection::Stage RadioConnection::next() const {
+  switch (stage_) {
+    case Stage::none:
+      return need() == Need::none ? Stage::none : Stage::connecting;
+    case Stage::connecting:
+      return afterConnecting();
+    case Stage::connected:
+      return afterConnected();
+    case Stage::keptInFach:
+      if (need() > Need::connecting) return Stage::connected;
+      return need() == Need::none && inStage_ >= keptInFachTime ? Stage::keptInUraPch : stage_;
+    case Stage::keptInUraPch:
+      if (need() != Need::none) return Stage::keptInFach;  // a cell update
+      return inStage_ >= keptInUraPchTime ? Stage::none : stage_;
+    case Stage::releasing:
+      return inStage_ >= releaseTime ? Stage::none : stage_;
+  }
+  return stage_;
+}
+
+RadioConnection::Stage RadioConnection::afterConnecting() const {
+  if (need() == Need::none) return Stage::none;
+  const bool isSetUp =
+      need() > Need::connecting && (circuitSwitched_ > Need::connecting || inStage_ >= setUpTime);
+  return isSetUp ? Stage::connected : stage_;
+}
+
+// A domain that begins when the other one ends sets up a connection of its own.
+RadioConnection::Stage RadioConnection::afterConnected() const {
+  if (isHeld_) return stage_;
+  if (hasSession_ && technology_ == Technology::umts) return Stage::keptInFach;
+  return Stage::releasing;
 }
 
 void RadioConnection::passBursts(double seconds) {
@@ -61,7 +101,6 @@ void RadioConnection::passBursts(double seconds) {
     untilBurstTurns_ = 0;
     return;
   }
-  standby_ = standbyInFach + standbyInUraPch;
   untilBurstTurns_ -= seconds;
   if (untilBurstTurns_ > 0) return;
   isBurst_ = !isBurst_;
@@ -71,13 +110,23 @@ void RadioConnection::passBursts(double seconds) {
 
 RadioConnection::Rrc RadioConnection::rrc() const {
   if (technology_ != Technology::umts) return Rrc::disconnected;
-  if (stage_ == Stage::connecting) return Rrc::connecting;
-  if (isConnected())
-    return circuitSwitched_ <= Need::connecting && packetSwitched_ == Need::data && !isBurst_ ? Rrc::fach
-                                                                                              : Rrc::dch;
-  if (standby_ > standbyInUraPch) return Rrc::fach;
-  if (standby_ > 0) return Rrc::uraPch;
-  return isReleasing() ? Rrc::dch : Rrc::disconnected;
+  switch (stage_) {
+    case Stage::none:
+      return Rrc::disconnected;
+    case Stage::connecting:
+      return Rrc::connecting;
+    case Stage::connected: {
+      const bool isPause = circuitSwitched_ <= Need::connecting && packetSwitched_ == Need::data && !isBurst_;
+      return isPause ? Rrc::fach : Rrc::dch;
+    }
+    case Stage::keptInFach:
+      return Rrc::fach;
+    case Stage::keptInUraPch:
+      return Rrc::uraPch;
+    case Stage::releasing:
+      return Rrc::dch;
+  }
+  return Rrc::disconnected;
 }
 
 }  // namespace kelvasi::sim::gsm

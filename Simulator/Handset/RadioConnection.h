@@ -24,7 +24,8 @@ class RadioConnection {
   // Data or signalling can be exchanged.
   bool isConnected() const { return stage_ == Stage::connected; }
   bool isReleasing() const { return stage_ == Stage::releasing; }
-  bool isCiphered() const { return isConnected() && connectedFor_ >= securityModeSeconds; }
+  // From the security mode command on, as long as the connection lasts, in whichever state it is kept.
+  bool isCiphered() const { return isEstablished() && establishedFor_ >= securityModeSeconds; }
   bool hasSpeech() const { return isConnected() && circuitSwitched_ == Need::speech; }
   // A burst of packet data is under way.
   bool isTransferring() const { return isConnected() && packetSwitched_ == Need::data && isBurst_; }
@@ -34,23 +35,33 @@ class RadioConnection {
   bool hasChangedTechnology() const { return hasChangedTechnology_; }
 
  private:
-  enum class Stage { none, connecting, connected, releasing };
+  // After a data session UMTS keeps the connection for a while, on common channels and then without any.
+  enum class Stage { none, connecting, connected, keptInFach, keptInUraPch, releasing };
 
   static constexpr double securityModeSeconds = 0.6;
 
-  void follow(Need need, double seconds);
-  void release(double seconds);
+  bool isEstablished() const { return stage_ >= Stage::connected; }
+  bool isKept() const { return stage_ == Stage::keptInFach || stage_ == Stage::keptInUraPch; }
+  bool isLeftBehind(const Cell& serving) const;
+  void noteCell(const Cell& serving);
+  void noteNeeds(Need circuitSwitched, Need packetSwitched);
+  Stage next() const;
+  Stage afterConnecting() const;
+  Stage afterConnected() const;
+  Need need() const;
   void passBursts(double seconds);
   void enter(Stage stage);
 
   Random random_;
   std::optional<Technology> technology_;
+  Plmn plmn_;
   Need circuitSwitched_ = Need::none;
   Need packetSwitched_ = Need::none;
+  bool isHeld_ = false;  // by a domain that already held it
   Stage stage_ = Stage::none;
-  double inStage_ = 0;       // seconds
-  double connectedFor_ = 0;  // seconds
-  double standby_ = 0;       // seconds of packet standby that are left after a data session
+  double inStage_ = 0;         // seconds
+  double establishedFor_ = 0;  // seconds
+  bool hasSession_ = false;    // data were transferred over this connection
   bool isBurst_ = false;
   double untilBurstTurns_ = 0;
   bool hasChangedTechnology_ = false;

@@ -10,9 +10,8 @@ namespace {
 constexpr double weakestGsm = -110;   // dBm
 constexpr double weakestRscp = -114;  // dBm
 constexpr double weakestEcNo = -20;   // dB
-// A better serving cell makes a search for the other technology needless.
+// On UMTS a better serving cell makes a search for GSM needless; on GSM a search for UMTS is always due.
 constexpr double contentEcNo = -11;  // dB
-constexpr double contentC1 = 40;     // dB
 
 // Open-loop power control (3GPP TS 25.331, 8.5.3 for the preamble), simplified to these terms.
 constexpr double pilotPower = 33;            // dBm
@@ -21,10 +20,27 @@ constexpr double requiredRatio = -20;        // dB
 constexpr double leastPower = -50;           // dBm
 constexpr double mostPower = 24;             // dBm, power class 3
 
-// A tunnel without radio, and a quarter that UMTS does not reach, both on the way.
+constexpr double umtsLoss = 29;  // dB: UMTS can be heard but hardly be used
+
+// Along a leg of the way, from corner to corner.
+void addUmtsShadows(const Route& route, std::size_t leg, std::vector<Shadow>& shadows) {
+  constexpr int steps = 4;
+  const Point from = route.corners()[leg];
+  const Point to = route.corners()[leg + 1];
+  for (int step = 0; step <= steps; ++step) {
+    const double share = static_cast<double>(step) / steps;
+    const Point middle{from.x + share * (to.x - from.x), from.y + share * (to.y - from.y)};
+    shadows.push_back({.middle = middle, .radius = 450, .loss = {0, umtsLoss, 0}});
+  }
+}
+
+// A tunnel without radio, and stretches that UMTS hardly reaches: around the beginning of the way, and later.
 std::vector<Shadow> shadowsAlong(const Route& route) {
-  return {{.middle = route.corners()[4], .radius = 320, .loss = {75, 75, 75}},
-          {.middle = route.corners()[9], .radius = 600, .loss = {0, 40, 0}}};
+  const auto& corners = route.corners();
+  std::vector<Shadow> shadows{{.middle = corners[4], .radius = 320, .loss = {75, 75, 75}},
+                              {.middle = corners[0], .radius = 650, .loss = {0, umtsLoss, 0}}};
+  for (const std::size_t leg : {6U, 7U, 10U, 11U}) addUmtsShadows(route, leg, shadows);
+  return shadows;
 }
 
 }  // namespace
@@ -44,16 +60,33 @@ void World::pass(double seconds) {
   const auto before = serving();
   route_.drive(seconds);
   radio_.receive(route_.position(), seconds);
-  selection_.look(radio_.receptions(), connection_.isConnected(), seconds);
+  selection_.look(radio_.receptions(), tie(), seconds);
   const auto found = selection_.serving();
   registration_.pass(found ? &cells_[*found] : nullptr, seconds);
   const auto now = serving();
   connection_.pass(now ? &cells_[*now] : nullptr, registration_.circuitSwitched().need(),
                    registration_.packetSwitched().need(), seconds);
-  activeSet_.update(now, radio_.receptions(), connection_.rrc() == RadioConnection::Rrc::dch);
+  activeSet_.update(now, radio_.receptions(), isInSoftHandover());
   traffic_.pass(use(), seconds);
   findNeighbours();
   hasChangedCell_ = now != before;
+}
+
+// UTRA TDD hands over hard.
+bool World::isInSoftHandover() const {
+  return isOn(Technology::umts) && !cell(*serving()).isTdd && connection_.rrc() == RadioConnection::Rrc::dch;
+}
+
+CellSelection::Tie World::tie() const {
+  CellSelection::Tie tie{.isConnected = connection_.isConnected() || connection_.isReleasing(),
+                         .softSet = {}};
+  if (isInSoftHandover()) tie.softSet = activeSet_.cells();
+  return tie;
+}
+
+double World::carrierPower() const {
+  const std::uint16_t home = umtsFrequencyOf(homePlmn);
+  return radio_.carrierPower(Technology::umts, isOn(Technology::umts) ? cell(*serving()).frequency : home);
 }
 
 World::Situation World::situation() const {
@@ -84,10 +117,9 @@ void World::findNeighbours() {
   gsmNeighbours_.clear();
   umtsNeighbours_.clear();
   if (!serving()) return;
-  const bool isUmts = isOn(Technology::umts);
-  const Reception& here = reception(*serving());
-  if (!isUmts || here.ecNo < contentEcNo) gsmNeighbours_ = strongest(Technology::gsm);
-  if (isUmts || criterionC1(here) < contentC1) umtsNeighbours_ = strongest(Technology::umts);
+  if (isOn(Technology::gsm) || reception(*serving()).ecNo < contentEcNo)
+    gsmNeighbours_ = strongest(Technology::gsm);
+  umtsNeighbours_ = strongest(Technology::umts);
 }
 
 std::vector<std::size_t> World::strongest(Technology technology) const {
@@ -97,10 +129,12 @@ std::vector<std::size_t> World::strongest(Technology technology) const {
     const bool isHeard = technology == Technology::gsm
                              ? heard.level > weakestGsm
                              : heard.level > weakestRscp && heard.ecNo > weakestEcNo;
-    if (cells_[place].technology == technology && isHeard && place != serving()) places.push_back(place);
+    const bool isWanted = isHeard || activeSet_.contains(place);
+    if (cells_[place].technology == technology && isWanted && place != serving()) places.push_back(place);
   }
-  std::ranges::sort(places, std::ranges::greater(),
-                    [this](std::size_t place) { return reception(place).level; });
+  std::ranges::sort(places, std::ranges::greater(), [this](std::size_t place) {
+    return std::pair(activeSet_.contains(place), reception(place).level);
+  });
   if (places.size() > mostNeighbours) places.resize(mostNeighbours);
   return places;
 }

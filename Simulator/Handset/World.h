@@ -49,8 +49,8 @@ class World {
 
   const Cell& cell(std::size_t place) const { return cells_[place]; }
   const Reception& reception(std::size_t place) const { return radio_.receptions()[place]; }
-  // Places of the strongest other cells that can be told apart, the strongest first. Empty without service,
-  // and of the other technology while the serving cell is too good to look for it.
+  // Places of the strongest other cells that can be told apart: those of the active set first, then the
+  // strongest. Empty without service, and of GSM while a serving UMTS cell is too good to look for it.
   const std::vector<std::size_t>& gsmNeighbours() const { return gsmNeighbours_; }
   const std::vector<std::size_t>& umtsNeighbours() const { return umtsNeighbours_; }
 
@@ -58,14 +58,16 @@ class World {
   const RadioConnection& connection() const { return connection_; }
   const Registration& registration() const { return registration_; }
   const Traffic& traffic() const { return traffic_; }
-  // All that is received in the UMTS carrier, dBm.
-  double carrierPower() const { return radio_.carrierPower(Technology::umts, umtsFrequency); }
+  // All that is received in the serving UMTS carrier, or in the home network's; dBm.
+  double carrierPower() const;
   // dBm, in UMTS.
   double transmitPower() const;
   Point position() const { return route_.position(); }
   Situation situation() const;
 
  private:
+  bool isInSoftHandover() const;
+  CellSelection::Tie tie() const;
   void findNeighbours();
   std::vector<std::size_t> strongest(Technology technology) const;
   Use use() const;

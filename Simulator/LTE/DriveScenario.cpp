@@ -21,7 +21,7 @@ Record ofContexts(const World& world, const PlistSerialiser& plists) {
   return gsm::pdpContextRecord(world.attachment().contexts(), plists);
 }
 Record ofSim(const World&, const PlistSerialiser& plists) {
-  return gsm::simFilesRecord(plists, "GSM, UMTS and LTE");
+  return gsm::simFilesRecord(plists, gsm::gsmUmtsAndLte);
 }
 
 // The daemon's own records first: where a section shows both, the baseband's record is the later one.

@@ -13,6 +13,7 @@
 #include "LogGenerator/LTE/TransmitAntennas.h"
 #include "Simulator/EntryWriter.h"
 #include "Simulator/Radio/EutraBand.h"
+#include "Simulator/Radio/Reported.h"
 
 namespace kelvasi::sim::lte {
 
@@ -44,14 +45,6 @@ int whole(double value) {
   return static_cast<int>(std::lround(value));
 }
 
-// What a handset can report (3GPP TS 36.133, 9.1.4 and 9.1.7).
-double reportedRsrp(const Reception& heard) {
-  return std::clamp(heard.level, -140.0, -44.0);
-}
-double reportedRsrq(const Reception& heard) {
-  return std::clamp(heard.ecNo, -19.5, -3.0);
-}
-
 // The nearest raw value of a scale, in so many bits.
 std::int64_t raw(double value, const Scale& scale, unsigned width) {
   const std::int64_t most = (std::int64_t{1} << width) - 1;
@@ -72,9 +65,10 @@ std::int64_t sampleOffset(const World& world, const Cell& cell) {
   return (cell.code * 7919U + static_cast<std::uint32_t>(way)) % samplesPerFrame;
 }
 
-// Hz: the Doppler shift straight ahead.
+// Hz, as the two's complement in the field's 16 bits: up towards the site, down away from it.
 std::int64_t dopplerShift(const World& world, const Cell& cell) {
-  return std::llround(world.speed() * cell.megahertz * 1e6 / 299792458);
+  const double shift = world.speedTowards(cell.site) * cell.megahertz * 1e6 / 299792458;
+  return static_cast<std::uint16_t>(static_cast<std::int16_t>(std::lround(shift)));
 }
 
 void encodeNeighbour(const World& world, std::size_t place, RecordWriter& entry) {
@@ -121,9 +115,7 @@ bool isIdle(const World& world) {
 }
 
 MeasuredCell measured(const World& world, std::size_t place) {
-  return {.cell = world.cell(place),
-          .level = whole(world.average(place).level),
-          .ecNo = whole(world.average(place).ecNo)};
+  return measuredCell(world.cell(place), world.average(place));
 }
 
 }  // namespace

@@ -17,27 +17,29 @@ constexpr double handoverTime = 0.4;
 
 void Reselection::look(const std::vector<Reception>& receptions, bool isConnected, double seconds) {
   const auto change = wanted(receptions, isConnected);
-  const bool isSame = change && pending_ && change->to == pending_->to;
-  pendingFor_ = isSame ? pendingFor_ + seconds : 0;
-  pending_ = change;
-  if (!change || pendingFor_ < change->patience) return;
-  serving_ = change->to;
-  pending_.reset();
+  if (timer_.pass(change, seconds)) serving_ = change->to;
 }
 
-std::optional<Reselection::Change> Reselection::wanted(const std::vector<Reception>& receptions,
-                                                       bool isConnected) const {
-  const auto any = [](std::size_t) { return true; };
+std::optional<CellChange> Reselection::wanted(const std::vector<Reception>& receptions,
+                                              bool isConnected) const {
   if (!serving_) {
-    const auto found = best(receptions, any);
-    return found ? std::optional(Change{found, selectionTime}) : std::nullopt;
+    const auto found = best(receptions, [](std::size_t) { return true; });
+    return found ? std::optional(CellChange{found, selectionTime}) : std::nullopt;
   }
-  if (!isSuitable(cells_[*serving_], receptions[*serving_])) return Change{best(receptions, any), lossTime};
+  if (!isSuitable(cells_[*serving_], receptions[*serving_])) return refuge(receptions);
   return isConnected ? handover(receptions) : reselection(receptions);
 }
 
+// From an unsuitable cell: one of its own carrier rather than a better layer that is hardly heard.
+CellChange Reselection::refuge(const std::vector<Reception>& receptions) const {
+  const Layer& here = layerOf(cells_[*serving_]);
+  auto found = best(receptions, [&](std::size_t cell) { return &layerOf(cells_[cell]) == &here; });
+  if (!found) found = best(receptions, [](std::size_t) { return true; });
+  return {found, found ? 0 : lossTime};
+}
+
 // A higher priority at once, within the layer by rank, a lower one only where the serving cell is poor.
-std::optional<Reselection::Change> Reselection::reselection(const std::vector<Reception>& receptions) const {
+std::optional<CellChange> Reselection::reselection(const std::vector<Reception>& receptions) const {
   const auto srxlev = [&](std::size_t cell) { return receiveLevelCriterion(cells_[cell], receptions[cell]); };
   const Layer& here = layerOf(cells_[*serving_]);
   const auto found = best(receptions, [&](std::size_t cell) {
@@ -47,10 +49,10 @@ std::optional<Reselection::Change> Reselection::reselection(const std::vector<Re
       return receptions[cell].level > receptions[*serving_].level + rankHysteresis;
     return srxlev(*serving_) < leaveThreshold && srxlev(cell) > there.thresholdLow;
   });
-  return found ? std::optional(Change{found, reselectionTime}) : std::nullopt;
+  return found ? std::optional(CellChange{found, reselectionTime}) : std::nullopt;
 }
 
-std::optional<Reselection::Change> Reselection::handover(const std::vector<Reception>& receptions) const {
+std::optional<CellChange> Reselection::handover(const std::vector<Reception>& receptions) const {
   const auto srxlev = [&](std::size_t cell) { return receiveLevelCriterion(cells_[cell], receptions[cell]); };
   const auto found = best(receptions, [&](std::size_t cell) {
     if (cells_[cell].technology != Technology::lte) return false;
@@ -58,7 +60,7 @@ std::optional<Reselection::Change> Reselection::handover(const std::vector<Recep
       return receptions[cell].level > receptions[*serving_].level + handoverMargin;
     return srxlev(*serving_) < poorSrxlev && srxlev(cell) > goodSrxlev;
   });
-  return found ? std::optional(Change{found, handoverTime}) : std::nullopt;
+  return found ? std::optional(CellChange{found, handoverTime}) : std::nullopt;
 }
 
 template <typename Takes>

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "Simulator/LTE/Layers.h"
+#include "Simulator/Radio/CellChange.h"
 
 namespace kelvasi::sim::lte {
 
@@ -15,24 +16,21 @@ class Reselection {
   // The cells outlive it.
   explicit Reselection(std::span<const Cell> cells) : cells_(cells) {}
 
-  // Looks at the receptions, `seconds` after the last time. A connection stays on LTE.
+  // Looks at the receptions, `seconds` after the last time. A connection stays on LTE as long as that serves.
   void look(const std::vector<Reception>& receptions, bool isConnected, double seconds);
 
   // Its place among the cells; nothing without service.
   std::optional<std::size_t> serving() const { return serving_; }
   // The cell that is about to take the serving one's place; nothing while there is no better one.
-  std::optional<std::size_t> candidate() const { return serving_ && pending_ ? pending_->to : std::nullopt; }
+  std::optional<std::size_t> candidate() const {
+    return serving_ && timer_.pending() ? timer_.pending()->to : std::nullopt;
+  }
 
  private:
-  // A change for which a reason has to last so long, seconds.
-  struct Change {
-    std::optional<std::size_t> to;
-    double patience = 0;
-  };
-
-  std::optional<Change> wanted(const std::vector<Reception>& receptions, bool isConnected) const;
-  std::optional<Change> reselection(const std::vector<Reception>& receptions) const;
-  std::optional<Change> handover(const std::vector<Reception>& receptions) const;
+  std::optional<CellChange> wanted(const std::vector<Reception>& receptions, bool isConnected) const;
+  CellChange refuge(const std::vector<Reception>& receptions) const;
+  std::optional<CellChange> reselection(const std::vector<Reception>& receptions) const;
+  std::optional<CellChange> handover(const std::vector<Reception>& receptions) const;
   // The best suitable other cell, by priority and then by level, of those that `takes`.
   template <typename Takes>
   std::optional<std::size_t> best(const std::vector<Reception>& receptions, Takes takes) const;
@@ -40,8 +38,7 @@ class Reselection {
 
   std::span<const Cell> cells_;
   std::optional<std::size_t> serving_;
-  std::optional<Change> pending_;
-  double pendingFor_ = 0;
+  CellChangeTimer timer_;
 };
 
 }  // namespace kelvasi::sim::lte

@@ -93,10 +93,10 @@ bool World::isHeard(std::size_t place) const {
 // Away from LTE everything is.
 bool World::isLookedFor(std::size_t place) const {
   if (!isOnLte()) return true;
-  const int there = layerOf(cell(place)).priority;
-  const int here = layerOf(cell(*serving_)).priority;
-  const unsigned rule = there > here ? looksForHigher : there < here ? looksForLower : looksForIntra;
-  return (measurementRules_ & rule) != 0;
+  const Layer& there = layerOf(cell(place));
+  const Layer& here = layerOf(cell(*serving_));
+  if (&there == &here) return (measurementRules_ & looksForIntra) != 0;
+  return (measurementRules_ & (there.priority > here.priority ? looksForHigher : looksForLower)) != 0;
 }
 
 void World::findNeighbours() {

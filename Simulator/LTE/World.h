@@ -26,7 +26,7 @@ class World {
 
   // Bits of the measurement rules: which cells the handset looks for (3GPP TS 36.304, 5.2.4.2).
   static constexpr unsigned looksForIntra = 1;
-  static constexpr unsigned looksForLower = 2;
+  static constexpr unsigned looksForLower = 2;  // or equal priority
   static constexpr unsigned looksForHigher = 4;
 
   explicit World(Random random);
@@ -70,7 +70,8 @@ class World {
 
   const Attachment& attachment() const { return attachment_; }
   Point position() const { return route_.position(); }
-  double speed() const { return route_.speed(); }
+  // Metres a second; negative away from it.
+  double speedTowards(Point site) const { return route_.speedTowards(site); }
   double seconds() const { return seconds_; }
   Situation situation() const { return {serving_, candidate(), attachment_.phase(), measurementRules_}; }
 

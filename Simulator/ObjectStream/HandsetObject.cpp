@@ -3,6 +3,8 @@
 #include <cmath>
 #include <string>
 
+#include "Simulator/Radio/Reported.h"
+
 namespace kelvasi::sim::objectStream {
 
 namespace {
@@ -34,10 +36,10 @@ void addMeasurements(const World& world, std::size_t place, PlistDictionary& row
   rows.set(isGsm ? "BSIC" : "Scrambling Code", std::to_string(cell.code));
   const auto& heard = world.reception(place);
   if (isGsm) {
-    rows.set("Received Level", withUnit(heard.level, " dBm"));
+    rows.set("Received Level", withUnit(reportedGsmLevel(heard), " dBm"));
   } else {
-    rows.set("RSCP", withUnit(heard.level, " dBm"));
-    rows.set("Ec/No", withUnit(heard.ecNo, " dB"));
+    rows.set("RSCP", withUnit(reportedRscp(heard), " dBm"));
+    rows.set("Ec/No", withUnit(reportedEcNo(heard), " dB"));
   }
 }
 

@@ -18,7 +18,7 @@ struct Transmission {
 // In the order of the technologies. Of the twelve subcarriers of an LTE resource block four in ten are busy.
 constexpr std::array<Transmission, technologyCount> transmissions{
     Transmission{.power = 38, .sharesCarrier = false},
-    Transmission{.power = 27, .loadOverPilot = 6.5, .noise = -100},
+    Transmission{.power = 27, .loadOverPilot = 6.5, .noise = -97},
     Transmission{.power = 20, .loadOverPilot = 6.8, .noise = -114},
     Transmission{.power = 30, .loadOverPilot = 6.5, .noise = -105},
 };
@@ -28,6 +28,8 @@ constexpr double lossAtOneKilometre = 128.1;  // at 2 GHz
 constexpr double lossPerDecade = 37.6;
 constexpr double lossPerDecadeOfFrequency = 21;
 constexpr double nearest = 0.035;  // kilometres
+// However near an antenna and however clear the way; a car's body is part of it.
+constexpr double leastLoss = 80;  // dB
 
 constexpr double shadowingDeviation = 7;    // dB
 constexpr double decorrelationMetres = 60;  // after Gudmundson, 1991
@@ -112,8 +114,11 @@ double RadioModel::levelOf(std::size_t cell, Point at) const {
   const double kilometres = std::max(nearest, distance(sender.site, at) / 1000);
   double loss = lossAtOneKilometre + lossPerDecade * std::log10(kilometres) +
                 lossPerDecadeOfFrequency * std::log10(sender.megahertz / 2000) + shadowing_[cell];
-  for (const Shadow& shadow : shadows_) loss += additionalLoss(shadow, sender.technology, at);
-  return transmissionOf(sender.technology).power - loss;
+  double deepest = 0;
+  for (const Shadow& shadow : shadows_)
+    deepest = std::max(deepest, additionalLoss(shadow, sender.technology, at));
+  loss += deepest;
+  return transmissionOf(sender.technology).power - std::max(loss, leastLoss);
 }
 
 }  // namespace kelvasi::sim

@@ -17,7 +17,7 @@ struct Reception {
   double ecNo = -40;  // dB, in UMTS; RSRQ in LTE; Ec/Io in CDMA
 };
 
-// A round place with additional loss.
+// A round place with additional loss. Where several overlap, the deepest counts.
 struct Shadow {
   Point middle;
   double radius = 0;

@@ -45,6 +45,16 @@ void Route::drive(double seconds) {
   position_.y += (corner.y - position_.y) * way / left;
 }
 
+double Route::speedTowards(Point place) const {
+  const Point ahead = corners_[next_];
+  const double product = distance(position_, ahead) * distance(position_, place);
+  if (isStopped() || product == 0) return 0;
+  const double cosine = ((ahead.x - position_.x) * (place.x - position_.x) +
+                         (ahead.y - position_.y) * (place.y - position_.y)) /
+                        product;
+  return speed_ * cosine;
+}
+
 void Route::reachCorner() {
   position_ = corners_[next_];
   next_ = (next_ + 1) % corners_.size();

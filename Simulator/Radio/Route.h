@@ -17,7 +17,8 @@ class Route {
 
   void drive(double seconds);
   Point position() const { return position_; }
-  double speed() const { return isStopped() ? 0 : speed_; }  // metres a second
+  // Metres a second; negative away from it.
+  double speedTowards(Point place) const;
   const std::vector<Point>& corners() const { return corners_; }
 
  private:

@@ -8,7 +8,7 @@
 
 namespace kelvasi::sim::utran {
 
-// On three carriers by turns. The cell parameters are unique.
+// On three carriers of each network by turns. The cell parameters are unique.
 std::vector<Cell> layOutCells(Random random);
 
 }  // namespace kelvasi::sim::utran

@@ -23,7 +23,7 @@ Record ofContexts(const World& world, const PlistSerialiser& plists) {
   return gsm::pdpContextRecord(world.registration().packetSwitched().contexts(), plists);
 }
 Record ofSim(const World&, const PlistSerialiser& plists) {
-  return gsm::simFilesRecord(plists);
+  return gsm::simFilesRecord(plists, gsm::gsmAndUmts);
 }
 
 // The daemon's own records first: where a section shows both, the baseband's record is the later one.

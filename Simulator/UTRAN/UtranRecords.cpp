@@ -10,6 +10,7 @@
 #include "LogGenerator/UTRAN/RRCState.h"
 #include "LogGenerator/UTRAN/ServingCell.h"
 #include "Simulator/EntryWriter.h"
+#include "Simulator/Radio/Reported.h"
 
 namespace kelvasi::sim::utran {
 
@@ -120,7 +121,7 @@ std::optional<Bytes> gsmNeighborCellsRecord(const World& world) {
                      .set("NCC", cell.code / 8)
                      .set("BCC", cell.code % 8)
                      .set("ARFCN", cell.frequency)
-                     .set("RSSI", whole(world.reception(place).level));
+                     .set("RSSI", whole(reportedGsmLevel(world.reception(place))));
                });
   return record.bytes();
 }

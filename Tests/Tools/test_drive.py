@@ -44,7 +44,7 @@ class Drive(LiveTest):
                 rsrp, unit = measured["Measured RSRP"].split()
                 self.assertEqual(unit, "dBm")
                 self.assertTrue(-140 <= float(rsrp) <= -44, rsrp)
-                self.assertIn(int(measured["E-ARFCN"]), (3350, 1575, 6300))
+                self.assertIn(int(measured["E-ARFCN"]), (3350, 1575, 6300, 3100, 1850, 6400))
                 codes = [cell["Physical Cell ID"] for cell in display["Neighbor Cells List"]]
                 if measured["E-ARFCN"] == display["Neighbor Measurements"]["E-ARFCN"]:
                     self.assertNotIn(measured["Physical Cell ID"], codes)
@@ -59,7 +59,7 @@ class Drive(LiveTest):
             self.assertEqual(display["GSM Neighbor Cell List"], [])
 
         display = self.see_every_section("Orvane_UTRAN2", look)
-        self.assertIn(display["Serving Cell Info"]["Downlink UARFCN"], ("10055", "10063", "10071"))
+        self.assertIn(display["Serving Cell Info"]["Downlink UARFCN"], ("10055", "10063", "10071", "10079", "10087", "10095"))
 
 
 if __name__ == "__main__":

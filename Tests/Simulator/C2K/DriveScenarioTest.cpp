@@ -11,6 +11,7 @@
 #include <utility>
 
 #include "Simulator/C2K/Frames.h"
+#include "Simulator/C2K/Strength.h"
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/PlayedScenario.h"
 #include "Tests/Support/C2KLookupNames.h"
@@ -195,7 +196,7 @@ void CdmaDrive::checkOneXValues() {
       if (!key.ends_with(";" + std::to_string(world().cell(cell).code))) continue;
       ++matched;
       const double shown = linear(number(pilot("k1xActiveSetInfo", key)));
-      const double wanted = std::max(linear(world().oneXRatios()[cell]), 0.00001);
+      const double wanted = linear(reportedRatio(world().oneXRatios()[cell]));
       // Half a step of the energy, and half a hundredth of a dB.
       ASSERT_NEAR(shown, wanted, 0.5 / 36864 + 0.0012 * wanted);
     }
@@ -242,7 +243,8 @@ TEST_P(CdmaDrive, MeasurementsAreTheWorlds) {
     const auto shownKeys = keys("kActiveSetPilots");
     for (const std::size_t cell : world().evdo().pilots().active()) {
       const double shown = linear(number(pilot("kActiveSetPilots", shownKeys.at(place++))));
-      ASSERT_NEAR(shown, linear(world().evdoRatios()[cell]), 0.5 / 512 + 0.0012 * shown);
+      const double wanted = std::max(linear(world().evdoRatios()[cell]), 1.0 / 512);
+      ASSERT_NEAR(shown, wanted, 0.5 / 512 + 0.0012 * shown);
     }
   });
 }

@@ -151,7 +151,7 @@ void Drive::checkConnection() {
     ASSERT_NE(isUmts ? rrcState() : rrState(), isUmts ? "Disconnected" : "RR_IDLE");
   }
   if (isUmts && baseband.text("UMTS RR Info", "Ciphering") == "Enabled") {
-    ASSERT_THAT(rrcState(), AnyOf("CELL_DCH", "CELL_FACH"));
+    ASSERT_THAT(rrcState(), AnyOf("CELL_DCH", "CELL_FACH", "URA_PCH"));
   }
   if (baseband.text("Process PS", "MM State") == "GMM_DEREGISTERED") {
     ASSERT_EQ(daemon.entries("PDP Context Info"), 0u);

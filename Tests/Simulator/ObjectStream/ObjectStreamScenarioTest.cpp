@@ -7,6 +7,7 @@
 #include <set>
 #include <stdexcept>
 
+#include "Simulator/Radio/Reported.h"
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/PlayedScenario.h"
 
@@ -78,7 +79,8 @@ void ObjectStream::checkServingCell() {
   ASSERT_EQ(text({"Serving Cell", "Location Area Code"}), std::to_string(cell.locationArea.code));
   ASSERT_EQ(text({"Network", "PLMN", "MCC"}), std::to_string(cell.locationArea.plmn.mcc));
   const auto level = DecodingViewer::leadingNumber(text({"Serving Cell", isGsm ? "Received Level" : "RSCP"}));
-  ASSERT_NEAR(level.value(), world().reception(*world().serving()).level, 0.5);
+  const Reception& heard = world().reception(*world().serving());
+  ASSERT_NEAR(level.value(), isGsm ? reportedGsmLevel(heard) : reportedRscp(heard), 0.5);
 }
 
 // A technology's list alone among the neighbours collapses into their place.
