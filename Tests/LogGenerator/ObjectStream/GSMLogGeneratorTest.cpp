@@ -170,10 +170,10 @@ TEST(GSMLogGeneratorDeathTest, BothFailedAssertionsEndTheProcessWithTheirTexts) 
   const auto aborted = testing::KilledBySignal(SIGABRT);
   EXPECT_EXIT(endWith({}), aborted,
               "^<2>Terminating: uncaught kelvasi::AssertionFailure: Could not deserialize the object "
-              "\\(assertion in LogGenerator/ObjectStream/GSMLogGenerator\\)\n$");
+              "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
   EXPECT_EXIT(endWith(one("A", PlistArray::make({"x", one("B", 7)}))), aborted,
               "^<2>Terminating: uncaught kelvasi::AssertionFailure: Unknown object of type int encountered "
-              "\\(assertion in LogGenerator/ObjectStream/GSMLogGenerator\\)\n$");
+              "\\(assertion in LogGenerator/GSM/GSMLogGenerator\\)\n$");
 }
 
 // Messages as they come, cut and changed at every byte: each is shown or fails as an assertion does.
