@@ -22,7 +22,11 @@ void Base::updateSectionRef(PlistValue container) {
   trace(getSectionName());
 }
 
-void Base::updateWithData(RecordView, LogCode) {
+void Base::setSectionPath(std::string path) {
+  section_ = {.name = std::string(getSectionName()), .path = std::move(path), .role = role()};
+}
+
+Outcome Base::updateWithData(RecordView, LogCode) {
   throw UnimplementedMethodError("Base::updateWithData");
 }
 

@@ -6,11 +6,15 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
 #include <span>
+#include <string>
 #include <string_view>
 
+#include "LogGenerator/Intake.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordView.h"
+#include "LogGenerator/RowWriter.h"
 #include "Platform/Platform.h"
 #include "Platform/SystemLog.h"
 #include "Plist/PlistValue.h"
@@ -37,11 +41,20 @@ class Base {
   void updateSectionRef(PlistValue container);
   // The same without a line in the system log: for a display that is shown already.
   void moveToSection(PlistValue container) { sectionRef_ = std::move(container); }
+  // Where that container stands in the display: its JSON pointer, which the decoder's readings begin with.
+  void setSectionPath(std::string path);
+  // Null: nobody listens.
+  void gatherInto(Readings* readings) { readings_ = readings; }
 
   // Abstract: on Base itself each throws UnimplementedMethodError.
-  virtual void updateWithData(RecordView record, LogCode logCode);
+  virtual Outcome updateWithData(RecordView record, LogCode logCode);
   virtual std::string_view getSectionName() const;
   virtual std::span<const LogCode> getLogCodeArray() const;
+
+  // The byte that says which version of this record it is; nothing where the record has none.
+  virtual std::optional<std::size_t> versionAt(LogCode) const { return std::nullopt; }
+  // What the cells of the section are to the handset.
+  virtual CellRole role() const { return CellRole::none; }
 
   static void clearElementsInArray(PlistArray& array);
   static void replaceArrayWith(PlistArray& target, const PlistArray& source);
@@ -57,6 +70,12 @@ class Base {
   // write.
   PlistDictionary* sectionRows() const { return sectionRef_.dictionary(); }
   PlistArray* sectionList() const { return sectionRef_.array(); }
+  // What becomes of a record that is as it should be.
+  Outcome rowsOutcome() const { return sectionRows() ? Outcome::shown : Outcome::sectionMissing; }
+  Outcome listOutcome() const { return sectionList() ? Outcome::shown : Outcome::sectionMissing; }
+  // Where readings go; null when nobody listens, or there is no section that they could stand in.
+  Readings* readings() const { return sectionRef_.isAbsent() ? nullptr : readings_; }
+  ReadingPlace place() const { return {.readings = readings(), .section = &section_}; }
 
   void trace(std::string_view text, LogPriority priority = LogPriority::warning) const;
   void logUnknownMessage(LogCode logCode) const;
@@ -64,6 +83,8 @@ class Base {
  private:
   Platform platform_;
   PlistValue sectionRef_;
+  ReadingSection section_;
+  Readings* readings_ = nullptr;
 };
 
 }  // namespace kelvasi

@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "Platform/SystemLog.h"
+#include "Telvon/CellMonitor.h"
 
 namespace kelvasi {
 
@@ -12,17 +13,30 @@ bool CellTable::takes(const PlistValue& cell) const {
          });
 }
 
-void showCell(const PlistDictionary& cell, std::span<const CellRow> rows, RowWriter& writer, SystemLog& log) {
-  for (const CellRow& row : rows) {
-    const auto number = cellNumber(cell, row.cellKey);
-    if (!number) {
-      if (!row.failure.empty()) log.write(LogPriority::error, row.failure);
-    } else if (row.isMeasurement && *number == notMeasured) {
-      writer.text(row.key, std::string_view());
-    } else {
-      writer.number(row.key, std::int64_t{*number} * row.factor, row.unit);
+ServingCells::Word CellTable::identityOf(const PlistDictionary& cell) const {
+  const auto number = [&](std::string_view key) {
+    return key.empty() ? std::int64_t{CellIdentity::unknown}
+                       : cellNumber(cell, key).value_or(CellIdentity::unknown);
+  };
+  const auto cellId = cellNumber(cell, kTelvonCellMonitorCellId);
+  return {.cell = {keys.family, number(keys.channel), number(keys.code)},
+          .cellId = cellId ? std::optional<std::int64_t>(*cellId) : std::nullopt};
+}
+
+void showCell(const PlistDictionary& cell, const CellTable& table, RowWriter& writer, SystemLog& log) {
+  for (const auto& [row, cellKey, failure] : table.rows) {
+    if (const auto number = cellNumber(cell, cellKey)) {
+      writer.write(row, *number);
+    } else if (!failure.empty()) {
+      log.write(LogPriority::error, failure);
     }
   }
+  Readings* const readings = writer.readings();
+  if (!readings || table.keys.family == RadioFamily::none) return;
+  const ServingCells::Word word = table.identityOf(cell);
+  const bool isServing = table.type == kTelvonCellMonitorCellTypeServing;
+  if (isServing) readings->servingCells().say(cellInfoLogCode, word);
+  writer.identify(word.cell);
 }
 
 const PlistArray* cellsOf(const CellInfoArray& cellInfo, SystemLog& log) {
@@ -30,15 +44,16 @@ const PlistArray* cellsOf(const CellInfoArray& cellInfo, SystemLog& log) {
   return cellInfo.cells();
 }
 
-void showFirstCell(const Platform& platform, RecordView record, const CellTable& table,
-                   PlistDictionary& section) {
+bool showFirstCell(const Platform& platform, RecordView record, const CellTable& table,
+                   PlistDictionary& section, const ReadingPlace& place) {
   const CellInfoArray cellInfo(platform, record.payload());
   const PlistArray* cells = cellsOf(cellInfo, platform.log);
-  if (!cells) return;
+  if (!cells) return false;
   const auto cell = std::ranges::find_if(*cells, [&](const PlistValue& each) { return table.takes(each); });
-  if (cell == cells->end()) return;
-  RowWriter writer(section);
-  showCell(*cell->dictionary(), table.rows, writer, platform.log);
+  if (cell == cells->end()) return true;
+  RowWriter writer(section, place);
+  showCell(*cell->dictionary(), table, writer, platform.log);
+  return true;
 }
 
 }  // namespace kelvasi

@@ -55,6 +55,10 @@ void ClassIndex::unbindSections() {
   for (const auto& decoder : decoders_) decoder->moveToSection({});
 }
 
+void ClassIndex::gatherInto(Readings* readings) {
+  for (const auto& decoder : decoders_) decoder->gatherInto(readings);
+}
+
 void ClassIndex::status() const {
   platform_.log.print(LogPriority::warning, "Dictionary = %d", 1);
   platform_.log.print(LogPriority::warning, "String = %d", 0);

@@ -49,6 +49,9 @@ class ClassIndex {
   std::vector<std::string> getAllLogCodes() const { return codeDictionary_.keys(); }
   // From now on no decoder has anywhere to write.
   void unbindSections();
+  // Of all decoders. Null: nobody listens.
+  void gatherInto(Readings* readings);
+  std::span<const std::unique_ptr<Base>> decoders() const { return decoders_; }
   // A debugging aid: writes to the system log what kind of thing the class dictionary is.
   void status() const;
 

@@ -2,15 +2,11 @@
 
 namespace kelvasi {
 
-void ListDecoder::updateWithData(RecordView record, LogCode logCode) {
+Outcome ListDecoder::updateWithData(RecordView record, LogCode logCode) {
   trace(section_.trace, section_.tracePriority);
-  if (logCode == section_.logCode) {
-    showList(record);
-  } else if (logCode == cellInfoLogCode && section_.cells) {
-    showCells(record);
-  } else {
-    decodeOther(record, logCode);
-  }
+  if (logCode == section_.logCode) return showList(record);
+  if (logCode == cellInfoLogCode && section_.cells) return showCells(record);
+  return decodeOther(record, logCode);
 }
 
 void ListDecoder::addEntry(RecordView record, std::size_t place) {
@@ -18,33 +14,60 @@ void ListDecoder::addEntry(RecordView record, std::size_t place) {
   show(entry(record, place), section_.list.layout, section_.rows, row);
 }
 
-void ListDecoder::decodeOther(RecordView, LogCode logCode) {
+Outcome ListDecoder::decodeOther(RecordView, LogCode logCode) {
   logUnknownMessage(logCode);
+  return Outcome::notAskedFor;
 }
 
-void ListDecoder::showList(RecordView record) {
-  if (record.size() < section_.minimumLength) return;
-  // The section lets go of the entries first, so that their dictionaries can be used again.
-  if (sectionList()) clearElementsInArray(*sectionList());
+CellIdentity ListDecoder::cellOf(RecordView record, std::size_t place) const {
+  return kelvasi::cellOf(section_.cell, record, entry(record, place));
+}
+
+Outcome ListDecoder::showList(RecordView record) {
+  if (record.size() < section_.minimumLength) return Outcome::tooShort;
+  clearList();
   const std::size_t count = countOf(record, section_.list);
-  if (count == 0) return;
-  list_.startAgain();
-  for (std::size_t place = 0; place < count; ++place) addEntry(record, place);
+  if (count == 0) return listOutcome();
+  startList();
+  Readings* const listeners = listReadings();
+  const std::size_t first = listeners ? listeners->count() : 0;
+  for (std::size_t place = 0; place < count; ++place) {
+    const std::size_t before = listeners ? listeners->count() : 0;
+    addEntry(record, place);
+    if (listeners) listeners->identify(before, cellOf(record, place));
+  }
+  if (listeners && section_.cell.takesServingChannel)
+    listeners->takeChannel(first, listeners->servingCells().certain(section_.cell.family));
   if (sectionList() && !section_.staysEmpty) replaceArrayWith(*sectionList(), list_.entries());
+  return listOutcome();
 }
 
-void ListDecoder::showCells(RecordView record) {
+Outcome ListDecoder::showCells(RecordView record) {
   const CellInfoArray cellInfo(platform(), record.payload());
-  if (sectionList()) clearElementsInArray(*sectionList());
+  clearList();
   const PlistArray* cells = cellsOf(cellInfo, log());
-  if (!cells) return;
-  list_.startAgain();
+  if (!cells) return Outcome::propertyListRefused;
+  startList();
   for (const PlistValue& cell : *cells) {
     if (!section_.cells->takes(cell)) continue;
     RowWriter row = addRows();
-    showCell(*cell.dictionary(), section_.cells->rows, row, log());
+    showCell(*cell.dictionary(), *section_.cells, row, log());
   }
   if (sectionList()) replaceArrayWith(*sectionList(), list_.entries());
+  return listOutcome();
+}
+
+// The section lets go of the entries first, so that their dictionaries can be used again.
+void ListDecoder::clearList() {
+  if (!sectionList()) return;
+  if (readings()) readings()->addRemovals(*place().section, {}, sectionList()->size());
+  clearElementsInArray(*sectionList());
+}
+
+void ListDecoder::startList() {
+  ReadingPlace own = place();
+  own.readings = listReadings();
+  list_.startAgain(own);
 }
 
 }  // namespace kelvasi

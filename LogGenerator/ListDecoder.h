@@ -6,6 +6,7 @@
 #include <string_view>
 
 #include "LogGenerator/Base.h"
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/CellRows.h"
 #include "LogGenerator/EntryList.h"
 #include "LogGenerator/Row.h"
@@ -24,6 +25,8 @@ struct ListSection {
   std::span<const Row> rows = {};    // of an entry
   bool staysEmpty = false;           // the entries are read and not shown
   const CellTable* cells = nullptr;  // for the cell-information record
+  CellRole role = CellRole::none;
+  CellFields cell = {};  // of an entry
 };
 
 class ListDecoder : public Base {
@@ -31,24 +34,31 @@ class ListDecoder : public Base {
   // `section` outlives the decoder.
   ListDecoder(const Platform& platform, const ListSection& section) : Base(platform), section_(section) {}
 
-  void updateWithData(RecordView record, LogCode logCode) override;
+  Outcome updateWithData(RecordView record, LogCode logCode) override;
   std::string_view getSectionName() const override { return section_.name; }
   std::span<const LogCode> getLogCodeArray() const override { return section_.logCodes; }
+  CellRole role() const override { return section_.role; }
 
  protected:
   // Adds what the section shows of one entry, if anything; unless overridden, the rows of the table.
   virtual void addEntry(RecordView record, std::size_t place);
   // A record that neither table describes; unless overridden, the unknown-message line.
-  virtual void decodeOther(RecordView record, LogCode logCode);
+  virtual Outcome decodeOther(RecordView record, LogCode logCode);
 
+  // Which cell an entry is; unless overridden, what its fields say.
+  virtual CellIdentity cellOf(RecordView record, std::size_t place) const;
   RowWriter addRows() { return list_.add(); }
   RecordView entry(RecordView record, std::size_t place) const {
     return entryOf(record, section_.list, place);
   }
 
  private:
-  void showList(RecordView record);
-  void showCells(RecordView record);
+  Outcome showList(RecordView record);
+  Outcome showCells(RecordView record);
+  // Where readings go; null when nothing is shown.
+  Readings* listReadings() const { return sectionList() && !section_.staysEmpty ? readings() : nullptr; }
+  void clearList();
+  void startList();
 
   const ListSection& section_;
   RowList list_;

@@ -14,14 +14,18 @@ namespace kelvasi {
 class ListRow {
  public:
   // One dictionary for each entry of the record's list; an empty array when it counts none.
+  // `place` is the section's.
   void show(RecordView record, const EntryList& list, std::span<const Row> rows, std::string_view key,
-            PlistDictionary& section);
-  void show(const PlistArray& elements, std::string_view key, PlistDictionary& section);
+            PlistDictionary& section, const ReadingPlace& place);
+  // The row's first field of each entry, without keys.
+  void show(RecordView record, const EntryList& list, const Row& row, PlistDictionary& section,
+            const ReadingPlace& place);
 
  private:
-  PlistArray& emptied(std::string_view key, PlistDictionary& section);
+  PlistArray& emptied(std::string_view key, PlistDictionary& section, const ReadingPlace& place);
 
   RowList list_;
+  PlistArray elements_;
   PlistValue::Array shown_;
 };
 

@@ -5,7 +5,6 @@
 #include <stdexcept>
 #include <utility>
 
-#include "LogGenerator/RecordFraming.h"
 #include "LogGenerator/TemplateShape.h"
 #include "Platform/PlistSerialiser.h"
 #include "Platform/Resources.h"
@@ -26,6 +25,11 @@ PlistValue storable(PlistValue value) {
 bool isSameContainer(const PlistValue& one, const PlistValue& other) {
   const bool isContainer = one.dictionary() || one.array();
   return isContainer && one.dictionary() == other.dictionary() && one.array() == other.array();
+}
+
+std::string pathWith(std::string path, std::string_view step) {
+  appendPathStep(path, step);
+  return path;
 }
 
 // Logs ahead of what the base's construction logs.
@@ -56,15 +60,28 @@ OrvaneLogGenerator2::~OrvaneLogGenerator2() {
 
 void OrvaneLogGenerator2::updateWithData(std::span<const std::uint8_t> data) {
   const auto framed = frameRecord(data);
-  if (!framed) return;
-  if (!framed->hasKnownType()) {
-    platform().log.print(LogPriority::error, "Invalid log type: %x. Dropping.", unsigned{framed->logType});
-    return;
+  if (readings()) readings()->begin(arrival(), framed ? framed->logCode : 0);
+  if (!framed) return count(0, Outcome::notARecord, data);
+  if (framed->hasKnownType()) return decode(*framed);
+  platform().log.print(LogPriority::error, "Invalid log type: %x. Dropping.", unsigned{framed->logType});
+  count(framed->logCode, Outcome::unknownLogType, framed->record.bytes());
+}
+
+// Of several decoders the first one says what became of the record, unless a later one showed it.
+void OrvaneLogGenerator2::decode(const FramedRecord& framed) {
+  std::optional<Outcome> outcome;
+  std::optional<std::size_t> versionAt;
+  for (Base* decoder : cIndex_ ? cIndex_->getSubscribers(framed.logCode) : std::span<Base* const>()) {
+    const Outcome own = decoder->updateWithData(framed.record, framed.logCode);
+    if (!outcome || own == Outcome::shown) outcome = own;
+    if (!versionAt) versionAt = decoder->versionAt(framed.logCode);
   }
-  if (!cIndex_) return;
-  for (Base* decoder : cIndex_->getSubscribers(framed->logCode)) {
-    decoder->updateWithData(framed->record, framed->logCode);
-  }
+  count(framed.logCode, outcome.value_or(Outcome::notAskedFor), framed.record.bytes(), versionAt);
+}
+
+void OrvaneLogGenerator2::gatherInto(Readings* readings) {
+  OrvaneLogGenerator::gatherInto(readings);
+  if (cIndex_) cIndex_->gatherInto(readings);
 }
 
 void OrvaneLogGenerator2::updateState(PlistDictionary& state, std::span<const std::uint8_t> data) {
@@ -134,7 +151,7 @@ void OrvaneLogGenerator2::bindTo(const PlistDictionary& state, const PlistValue&
   isOwn_ = ownsDisplay(state);
   bound_ = display;
   if (cIndex_) cIndex_->unbindSections();
-  if (isOwn_) bindSections(*state.find("Template"), display);
+  if (isOwn_) bindSections(*state.find("Template"), display, {});
 }
 
 PlistValue OrvaneLogGenerator2::loadTemplate() const {
@@ -145,19 +162,28 @@ PlistValue OrvaneLogGenerator2::loadTemplate() const {
 }
 
 PlistValue OrvaneLogGenerator2::processTemplate(const PlistValue& object) {
+  return processTemplate(object, {});
+}
+
+PlistValue OrvaneLogGenerator2::processTemplate(const PlistValue& object, const std::string& path) {
   if (object.string()) return object;
   if (const PlistDictionary* entries = object.dictionary()) {
     const auto copy = PlistDictionary::make();
     for (const auto& [key, value] : *entries) {
-      const PlistValue processed = processTemplate(value);
-      if (Base* decoder = cIndex_ ? cIndex_->getClass(key) : nullptr) decoder->updateSectionRef(processed);
+      const std::string place = pathWith(path, key);
+      const PlistValue processed = processTemplate(value, place);
+      if (Base* decoder = cIndex_ ? cIndex_->getClass(key) : nullptr) {
+        decoder->updateSectionRef(processed);
+        decoder->setSectionPath(place);
+      }
       copy->set(key, storable(processed));
     }
     return copy;
   }
   if (const PlistArray* elements = object.array()) {
     const auto copy = PlistArray::make();
-    for (const PlistValue& element : *elements) copy->append(storable(processTemplate(element)));
+    for (const PlistValue& element : *elements)
+      copy->append(storable(processTemplate(element, pathWith(path, std::to_string(copy->size())))));
     return copy;
   }
   platform().log.print(LogPriority::error, "%s", unknownObject);
@@ -166,21 +192,26 @@ PlistValue OrvaneLogGenerator2::processTemplate(const PlistValue& object) {
 }
 
 // In the order of processTemplate, so that the same occurrence of a section wins.
-void OrvaneLogGenerator2::bindSections(const PlistValue& displayTemplate, const PlistValue& display) {
+void OrvaneLogGenerator2::bindSections(const PlistValue& displayTemplate, const PlistValue& display,
+                                       const std::string& path) {
   const PlistDictionary* entries = displayTemplate.dictionary();
   if (entries && display.dictionary()) {
     for (const auto& [key, value] : *entries) {
       const PlistValue section = display.dictionary()->get(key);
       if (section.isAbsent()) continue;
-      bindSections(value, section);
-      if (Base* decoder = cIndex_ ? cIndex_->getClass(key) : nullptr) decoder->moveToSection(section);
+      const std::string place = pathWith(path, key);
+      bindSections(value, section, place);
+      if (Base* decoder = cIndex_ ? cIndex_->getClass(key) : nullptr) {
+        decoder->moveToSection(section);
+        decoder->setSectionPath(place);
+      }
     }
   }
   const PlistArray* elements = displayTemplate.array();
   if (elements && display.array()) {
     const std::size_t count = std::min(elements->size(), display.array()->size());
     for (std::size_t place = 0; place < count; ++place)
-      bindSections(elements->at(place), display.array()->at(place));
+      bindSections(elements->at(place), display.array()->at(place), pathWith(path, std::to_string(place)));
   }
 }
 

@@ -8,6 +8,7 @@
 
 #include "LogGenerator/ClassIndex.h"
 #include "LogGenerator/OrvaneLogGenerator.h"
+#include "LogGenerator/RecordFraming.h"
 
 namespace kelvasi {
 
@@ -24,6 +25,7 @@ class OrvaneLogGenerator2 : public OrvaneLogGenerator {
   void updateWithData(std::span<const std::uint8_t> data);
 
   void updateState(PlistDictionary& state, std::span<const std::uint8_t> data) override;
+  void gatherInto(Readings* readings) override;
   PlistValue generateLogUsingState(PlistDictionary& state) override;
   PlistValue getStartCommand() const override;
   // A display is of this technology when the state's template is, by value, and the display has its shape.
@@ -41,10 +43,13 @@ class OrvaneLogGenerator2 : public OrvaneLogGenerator {
 
  private:
   PlistValue loadTemplate() const;
+  void decode(const FramedRecord& framed);
   void bindTo(const PlistDictionary& state, const PlistValue& display);
+  // As processTemplate without a path, for a part that stands at `path` in the display.
+  PlistValue processTemplate(const PlistValue& object, const std::string& path);
   // Binds the decoders to the sections of a display of this template. What decoders added to it is not looked
   // into.
-  void bindSections(const PlistValue& displayTemplate, const PlistValue& display);
+  void bindSections(const PlistValue& displayTemplate, const PlistValue& display, const std::string& path);
 
   std::string pListName_;
   std::unique_ptr<ClassIndex> cIndex_;  // null without template

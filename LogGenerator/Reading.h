@@ -28,8 +28,8 @@ constexpr std::string_view nameOf(CellRole role) {
 
 // A section of the display that rows are written into.
 struct ReadingSection {
-  std::string name;
-  std::string path;  // the JSON pointer (RFC 6901) to it in the display
+  std::string name = {};
+  std::string path = {};  // the JSON pointer (RFC 6901) to it in the display
   CellRole role = CellRole::none;
 };
 

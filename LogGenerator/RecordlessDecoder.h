@@ -11,7 +11,7 @@ class RecordlessDecoder : public StateDecoder {
 
  protected:
   // No record is meant for the section, so none is unknown either.
-  void decodeOther(RecordView, LogCode) override {}
+  Outcome decodeOther(RecordView, LogCode) override { return Outcome::notAskedFor; }
 };
 
 }  // namespace kelvasi

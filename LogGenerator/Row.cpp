@@ -123,8 +123,4 @@ std::int64_t rawOf(RecordView record, std::span<const Field> layout, const Row& 
   return row.lowBits < field.width ? value & ((std::int64_t{1} << row.lowBits) - 1) : value;
 }
 
-void show(RecordView record, std::span<const Field> layout, std::span<const Row> rows, RowWriter& writer) {
-  for (const Row& row : rows) writer.text(row.key, deferredText(row, rawOf(record, layout, row)));
-}
-
 }  // namespace kelvasi

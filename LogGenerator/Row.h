@@ -15,7 +15,6 @@
 
 #include "LogGenerator/FixedPoint.h"
 #include "LogGenerator/RecordLayout.h"
-#include "LogGenerator/RowWriter.h"
 #include "Plist/PlistValue.h"
 #include "Radio/Quantity.h"
 
@@ -56,8 +55,8 @@ constexpr double fromRaw(std::int64_t raw) {
 // the whole number raw * factor + offset.
 struct Row {
   std::string_view key;
-  std::reference_wrapper<const Quantity> quantity = quantity::none;
-  std::size_t field = 0;         // its place in the layout
+  std::reference_wrapper<const Quantity> quantity;  // without one a row does not compile
+  std::size_t field = 0;                            // its place in the layout
   unsigned lowBits = 32;         // how many of the value's bits count; fewer only for unsigned fields
   std::string_view before = {};  // stands right before a number
   std::string_view unit = {};    // stands right after a number, its blank included
@@ -85,8 +84,5 @@ DeferredText deferredText(const Row& row, std::int64_t raw);
 std::optional<double> numberOf(const Row& row, std::int64_t raw);
 // The value of the row's field.
 std::int64_t rawOf(RecordView record, std::span<const Field> layout, const Row& row);
-
-// Writes the rows of one record, in order.
-void show(RecordView record, std::span<const Field> layout, std::span<const Row> rows, RowWriter& writer);
 
 }  // namespace kelvasi

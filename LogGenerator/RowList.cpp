@@ -8,10 +8,13 @@ RowWriter RowList::add() {
   PlistValue::Dictionary& entry = pool_[place];
   if (entry.use_count() != 1) entry = std::make_shared<PlistDictionary>();
   entries_.append(entry);
-  return RowWriter(*entry, Rows::anew);
+  ReadingPlace own = place_;
+  (own.list.empty() ? own.entry : own.element) = static_cast<std::int32_t>(place);
+  return RowWriter(*entry, own, Rows::anew);
 }
 
-void RowList::startAgain() {
+void RowList::startAgain(const ReadingPlace& place) {
+  place_ = place;
   entries_.removeAll();
 }
 

@@ -14,13 +14,15 @@ class RowList {
  public:
   // The next entry; it holds what is written through the result. One entry is written at a time.
   RowWriter add();
-  void startAgain();
+  // `place` is the list's own.
+  void startAgain(const ReadingPlace& place);
 
   const PlistArray& entries() const { return entries_; }
 
  private:
   std::vector<PlistValue::Dictionary> pool_;
   PlistArray entries_;
+  ReadingPlace place_;
 };
 
 }  // namespace kelvasi

@@ -4,54 +4,103 @@
 // were written, in the order of writing, yet uses the strings that stand there again.
 #pragma once
 
-#include <algorithm>
-#include <array>
-#include <charconv>
-#include <concepts>
 #include <cstddef>
 #include <string_view>
 
+#include "LogGenerator/Readings.h"
+#include "LogGenerator/Row.h"
 #include "Plist/PlistValue.h"
 
 namespace kelvasi {
 
 enum class Rows { kept, anew };
 
+// Where the rows that are written stand, for those who listen.
+struct ReadingPlace {
+  Readings* readings = nullptr;  // null: nobody listens
+  const ReadingSection* section = nullptr;
+  std::int32_t entry = Reading::notInList;
+  std::string_view list = {};
+  std::int32_t element = Reading::notInList;
+
+  Reading written(const Row& row, std::int64_t raw, std::string_view key) const {
+    return {.entry = entry,
+            .element = element,
+            .section = section,
+            .row = &row,
+            .raw = raw,
+            .list = list,
+            .key = key};
+  }
+  Reading removed(std::string_view key) const {
+    return {.kind = Reading::Kind::removal,
+            .entry = entry,
+            .element = element,
+            .section = section,
+            .list = list,
+            .key = key};
+  }
+};
+
+// What a list without entries, and an entry without rows, is.
+inline constexpr Row emptyList{.key = "", .quantity = quantity::list, .special = ValueText{0, "[]"}};
+inline constexpr Row emptyGroup{.key = "", .quantity = quantity::group, .special = ValueText{0, "{}"}};
+
 class RowWriter {
  public:
-  explicit RowWriter(PlistDictionary& rows, Rows mode = Rows::kept) : rows_(rows), mode_(mode) {}
+  explicit RowWriter(PlistDictionary& rows, const ReadingPlace& place = {}, Rows mode = Rows::kept)
+      : rows_(rows), place_(place), mode_(mode), before_(place.readings ? place.readings->count() : 0) {}
   ~RowWriter() {
-    if (mode_ == Rows::anew) rows_.truncate(place_);
+    if (mode_ == Rows::kept) return;
+    rows_.truncate(next_);
+    if (next_ == 0 && place_.readings) place_.readings->add(place_.written(emptyGroup, 0, {}));
   }
   RowWriter(const RowWriter&) = delete;
   RowWriter& operator=(const RowWriter&) = delete;
 
-  void text(std::string_view key, std::string_view text) {
-    place_ = mode_ == Rows::anew ? rows_.rewriteText(key, text, place_) : rows_.setText(key, text, place_);
+  // `row` lasts as long as the process.
+  void write(const Row& row, std::int64_t raw) {
+    const DeferredText text = deferredText(row, raw);
+    next_ =
+        mode_ == Rows::anew ? rows_.rewriteText(row.key, text, next_) : rows_.setText(row.key, text, next_);
+    if (place_.readings) place_.readings->add(place_.written(row, raw, row.key));
+  }
+  void remove(std::string_view key) {
+    if (rows_.remove(key) && place_.readings) place_.readings->add(place_.removed(key));
   }
 
-  void text(std::string_view key, DeferredText text) {
-    place_ = mode_ == Rows::anew ? rows_.rewriteText(key, text, place_) : rows_.setText(key, text, place_);
+  // The cell that the rows written so far are about.
+  void identify(const CellIdentity& cell) {
+    if (place_.readings) place_.readings->identify(before_, cell);
   }
-  // As "%d" of a 32-bit integer, the unit (at most 16 characters) right after it.
-  template <std::integral Integer>
-  void number(std::string_view key, Integer value, std::string_view unit = {}) {
-    std::array<char, 32> shown;
-    char* end = std::to_chars(shown.data(), shown.data() + 16, static_cast<std::int32_t>(value)).ptr;
-    end = std::ranges::copy(unit.substr(0, 16), end).out;
-    text(key, {shown.data(), static_cast<std::size_t>(end - shown.data())});
-  }
+  Readings* readings() const { return place_.readings; }
 
-  // A row that is no text. Setting the absent value removes the row.
-  void value(std::string_view key, PlistValue value) {
-    if (mode_ == Rows::anew) text(key, std::string_view());
-    rows_.set(key, std::move(value));
+  // A row that holds a list, which is empty now, and its elements, each of them shown as `row` says.
+  void list(std::string_view key, const PlistValue::Array& list) {
+    if (mode_ == Rows::anew) next_ = rows_.rewriteText(key, std::string_view(), next_);
+    rows_.set(key, list);
+    if (place_.readings) place_.readings->add(place_.written(emptyList, 0, key));
+  }
+  void element(PlistArray& list, const Row& row, std::int64_t raw) {
+    ReadingPlace own = place_;
+    own.list = row.key;
+    own.element = static_cast<std::int32_t>(list.size());
+    list.append(deferredText(row, raw));
+    if (own.readings) own.readings->add(own.written(row, raw, {}));
   }
 
  private:
   PlistDictionary& rows_;
+  ReadingPlace place_;
   Rows mode_;
-  std::size_t place_ = 0;  // where the next row is expected
+  std::size_t before_;    // readings before the first row
+  std::size_t next_ = 0;  // where the next row is expected
 };
+
+// Writes the rows of one record, in order.
+inline void show(RecordView record, std::span<const Field> layout, std::span<const Row> rows,
+                 RowWriter& writer) {
+  for (const Row& row : rows) writer.write(row, rawOf(record, layout, row));
+}
 
 }  // namespace kelvasi

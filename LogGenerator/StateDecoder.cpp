@@ -4,26 +4,48 @@
 
 namespace kelvasi {
 
-void StateDecoder::updateWithData(RecordView record, LogCode logCode) {
+namespace {
+
+constexpr std::array<std::string_view, 2> versionNames{"version", "layout version"};
+
+}  // namespace
+
+Outcome StateDecoder::updateWithData(RecordView record, LogCode logCode) {
   trace(section_.trace);
   if (logCode == cellInfoLogCode && section_.cells) return showCell(record);
   const auto rows = std::ranges::find(section_.records, logCode, &RecordRows::logCode);
-  if (rows == section_.records.end()) {
-    decodeOther(record, logCode);
-  } else if (record.size() >= rows->minimumLength && sectionRows()) {
-    RowWriter writer(*sectionRows());
-    show(record, rows->layout, rows->rows, writer);
-  }
+  return rows == section_.records.end() ? decodeOther(record, logCode) : showRows(record, *rows);
+}
+
+Outcome StateDecoder::showRows(RecordView record, const RecordRows& rows) {
+  if (record.size() < rows.minimumLength) return Outcome::tooShort;
+  if (!sectionRows()) return Outcome::sectionMissing;
+  RowWriter writer(*sectionRows(), place());
+  const std::size_t before = readings() ? readings()->count() : 0;
+  show(record, rows.layout, rows.rows, writer);
+  if (readings() && rows.cell.family != RadioFamily::none)
+    readings()->identify(before, servingCellOf(rows.cell, record, rows.logCode, readings()->servingCells()));
+  return Outcome::shown;
 }
 
 // An unbound section gets the same lines into the system log.
-void StateDecoder::showCell(RecordView record) {
+Outcome StateDecoder::showCell(RecordView record) {
   PlistDictionary nowhere;
-  showFirstCell(platform(), record, *section_.cells, sectionRows() ? *sectionRows() : nowhere);
+  const bool isShown =
+      showFirstCell(platform(), record, *section_.cells, sectionRows() ? *sectionRows() : nowhere, place());
+  return isShown ? rowsOutcome() : Outcome::propertyListRefused;
 }
 
-void StateDecoder::decodeOther(RecordView, LogCode logCode) {
+Outcome StateDecoder::decodeOther(RecordView, LogCode logCode) {
   logUnknownMessage(logCode);
+  return Outcome::notAskedFor;
+}
+
+std::optional<std::size_t> StateDecoder::versionAt(LogCode logCode) const {
+  const auto rows = std::ranges::find(section_.records, logCode, &RecordRows::logCode);
+  if (rows == section_.records.end()) return std::nullopt;
+  const auto field = std::ranges::find_first_of(rows->layout, versionNames, {}, &Field::name);
+  return field == rows->layout.end() ? std::nullopt : std::optional(field->byte);
 }
 
 }  // namespace kelvasi

@@ -6,6 +6,7 @@
 #include <string_view>
 
 #include "LogGenerator/Base.h"
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/CellRows.h"
 #include "LogGenerator/Row.h"
 
@@ -16,6 +17,7 @@ struct RecordRows {
   std::size_t minimumLength = 0;  // a shorter record is ignored
   std::span<const Field> layout;
   std::span<const Row> rows;
+  CellFields cell = {};
 };
 
 struct StateSection {
@@ -24,6 +26,7 @@ struct StateSection {
   std::span<const LogCode> logCodes;
   std::span<const RecordRows> records = {};
   const CellTable* cells = nullptr;  // the first such cell of the cell-information record is shown
+  CellRole role = CellRole::none;
 };
 
 class StateDecoder : public Base {
@@ -31,16 +34,19 @@ class StateDecoder : public Base {
   // `section` outlives the decoder.
   StateDecoder(const Platform& platform, const StateSection& section) : Base(platform), section_(section) {}
 
-  void updateWithData(RecordView record, LogCode logCode) override;
+  Outcome updateWithData(RecordView record, LogCode logCode) override;
+  std::optional<std::size_t> versionAt(LogCode logCode) const override;
+  CellRole role() const override { return section_.role; }
   std::string_view getSectionName() const override { return section_.name; }
   std::span<const LogCode> getLogCodeArray() const override { return section_.logCodes; }
 
  protected:
   // A record that no table describes; unless overridden, the unknown-message line.
-  virtual void decodeOther(RecordView record, LogCode logCode);
+  virtual Outcome decodeOther(RecordView record, LogCode logCode);
 
  private:
-  void showCell(RecordView record);
+  Outcome showRows(RecordView record, const RecordRows& rows);
+  Outcome showCell(RecordView record);
 
   const StateSection& section_;
 };

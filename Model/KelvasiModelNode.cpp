@@ -3,12 +3,11 @@
 #include <algorithm>
 
 #include "LogGenerator/ArrayLock.h"
+#include "LogGenerator/SortPrefix.h"
 
 namespace kelvasi {
 
 namespace {
-
-constexpr std::string_view sortedMark = "_sorted";
 
 std::vector<const PlistDictionary::Entry*> entriesInOrder(const PlistDictionary& entries, bool isSorted) {
   std::vector<const PlistDictionary::Entry*> order;
@@ -17,14 +16,6 @@ std::vector<const PlistDictionary::Entry*> entriesInOrder(const PlistDictionary&
   if (isSorted)
     std::ranges::sort(order, {}, [](const auto* entry) -> const std::string& { return entry->first; });
   return order;
-}
-
-// Without the sort prefix, when the key is a prefix, one ";" and a name.
-std::string_view nameInSorted(std::string_view key) {
-  const std::size_t separator = key.find(';');
-  const bool isPrefixed =
-      separator != std::string_view::npos && key.find(';', separator + 1) == std::string_view::npos;
-  return isPrefixed ? key.substr(separator + 1) : key;
 }
 
 class TreeBuilder {
@@ -52,7 +43,7 @@ class TreeBuilder {
     for (const auto* entry : entriesInOrder(entries, isSorted)) {
       const auto& [key, value] = *entry;
       if (key == sortedMark) continue;
-      const std::string_view name = isSorted ? nameInSorted(key) : key;
+      const std::string_view name = isSorted ? withoutSortPrefix(key) : key;
       children.push_back(build(name, value, pathByAppending(path, name)));
     }
     return children;

@@ -131,6 +131,7 @@ inline constexpr Quantity newTransmissions{"new_transmissions", "", Kind::count,
 inline constexpr Quantity blockErrors{"block_errors", "", Kind::count, 0, 65535, ""};
 inline constexpr Quantity subFrames{"sub_frames", "", Kind::count, 0, 1023, ""};
 inline constexpr Quantity antennas{"antennas", "", Kind::count, 0, 255, "3GPP TS 36.211, 6.2.1"};
+inline constexpr Quantity count{"count", "", Kind::count, 0, 255, ""};
 inline constexpr Quantity drxCycles{"drx_cycles", "", Kind::count, 0, 63, "3GPP TS 36.133, 4.2.2.1"};
 
 // Parameters.
@@ -183,7 +184,8 @@ inline constexpr std::array all{
     &serviceType, &plmnSelection, &rrState, &rrSubState, &rrStatus, &rrMode, &rrcState, &oneXState,
     &evdoState, &evdoSession, &roaming, &ciphering, &dtx, &access, &accessRestrictions, &cellSet, &rat, &flag,
     //
-    &crcs, &crcErrors, &receivedBits, &newTransmissions, &blockErrors, &subFrames, &antennas, &drxCycles,
+    &crcs, &crcErrors, &receivedBits, &newTransmissions, &blockErrors, &subFrames, &antennas, &count,
+    &drxCycles,
     //
     &version, &bandwidth, &priority, &qrxlevmin, &pMax, &ueTxPower, &searchThreshold, &measurementRules,
     &frameNumber, &window, &carriers, &hoppingSequence, &operatingMode, &cellOption, &drxTimer,

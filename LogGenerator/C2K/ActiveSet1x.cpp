@@ -4,14 +4,21 @@
 #include <cmath>
 
 #include "LogGenerator/C2K/DeviceStatus.h"
-#include "LogGenerator/C2K/FormattedText.h"
-#include "LogGenerator/C2K/PilotList.h"
+#include "LogGenerator/C2K/ValueTexts.h"
 
 namespace kelvasi {
 
 namespace {
 
 using namespace deviceStatus;
+
+constexpr Row pilotRow{
+    .key = "k1xActiveSetInfo", .quantity = quantity::ecio, .unit = " dB", .scale = decibelScale};
+constexpr Row referenceRow{.key = "k1xActiveSetInfo",
+                           .quantity = quantity::ecio,
+                           .before = "(ref pilot) ",
+                           .unit = " dB",
+                           .scale = decibelScale};
 
 constexpr double leastRatio = 0.00001;  // -50 dB
 
@@ -36,20 +43,24 @@ struct EnergyScale {
 
 }  // namespace
 
-PlistValue activeSet1x(RecordView subPacket) {
+PilotList activeSet1x(RecordView subPacket, std::int64_t channel) {
   const EnergyScale scale(subPacket);
   const std::int64_t count = valueOf(subPacket, fieldIn(activeSetLayout, "count"));
   const std::int64_t fingers = valueOf(subPacket, fieldIn(activeSetLayout, "fingers"));
   const std::int64_t reference = valueOf(subPacket, fieldIn(activeSetLayout, "reference PN offset"));
-  PilotList pilots;
+  PilotList pilots(RadioFamily::cdma);
   for (std::size_t place = 0; place < static_cast<std::size_t>(count); ++place) {
     const RecordView pilot = subPacket.from(pilotStride(fingers) * place);
     const std::int64_t offset = valueOf(pilot, fieldIn(pilotLayout, "PN offset"));
-    pilots.add(place, offset,
-               FormattedText("%s%+.2f dB", offset == reference ? "(ref pilot) " : "",
-                             scale.decibels(pilot.u16(pilotEnergyAt(fingers)))));
+    const double ratio = scale.decibels(pilot.u16(pilotEnergyAt(fingers)));
+    pilots.add(place, offset, offset == reference ? referenceRow : pilotRow, rawOf(ratio), channel);
   }
-  return pilots.list();
+  return pilots;
+}
+
+CellIdentity referenceCell(RecordView subPacket, std::int64_t channel) {
+  if (valueOf(subPacket, fieldIn(activeSetLayout, "count")) == 0) return {};
+  return {RadioFamily::cdma, channel, valueOf(subPacket, fieldIn(activeSetLayout, "reference PN offset"))};
 }
 
 }  // namespace kelvasi

@@ -1,12 +1,15 @@
 // The pilots of the 1x active set with their Ec/Io.
 #pragma once
 
+#include "LogGenerator/C2K/PilotList.h"
 #include "LogGenerator/RecordView.h"
-#include "Plist/PlistValue.h"
 
 namespace kelvasi {
 
-// The list of the active-set sub-packet; without pilots it is empty, never "(none)".
-PlistValue activeSet1x(RecordView subPacket);
+// The list of the active-set sub-packet; without pilots it is empty, never "(none)". `channel` is theirs.
+PilotList activeSet1x(RecordView subPacket, std::int64_t channel);
+
+// The cell of the reference pilot; none without pilots.
+CellIdentity referenceCell(RecordView subPacket, std::int64_t channel);
 
 }  // namespace kelvasi

@@ -13,6 +13,7 @@
 #include "LogGenerator/C2K/SystemParameters.h"
 #include "LogGenerator/C2K/TrafficFER.h"
 #include "LogGenerator/RecordFraming.h"
+#include "LogGenerator/SortPrefix.h"
 #include "Platform/PlistSerialiser.h"
 #include "Platform/Resources.h"
 
@@ -29,10 +30,9 @@ constexpr std::array records{
     C2KRecord{deviceStatus::logCode, parseDeviceStatus},
     C2KRecord{trafficFER::logCode, parseTrafficFER},
     C2KRecord{evdoReverseRate::logCode, parseEvdoReverseRate},
-    C2KRecord{systemParameters::logCode, parseSystemParameters},
+    C2KRecord{systemParameters::logCode, parseSystemParameters,
+              fieldIn(systemParameters::layout, "version").byte},
 };
-
-constexpr std::string_view sortedMark = "_sorted";
 
 PlistValue loadTemplate(const Platform& platform) {
   const auto bytes = platform.resources.contents("C2KTemplate", "plist");
@@ -59,6 +59,7 @@ void C2KLogGenerator::updateState(PlistDictionary& state, std::span<const std::u
     isOwn_ = ownsDisplay(state);
     seen_ = display;
   }
+  if (readings()) sections_.learn(display);
   const PlistValue lookup = isOwn_ ? state.get("Lookup") : PlistValue();
   if (lookup.dictionary()) return updateFromLog(data, *lookup.dictionary(), state);
   updateFromLog(data, PlistDictionary(), state);
@@ -74,14 +75,20 @@ bool C2KLogGenerator::ownsDisplay(const PlistDictionary& state) const {
 void C2KLogGenerator::updateFromLog(std::span<const std::uint8_t> data, const PlistDictionary& lookup,
                                     PlistDictionary& state) {
   const auto framed = frameRecord(data);
-  if (!framed) return;
+  if (readings()) readings()->begin(arrival(), framed ? framed->logCode : 0);
+  if (!framed) return count(0, Outcome::notARecord, data);
   // Despite its wording the line does not stop the record.
-  if (framed->logType != 1) {
+  const bool isKnownType = framed->logType == 1;
+  if (!isKnownType) {
     platform().log.print(LogPriority::error, "Invalid log type: %x. Dropping.", unsigned{framed->logType});
   }
   const auto* const record = std::ranges::find(records, framed->logCode, &C2KRecord::logCode);
-  if (record == records.end()) return;
-  record->parse({framed->record, state, lookup, platform().log});
+  if (record == records.end())
+    return count(framed->logCode, isKnownType ? Outcome::notAskedFor : Outcome::unknownLogType,
+                 framed->record.bytes());
+  const Outcome outcome =
+      record->parse({framed->record, state, lookup, platform().log, sections_, readings()});
+  count(framed->logCode, outcome, framed->record.bytes(), record->versionAt);
   appendRawMessage(framed->record.bytes());
 }
 

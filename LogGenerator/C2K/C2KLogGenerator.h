@@ -5,6 +5,7 @@
 // record: "TrafficFER", "FLDataSeqNum", "FLDataSent", "RLDataSeqNum" and "RLDataSent".
 #pragma once
 
+#include "LogGenerator/C2K/C2KSections.h"
 #include "LogGenerator/OrvaneLogGenerator.h"
 #include "Platform/SystemLog.h"
 
@@ -40,6 +41,7 @@ class C2KLogGenerator : public OrvaneLogGenerator {
  private:
   PlistValue seen_;  // the display last looked at
   bool isOwn_ = false;
+  C2KSections sections_;
 };
 
 }  // namespace kelvasi

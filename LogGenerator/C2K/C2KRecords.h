@@ -3,22 +3,24 @@
 #pragma once
 
 #include "LogGenerator/C2K/C2KUpdate.h"
+#include "LogGenerator/Intake.h"
 #include "LogGenerator/LogCode.h"
 
 namespace kelvasi {
 
 struct C2KRecord {
   LogCode logCode;
-  void (*parse)(const C2KUpdate& update);
+  Outcome (*parse)(const C2KUpdate& update);
+  std::optional<std::size_t> versionAt = {};  // the byte that says the record's version
 };
 
-void parseEvdoStatus(const C2KUpdate& update);        // 0x1183
-void parseEvdoActiveSet(const C2KUpdate& update);     // 0x12B6
-void parseEvdoForwardRate(const C2KUpdate& update);   // 0x1192
-void parseEvdoReverseRate(const C2KUpdate& update);   // 0x127E
-void parseFingers(const C2KUpdate& update);           // 0x108A
-void parseDeviceStatus(const C2KUpdate& update);      // 0x119C
-void parseTrafficFER(const C2KUpdate& update);        // 0x119D
-void parseSystemParameters(const C2KUpdate& update);  // 0x134F
+Outcome parseEvdoStatus(const C2KUpdate& update);        // 0x1183
+Outcome parseEvdoActiveSet(const C2KUpdate& update);     // 0x12B6
+Outcome parseEvdoForwardRate(const C2KUpdate& update);   // 0x1192
+Outcome parseEvdoReverseRate(const C2KUpdate& update);   // 0x127E
+Outcome parseFingers(const C2KUpdate& update);           // 0x108A
+Outcome parseDeviceStatus(const C2KUpdate& update);      // 0x119C
+Outcome parseTrafficFER(const C2KUpdate& update);        // 0x119D
+Outcome parseSystemParameters(const C2KUpdate& update);  // 0x134F
 
 }  // namespace kelvasi

@@ -1,6 +1,36 @@
 #include "LogGenerator/C2K/C2KUpdate.h"
 
+#include "LogGenerator/C2K/C2KLookup.h"
+
 namespace kelvasi {
+
+void C2KUpdate::write(const Row& row, std::int64_t raw, const CellIdentity& cell) const {
+  forEachLeaf(row.key, lookup, [&](PlistDictionary& display, const std::string& key) {
+    display.setText(key, deferredText(row, raw), display.size());
+    gather({.row = &row, .raw = raw, .key = key, .cell = cell}, display);
+  });
+}
+
+void C2KUpdate::write(const Row& row, const PilotList& pilots) const {
+  forEachLeaf(row.key, lookup, [&](PlistDictionary& display, const std::string& key) {
+    display.set(key, pilots.list());
+    if (!readings) return;
+    const std::size_t before = readings->count();
+    for (Reading reading : pilots.readings()) {
+      reading.list = key;
+      gather(reading, display);
+    }
+    readings->takeChannel(before, readings->servingCells().certain(pilots.family()));
+  });
+}
+
+void C2KUpdate::gather(const Reading& reading, const PlistDictionary& display) const {
+  const ReadingSection* section = readings ? sections.find(&display) : nullptr;
+  if (!section) return;
+  Reading whole = reading;
+  whole.section = section;
+  readings->add(whole);
+}
 
 bool isLongEnough(const C2KUpdate& update, std::size_t minimumLength, const char* complaint) {
   if (update.record.size() >= minimumLength) return true;
@@ -9,12 +39,12 @@ bool isLongEnough(const C2KUpdate& update, std::size_t minimumLength, const char
 }
 
 void show(const C2KUpdate& update, RecordView record, std::span<const Field> layout,
-          std::span<const C2KRow> rows) {
-  for (const C2KRow& row : rows) update.set(row.name, row.text(valueOf(record, layout[row.field])));
+          std::span<const Row> rows, const CellIdentity& cell) {
+  for (const Row& row : rows) update.write(row, rawOf(record, layout, row), cell);
 }
 
-void showNotAvailable(const C2KUpdate& update, std::span<const C2KRow> rows) {
-  for (const C2KRow& row : rows) update.set(row.name, "N/A");
+void showAbsent(const C2KUpdate& update, std::span<const Row> rows) {
+  for (const Row& row : rows) update.write(row, noValue);
 }
 
 }  // namespace kelvasi

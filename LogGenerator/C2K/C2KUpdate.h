@@ -1,30 +1,39 @@
 // What a record parser is given: the record, the generator state, and where to write.
 #pragma once
 
-#include <cstddef>
 #include <cstdint>
 #include <span>
 #include <string_view>
 #include <utility>
 
-#include "LogGenerator/C2K/C2KLookup.h"
-#include "LogGenerator/C2K/FormattedText.h"
+#include "LogGenerator/C2K/C2KSections.h"
+#include "LogGenerator/C2K/PilotList.h"
+#include "LogGenerator/Readings.h"
 #include "LogGenerator/RecordLayout.h"
 #include "LogGenerator/RecordView.h"
+#include "LogGenerator/Row.h"
 #include "Platform/SystemLog.h"
 #include "Plist/PlistValue.h"
 
 namespace kelvasi {
 
+// The key of a row is its lookup name.
 struct C2KUpdate {
   RecordView record;
   PlistDictionary& state;
   const PlistDictionary& lookup;
   SystemLog& log;
+  const C2KSections& sections;
+  Readings* readings = nullptr;  // null: nobody listens
 
-  void set(std::string_view name, const PlistValue& value) const { setByLookup(name, value, lookup); }
-  void set(std::string_view name, const FormattedText& text) const {
-    set(name, PlistValue(std::string_view(text)));
+  // `row` lasts as long as the process.
+  void write(const Row& row, std::int64_t raw, const CellIdentity& cell = {}) const;
+  // A list in place of a row; each pilot is on the channel of the cell that serves, where it is among them.
+  void write(const Row& row, const PilotList& pilots) const;
+  // Without pilots the row shows what stands in place of a value.
+  void writeOrNone(const Row& row, const PilotList& pilots) const {
+    if (pilots.empty()) return write(row, noValue);
+    write(row, pilots);
   }
   // Into the extra information of the snapshot; nowhere before the display was built.
   void setExtraInfo(std::string_view key, PlistValue value) const {
@@ -32,6 +41,9 @@ struct C2KUpdate {
     if (extraInfo.dictionary()) extraInfo.dictionary()->set(key, std::move(value));
   }
   unsigned length() const { return static_cast<unsigned>(record.size()); }
+
+ private:
+  void gather(const Reading& reading, const PlistDictionary& display) const;
 };
 
 // Whether the record has at least this length; else the complaint is logged as an error, made with both
@@ -39,16 +51,9 @@ struct C2KUpdate {
 bool isLongEnough(const C2KUpdate& update, std::size_t minimumLength, const char* complaint)
     __attribute__((format(printf, 3, 0)));
 
-// How one record's field becomes the text of a lookup name.
-struct C2KRow {
-  std::string_view name;
-  std::size_t field = 0;  // its place in the layout
-  FormattedText (*text)(std::int64_t value);
-};
-
 void show(const C2KUpdate& update, RecordView record, std::span<const Field> layout,
-          std::span<const C2KRow> rows);
-// "N/A" in place of every row's value.
-void showNotAvailable(const C2KUpdate& update, std::span<const C2KRow> rows);
+          std::span<const Row> rows, const CellIdentity& cell = {});
+// What each row shows in place of a value that there is not.
+void showAbsent(const C2KUpdate& update, std::span<const Row> rows);
 
 }  // namespace kelvasi

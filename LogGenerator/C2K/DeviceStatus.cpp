@@ -12,46 +12,83 @@ namespace {
 
 using namespace deviceStatus;
 
-FormattedText receivePowerText(std::int64_t value) {
-  return FormattedText("%+.2f dBm", static_cast<double>(value) * 334 / 1000 - 63.248);
+double receivePower(std::int64_t raw) {
+  return static_cast<double>(raw) * 334 / 1000 - 63.248;
 }
-
-FormattedText transmitPowerText(std::int64_t value) {
-  return FormattedText("%+.2f dBm", static_cast<double>(value) / 10);
+double transmitPower(std::int64_t raw) {
+  return static_cast<double>(raw) / 10;
 }
+constexpr Scale receiveScale{.format = "%+.2f", .curve = receivePower};
+constexpr Scale transmitScale{.format = "%+.2f", .curve = transmitPower};
 
+constexpr std::array stateRows{
+    Row{.key = "k1xDeviceState",
+        .quantity = quantity::oneXState,
+        .field = indexIn(stateLayout, "state"),
+        .texts = deviceStates,
+        .otherwise = badValue},
+};
 constexpr std::array receiverRows{
-    C2KRow{"k1xRx0BandClass", indexIn(radioLayout, "Rx 0 band class"), bandClassText},
-    C2KRow{"k1xRx0ChanNum", indexIn(radioLayout, "Rx 0 channel"), decimalText},
-    C2KRow{"k1xRxAGC0", indexIn(radioLayout, "Rx 0 AGC"), receivePowerText},
+    Row{.key = "k1xRx0BandClass",
+        .quantity = quantity::bandClass,
+        .field = indexIn(radioLayout, "Rx 0 band class"),
+        .texts = bandClasses,
+        .otherwise = badValue},
+    Row{.key = "k1xRx0ChanNum",
+        .quantity = quantity::cdmaChannel,
+        .field = indexIn(radioLayout, "Rx 0 channel")},
+    Row{.key = "k1xRxAGC0",
+        .quantity = quantity::rxPower,
+        .field = indexIn(radioLayout, "Rx 0 AGC"),
+        .unit = " dBm",
+        .scale = receiveScale},
 };
 constexpr std::array trafficRows{
-    C2KRow{"k1xRx1BandClass", indexIn(radioLayout, "Rx 1 band class"), bandClassText},
-    C2KRow{"k1xRx1ChanNum", indexIn(radioLayout, "Rx 1 channel"), decimalText},
-    C2KRow{"k1xRxAGC1", indexIn(radioLayout, "Rx 1 AGC"), receivePowerText},
-    C2KRow{"k1xTxAGC", indexIn(radioLayout, "Tx AGC"), transmitPowerText},
+    Row{.key = "k1xRx1BandClass",
+        .quantity = quantity::bandClass,
+        .field = indexIn(radioLayout, "Rx 1 band class"),
+        .absent = notAvailableText,
+        .texts = bandClasses,
+        .otherwise = badValue},
+    Row{.key = "k1xRx1ChanNum",
+        .quantity = quantity::cdmaChannel,
+        .field = indexIn(radioLayout, "Rx 1 channel"),
+        .absent = notAvailableText},
+    Row{.key = "k1xRxAGC1",
+        .quantity = quantity::rxPower,
+        .field = indexIn(radioLayout, "Rx 1 AGC"),
+        .unit = " dBm",
+        .absent = notAvailableText,
+        .scale = receiveScale},
+    Row{.key = "k1xTxAGC",
+        .quantity = quantity::txPower,
+        .field = indexIn(radioLayout, "Tx AGC"),
+        .unit = " dBm",
+        .absent = notAvailableText,
+        .scale = transmitScale},
 };
+constexpr Row activeSetRow{.key = "k1xActiveSetInfo", .quantity = quantity::ecio};
 
-void showRadio(const C2KUpdate& update, RecordView radio, bool isTraffic) {
-  show(update, radio, radioLayout, receiverRows);
+void showRadio(const C2KUpdate& update, RecordView radio, bool isTraffic, const CellIdentity& serving) {
+  show(update, radio, radioLayout, receiverRows, serving);
   if (isTraffic) return show(update, radio, radioLayout, trafficRows);
-  showNotAvailable(update, trafficRows);
+  showAbsent(update, trafficRows);
 }
 
 // The error rate of a call that has ended is shown once more.
 void showOldErrorRate(const C2KUpdate& update) {
   const auto rate = trafficFER::rateOf(update.state);
   if (!rate) return;
-  update.set("k1xTrafficFER", FormattedText("%.02f%% (old)", trafficFER::percent(*rate)));
+  update.write(trafficFER::oldRateRow, rawOf(trafficFER::percent(*rate)));
   update.state.remove("TrafficFER");
 }
 
 }  // namespace
 
-void parseDeviceStatus(const C2KUpdate& update) {
+Outcome parseDeviceStatus(const C2KUpdate& update) {
   if (!isLongEnough(update, subPackets::minimumLength,
                     "Log code 0x119c is %u bytes long but must be at least %lu bytes."))
-    return;
+    return Outcome::tooShort;
   const auto state = subPackets::find(update.record, stateId, update.log);
   const auto radio = subPackets::find(update.record, radioId, update.log);
   const auto activeSet = subPackets::find(update.record, activeSetId, update.log);
@@ -59,13 +96,17 @@ void parseDeviceStatus(const C2KUpdate& update) {
   if (!state || !radio || !activeSet || !fingers) {
     update.log.print(LogPriority::warning, "Log code 0x119c: missing subpacket (ss=%d,rf=%d,ai=%d,fi=%d).",
                      state.has_value(), radio.has_value(), activeSet.has_value(), fingers.has_value());
-    return;
+    return Outcome::notUnderstood;
   }
-  const std::int64_t deviceState = valueOf(*state, fieldIn(stateLayout, "state"));
-  update.set("k1xDeviceState", deviceStateText(deviceState));
-  showRadio(update, *radio, deviceState == trafficState);
-  update.set("k1xActiveSetInfo", activeSet1x(*activeSet));
-  if (deviceState != trafficState) showOldErrorRate(update);
+  const bool isTraffic = valueOf(*state, fieldIn(stateLayout, "state")) == trafficState;
+  const std::int64_t channel = valueOf(*radio, fieldIn(radioLayout, "Rx 0 channel"));
+  const CellIdentity serving = referenceCell(*activeSet, channel);
+  if (update.readings && serving) update.readings->servingCells().say(logCode, {.cell = serving});
+  show(update, *state, stateLayout, stateRows);
+  showRadio(update, *radio, isTraffic, serving);
+  update.write(activeSetRow, activeSet1x(*activeSet, channel));
+  if (!isTraffic) showOldErrorRate(update);
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

@@ -6,24 +6,36 @@
 
 namespace kelvasi {
 
-void parseEvdoActiveSet(const C2KUpdate& update) {
+namespace {
+
+constexpr Row pilotRow{.key = "kActiveSetPilots",
+                       .quantity = quantity::ecio,
+                       .field = indexIn(evdoActiveSet::pilotLayout, "strength"),
+                       .unit = " dB",
+                       .absent = "(none)",
+                       .scale = strengthScale};
+
+}  // namespace
+
+Outcome parseEvdoActiveSet(const C2KUpdate& update) {
   using namespace evdoActiveSet;
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x12b6 is %u bytes long but must be at least %lu bytes."))
-    return;
+    return Outcome::tooShort;
   const auto count = static_cast<std::size_t>(valueOf(update.record, fieldIn(layout, "count")));
   if (update.record.size() < firstPilot + pilotSize * count) {
     update.log.print(LogPriority::error, "Log code 0x12b6 is %u bytes long, but has %d substructs.",
                      update.length(), static_cast<int>(count));
-    return;
+    return Outcome::tooShort;
   }
-  PilotList pilots;
+  PilotList pilots(RadioFamily::evdo);
   for (std::size_t place = 0; place < count; ++place) {
     const RecordView pilot = update.record.from(firstPilot + pilotSize * place);
-    pilots.add(place, valueOf(pilot, fieldIn(pilotLayout, "PN offset")),
-               strengthText(valueOf(pilot, fieldIn(pilotLayout, "strength"))));
+    pilots.add(place, valueOf(pilot, fieldIn(pilotLayout, "PN offset")), pilotRow,
+               rawOf(pilot, pilotLayout, pilotRow));
   }
-  update.set("kActiveSetPilots", pilots.listOrNone());
+  update.writeOrNone(pilotRow, pilots);
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

@@ -39,9 +39,15 @@ std::int64_t reverseSent(RecordView record) {
   return sent;
 }
 
-// One link's names: "FL" or "RL" in front of the state's keys.
+constexpr Scale rateScale{.format = "%.2f", .curve = fromRaw};
+constexpr Row forwardRow{
+    .key = "kFLDataRate", .quantity = quantity::dataRate, .unit = " kbps", .absent = "", .scale = rateScale};
+constexpr Row reverseRow{
+    .key = "kRLDataRate", .quantity = quantity::dataRate, .unit = " kbps", .absent = "", .scale = rateScale};
+
+// One link's row, and its names: "FL" or "RL" in front of the state's keys.
 struct Link {
-  const char* rateName;
+  const Row& row;
   std::string sequenceKey;
   std::string sentKey;
 };
@@ -54,12 +60,12 @@ void showRate(const C2KUpdate& update, const Link& link, std::uint32_t sequence,
         static_cast<std::int32_t>(sequence - static_cast<std::uint32_t>(*sequenceBefore.integer()));
     if (steps >= 1) {
       const auto bits = static_cast<double>(sent - *sentBefore.integer());
-      update.set(link.rateName, FormattedText("%.2f kbps", bits / (steps * 1024.0)));
+      update.write(link.row, rawOf(bits / (steps * 1024.0)));
     }
     update.setExtraInfo(link.sequenceKey + "2", sequenceBefore);
     update.setExtraInfo(link.sentKey + "2", sentBefore);
   } else {
-    update.set(link.rateName, "");
+    update.write(link.row, noValue);
   }
   update.state.set(link.sequenceKey, sequence);
   update.state.set(link.sentKey, sent);
@@ -69,24 +75,26 @@ void showRate(const C2KUpdate& update, const Link& link, std::uint32_t sequence,
 
 }  // namespace
 
-void parseEvdoForwardRate(const C2KUpdate& update) {
+Outcome parseEvdoForwardRate(const C2KUpdate& update) {
   using namespace evdoForwardRate;
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x1192 is %d bytes long but must be at least %ld bytes."))
-    return;
+    return Outcome::tooShort;
   const auto sequence =
       static_cast<std::uint32_t>(valueOf(update.record, fieldIn(layout, "sequence number")));
-  showRate(update, {"kFLDataRate", "FLDataSeqNum", "FLDataSent"}, sequence, forwardSent(update.record));
+  showRate(update, {forwardRow, "FLDataSeqNum", "FLDataSent"}, sequence, forwardSent(update.record));
+  return Outcome::shown;
 }
 
-void parseEvdoReverseRate(const C2KUpdate& update) {
+Outcome parseEvdoReverseRate(const C2KUpdate& update) {
   using namespace evdoReverseRate;
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x127e is %d bytes long but must be at least %ld bytes."))
-    return;
+    return Outcome::tooShort;
   const auto sequence =
       static_cast<std::uint32_t>(valueOf(update.record, fieldIn(layout, "sequence number")));
-  showRate(update, {"kRLDataRate", "RLDataSeqNum", "RLDataSent"}, sequence, reverseSent(update.record));
+  showRate(update, {reverseRow, "RLDataSeqNum", "RLDataSent"}, sequence, reverseSent(update.record));
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

@@ -10,51 +10,77 @@ namespace {
 
 using evdoStatus::layout;
 
-FormattedText powerText(std::int64_t value) {
-  return FormattedText("%+d dBm", static_cast<int>(value));
-}
-
-FormattedText pilotText(std::int64_t value) {
-  if (value == noPilot) return FormattedText("Invalid Value");
-  return FormattedText("%d × 64chips", static_cast<int>(value));
-}
-
-FormattedText addressText(std::int64_t value) {
-  return FormattedText("0x%06x", static_cast<unsigned>(value));
-}
-
 constexpr std::array radioRows{
-    C2KRow{"kChannel", indexIn(layout, "channel"), decimalText},
-    C2KRow{"k1xEVDODeviceState", indexIn(layout, "device state"), evdoDeviceStateText},
-    C2KRow{"kBandClass", indexIn(layout, "band class"), bandClassText},
-    C2KRow{"kRxAGC0", indexIn(layout, "Rx AGC 0"), powerText},
+    Row{.key = "kChannel", .quantity = quantity::cdmaChannel, .field = indexIn(layout, "channel")},
+    Row{.key = "k1xEVDODeviceState",
+        .quantity = quantity::evdoState,
+        .field = indexIn(layout, "device state"),
+        .texts = evdoDeviceStates,
+        .otherwise = reservedValue},
+    Row{.key = "kBandClass",
+        .quantity = quantity::bandClass,
+        .field = indexIn(layout, "band class"),
+        .texts = bandClasses,
+        .otherwise = badValue},
+    Row{.key = "kRxAGC0",
+        .quantity = quantity::rxPower,
+        .field = indexIn(layout, "Rx AGC 0"),
+        .unit = " dBm",
+        .scale = signedWhole},
 };
 constexpr std::array connectedRows{
-    C2KRow{"kRxAGC1", indexIn(layout, "Rx AGC 1"), powerText},
-    C2KRow{"kTxAGC", indexIn(layout, "Tx AGC"), powerText},
+    Row{.key = "kRxAGC1",
+        .quantity = quantity::rxPower,
+        .field = indexIn(layout, "Rx AGC 1"),
+        .unit = " dBm",
+        .absent = notAvailableText,
+        .scale = signedWhole},
+    Row{.key = "kTxAGC",
+        .quantity = quantity::txPower,
+        .field = indexIn(layout, "Tx AGC"),
+        .unit = " dBm",
+        .absent = notAvailableText,
+        .scale = signedWhole},
 };
 constexpr std::array sessionRows{
-    C2KRow{"kServingPNOffset", indexIn(layout, "serving PN offset"), pilotText},
-    C2KRow{"kSessionState", indexIn(layout, "session state"), evdoSessionStateText},
-    C2KRow{"kUATI24", indexIn(layout, "UATI24"), addressText},
-    C2KRow{"kColorCode", indexIn(layout, "color code"), decimalText},
+    Row{.key = "kServingPNOffset",
+        .quantity = quantity::pnOffset,
+        .field = indexIn(layout, "serving PN offset"),
+        .unit = " × 64chips",
+        .special = ValueText{noPilot, "Invalid Value"}},
+    Row{.key = "kSessionState",
+        .quantity = quantity::evdoSession,
+        .field = indexIn(layout, "session state"),
+        .texts = evdoSessionStates,
+        .otherwise = reservedValue},
+    Row{.key = "kUATI24", .quantity = quantity::uati24, .field = indexIn(layout, "UATI24"), .hexDigits = 6},
+    Row{.key = "kColorCode", .quantity = quantity::colorCode, .field = indexIn(layout, "color code")},
 };
+
+CellIdentity servingCell(RecordView record) {
+  const std::int64_t pilot = valueOf(record, fieldIn(layout, "serving PN offset"));
+  if (pilot == noPilot) return {};
+  return {RadioFamily::evdo, valueOf(record, fieldIn(layout, "channel")), pilot};
+}
 
 }  // namespace
 
-void parseEvdoStatus(const C2KUpdate& update) {
+Outcome parseEvdoStatus(const C2KUpdate& update) {
   if (update.record.size() != evdoStatus::length) {
     update.log.print(LogPriority::error, "Log code 0x1183 is %u bytes long but should be %lu bytes.",
                      update.length(), static_cast<unsigned long>(evdoStatus::length));
-    return;
+    return update.record.size() < evdoStatus::length ? Outcome::tooShort : Outcome::notUnderstood;
   }
-  show(update, update.record, layout, radioRows);
+  const CellIdentity serving = servingCell(update.record);
+  if (update.readings && serving) update.readings->servingCells().say(evdoStatus::logCode, {.cell = serving});
+  show(update, update.record, layout, radioRows, serving);
   if (valueOf(update.record, fieldIn(layout, "device state")) < evdoStatus::accessState) {
-    showNotAvailable(update, connectedRows);
+    showAbsent(update, connectedRows);
   } else {
-    show(update, update.record, layout, connectedRows);
+    show(update, update.record, layout, connectedRows, serving);
   }
-  show(update, update.record, layout, sessionRows);
+  show(update, update.record, layout, sessionRows, serving);
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

@@ -7,26 +7,38 @@
 
 namespace kelvasi {
 
-void parseFingers(const C2KUpdate& update) {
+namespace {
+
+constexpr Row fingerRow{.key = "kFingerC2I",
+                        .quantity = quantity::carrierToInterference,
+                        .field = indexIn(fingers::fingerLayout, "C/I"),
+                        .unit = " dB",
+                        .absent = "(none)",
+                        .scale = strengthScale};
+
+}  // namespace
+
+Outcome parseFingers(const C2KUpdate& update) {
   using namespace fingers;
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x108a is %u bytes long but must be at least %lu bytes."))
-    return;
+    return Outcome::tooShort;
   const auto count = static_cast<std::size_t>(valueOf(update.record, fieldIn(layout, "count")));
   if (update.record.size() != firstFinger + fingerSize * count) {
     update.log.print(LogPriority::error,
                      "Log code 0x108a has bad length of %u bytes, but has %d substructs (size=%lu).",
                      update.length(), static_cast<int>(count), static_cast<unsigned long>(minimumLength));
-    return;
+    return Outcome::notUnderstood;
   }
-  PilotList pilots;
+  PilotList pilots(RadioFamily::cdma);
   for (std::size_t place = 0; place < count; ++place) {
     const RecordView finger = update.record.from(firstFinger + fingerSize * place);
     const std::int64_t pilot = valueOf(finger, fieldIn(fingerLayout, "PN offset"));
     if (pilot == noPilot) continue;
-    pilots.add(place, pilot, strengthText(valueOf(finger, fieldIn(fingerLayout, "C/I"))));
+    pilots.add(place, pilot, fingerRow, rawOf(finger, fingerLayout, fingerRow));
   }
-  update.set("kFingerC2I", pilots.listOrNone());
+  update.writeOrNone(fingerRow, pilots);
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

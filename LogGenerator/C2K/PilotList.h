@@ -1,26 +1,38 @@
 // A list of pilots as the display shows it: sorted, keyed by the place in the record and the PN offset.
 #pragma once
 
-#include <cstddef>
 #include <cstdint>
-#include <string_view>
+#include <vector>
 
-#include "LogGenerator/C2K/FormattedText.h"
-#include "Plist/PlistValue.h"
+#include "LogGenerator/Reading.h"
+#include "LogGenerator/Row.h"
 
 namespace kelvasi {
 
 class PilotList {
  public:
-  void add(std::size_t place, std::int64_t pilot, std::string_view text) {
-    pilots_->set(FormattedText("%d;%d", static_cast<int>(place), static_cast<int>(pilot)), text);
-  }
-  // The list itself, even when it is empty.
-  PlistValue list() const { return pilots_; }
-  PlistValue listOrNone() const { return pilots_->size() > 1 ? list() : PlistValue("(none)"); }
+  explicit PilotList(RadioFamily family);
+
+  // `row` lasts as long as the process.
+  void add(std::size_t place, std::int64_t pilot, const Row& row, std::int64_t raw,
+           std::int64_t channel = CellIdentity::unknown);
+  bool empty() const { return pilots_.empty(); }
+  RadioFamily family() const { return family_; }
+
+  PlistValue list() const { return list_; }
+  // For the list in place of what stands there; their section and their list are the caller's to say.
+  std::vector<Reading> readings() const;
 
  private:
-  PlistValue::Dictionary pilots_ = PlistDictionary::make({{"_sorted", "_sorted"}});
+  struct Pilot {
+    const Row* row;
+    std::int64_t raw;
+    CellIdentity cell;
+  };
+
+  RadioFamily family_;
+  PlistValue::Dictionary list_;
+  std::vector<Pilot> pilots_;  // in the order of the list
 };
 
 }  // namespace kelvasi

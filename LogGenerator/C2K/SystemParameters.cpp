@@ -10,41 +10,55 @@ namespace {
 using namespace systemParameters;
 
 constexpr std::array roamingRows{
-    C2KRow{"k1xRoamingHome", indexIn(layout, "roaming indicator"), roamingIndicatorText},
+    Row{.key = "k1xRoamingHome",
+        .quantity = quantity::roaming,
+        .field = indexIn(layout, "roaming indicator"),
+        .texts = roamingIndicators,
+        .otherwise = otherIndicator},
 };
 constexpr std::array identityRows{
-    C2KRow{"kSystemId", indexIn(layout, "system identity"), decimalText},
-    C2KRow{"kNetworkId", indexIn(layout, "network identity"), decimalText},
+    Row{.key = "kSystemId", .quantity = quantity::sid, .field = indexIn(layout, "system identity")},
+    Row{.key = "kNetworkId", .quantity = quantity::nid, .field = indexIn(layout, "network identity")},
 };
-constexpr std::array cellRows{
-    C2KRow{"kPacketZoneId", indexIn(layout, "packet zone identity"), decimalText},
-    C2KRow{"kBaseId", indexIn(layout, "base identity"), decimalText},
-    C2KRow{"kProtocolRevision", indexIn(layout, "protocol revision"), decimalText},
-};
-
-void showIdentities(const C2KUpdate& update) {
-  const std::int64_t systemType = valueOf(update.record, fieldIn(layout, "system type"));
-  if (systemType == cdmaSystem) return show(update, update.record, layout, identityRows);
-  const FormattedText unknown("(unknown system type %d)", static_cast<int>(systemType));
-  for (const C2KRow& row : identityRows) update.set(row.name, unknown);
+// Of a system of another type, whose identities are not known.
+constexpr Row unknownSystem(std::string_view key, const Quantity& quantity) {
+  return {.key = key,
+          .quantity = quantity,
+          .field = indexIn(layout, "system type"),
+          .before = "(unknown system type ",
+          .unit = ")",
+          .hasNumber = false};
 }
+constexpr std::array unknownRows{unknownSystem("kSystemId", quantity::sid),
+                                 unknownSystem("kNetworkId", quantity::nid)};
+constexpr std::array cellRows{
+    Row{.key = "kPacketZoneId",
+        .quantity = quantity::packetZone,
+        .field = indexIn(layout, "packet zone identity")},
+    Row{.key = "kBaseId", .quantity = quantity::baseId, .field = indexIn(layout, "base identity")},
+    Row{.key = "kProtocolRevision",
+        .quantity = quantity::protocolRevision,
+        .field = indexIn(layout, "protocol revision")},
+};
 
 }  // namespace
 
-void parseSystemParameters(const C2KUpdate& update) {
+Outcome parseSystemParameters(const C2KUpdate& update) {
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x134f is %d bytes long but must be at least %lu bytes."))
-    return;
+    return Outcome::tooShort;
   const std::int64_t version = valueOf(update.record, fieldIn(layout, "version"));
   if (version < minimumVersion) {
     update.log.print(LogPriority::error,
                      "Log code 0x134f has version=%d; only version 2 or higher expected; dropping.",
                      static_cast<int>(version));
-    return;
+    return Outcome::notUnderstood;
   }
+  const bool isCdma = valueOf(update.record, fieldIn(layout, "system type")) == cdmaSystem;
   show(update, update.record, layout, roamingRows);
-  showIdentities(update);
+  show(update, update.record, layout, isCdma ? identityRows : unknownRows);
   show(update, update.record, layout, cellRows);
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

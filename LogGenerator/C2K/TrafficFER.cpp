@@ -12,21 +12,22 @@ std::optional<double> trafficFER::rateOf(const PlistDictionary& state) {
   return std::nullopt;
 }
 
-void parseTrafficFER(const C2KUpdate& update) {
+Outcome parseTrafficFER(const C2KUpdate& update) {
   using namespace trafficFER;
   if (!isLongEnough(update, subPackets::minimumLength,
                     "Log code 0x119d is %d bytes long but must be at least %ld bytes."))
-    return;
+    return Outcome::tooShort;
   const auto demodulation = subPackets::find(update.record, demodulationId, update.log);
   if (!demodulation) {
     update.log.print(LogPriority::warning, "Log code 0x119d: missing traffic demod subpacket.");
-    return;
+    return Outcome::notUnderstood;
   }
   float rate =
       valueOf(*demodulation, fieldIn(demodulationLayout, "frame error")) != 0 ? newFrameWeight : 0.0F;
   if (const auto before = rateOf(update.state)) rate += static_cast<float>(*before) * oldRateWeight;
   update.state.set("TrafficFER", static_cast<double>(rate));
-  update.set("k1xTrafficFER", FormattedText("%.02f%%", percent(rate)));
+  update.write(rateRow, rawOf(percent(rate)));
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

@@ -6,6 +6,7 @@
 
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
+#include "LogGenerator/Row.h"
 #include "Plist/PlistValue.h"
 
 namespace kelvasi::trafficFER {
@@ -17,6 +18,18 @@ inline constexpr std::array demodulationLayout{Field{.name = "frame error", .byt
 
 inline constexpr float newFrameWeight = 0.015625F;  // 1/64
 inline constexpr float oldRateWeight = 0.984375F;
+
+// In percent.
+inline constexpr Row rateRow{.key = "k1xTrafficFER",
+                             .quantity = quantity::fer,
+                             .unit = "%",
+                             .scale = Scale{.format = "%.02f", .curve = fromRaw}};
+// Of a call that has ended: no measurement any more.
+inline constexpr Row oldRateRow{.key = "k1xTrafficFER",
+                                .quantity = quantity::fer,
+                                .unit = "% (old)",
+                                .scale = Scale{.format = "%.02f", .curve = fromRaw},
+                                .hasNumber = false};
 
 // The smoothed rate that the state keeps, 1 when every frame is in error; nothing before the first frame of
 // a call. Shown in percent.

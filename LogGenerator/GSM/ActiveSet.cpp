@@ -9,15 +9,27 @@ namespace {
 using namespace cellSets;
 
 constexpr std::array rows{
-    Row{.key = "Scrambling Code", .field = indexIn(identityLayout, "scrambling code")},
+    Row{.key = "Scrambling Code",
+        .quantity = quantity::scramblingCode,
+        .field = indexIn(identityLayout, "scrambling code")},
 };
+// Both are calculated.
+constexpr Row powerRow{.key = "RSCP", .quantity = quantity::rscp, .unit = " dB"};
+constexpr Row energyRow{.key = "Energy Per Chip", .quantity = quantity::ecno, .unit = " dB"};
+
+constexpr CellFields memberCell{.family = RadioFamily::umts,
+                                .code = fieldIn(identityLayout, "scrambling code"),
+                                .takesServingChannel = true};
+
 constexpr ListSection section{.name = "Active Set",
                               .trace = "ActiveSet",
                               .logCodes = logCodes,
                               .logCode = cellSets::logCode,
                               .minimumLength = minimumLength,
                               .list = identities,
-                              .rows = rows};
+                              .rows = rows,
+                              .role = CellRole::active,
+                              .cell = memberCell};
 
 // dBm, from steps of a tenth of a dB.
 std::int64_t receivedPower(RecordView record) {
@@ -41,8 +53,8 @@ void ActiveSet::addEntry(RecordView record, std::size_t place) {
   const int ecno = lookUpECNO(energyOf(entryOf(record, energies, place)));
   RowWriter row = addRows();
   show(identity, identityLayout, rows, row);
-  row.number("RSCP", receivedPower(record) + ecno, " dB");
-  row.number("Energy Per Chip", ecno, " dB");
+  row.write(powerRow, receivedPower(record) + ecno);
+  row.write(energyRow, ecno);
 }
 
 }  // namespace kelvasi

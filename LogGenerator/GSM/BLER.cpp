@@ -13,13 +13,15 @@ constexpr StateSection section{.name = "BLER", .trace = "BLER", .logCodes = logC
 
 BLER::BLER(const Platform& platform) : StateDecoder(platform, section) {}
 
-void BLER::decodeOther(RecordView record, LogCode logCode) {
+Outcome BLER::decodeOther(RecordView record, LogCode logCode) {
   using namespace transportChannelCrc;
-  if (logCode != transportChannelCrc::logCode) return logUnknownMessage(logCode);
-  if (record.size() < minimumLength || !sectionRows()) return;
-  RowWriter writer(*sectionRows());
+  if (logCode != transportChannelCrc::logCode) return StateDecoder::decodeOther(record, logCode);
+  if (record.size() < minimumLength) return Outcome::tooShort;
+  if (!sectionRows()) return Outcome::sectionMissing;
+  RowWriter writer(*sectionRows(), place());
   show(record, layout, rows, writer);
-  channels_.show(record, channels, channelRows, "Transport Channels", *sectionRows());
+  channels_.show(record, channels, channelRows, "Transport Channels", *sectionRows(), place());
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

@@ -11,7 +11,7 @@ class BLER : public StateDecoder {
   explicit BLER(const Platform& platform);
 
  protected:
-  void decodeOther(RecordView record, LogCode logCode) override;
+  Outcome decodeOther(RecordView record, LogCode logCode) override;
 
  private:
   ListRow channels_;

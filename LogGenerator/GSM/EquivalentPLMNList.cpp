@@ -7,6 +7,14 @@ namespace kelvasi {
 namespace {
 
 constexpr std::array logCodes{equivalentPlmn::logCode};
+// Each begins with its first digit's field.
+constexpr Row countryRow{.key = "Mobile Country Code",
+                         .quantity = quantity::mcc,
+                         .field = indexIn(equivalentPlmn::entryLayout, "MCC hundreds")};
+constexpr Row networkRow{.key = "Mobile Network Code",
+                         .quantity = quantity::mnc,
+                         .field = indexIn(equivalentPlmn::entryLayout, "MNC hundreds")};
+
 constexpr ListSection section{.name = "Equivalent PLMN List",
                               .trace = "Equivalent PLMN List",
                               .logCodes = logCodes,
@@ -26,8 +34,8 @@ EquivalentPLMNList::EquivalentPLMNList(const Platform& platform) : ListDecoder(p
 void EquivalentPLMNList::addEntry(RecordView record, std::size_t place) {
   const RecordView plmn = entry(record, place);
   RowWriter row = addRows();
-  row.number("Mobile Country Code", decimal(plmn, indexIn(equivalentPlmn::entryLayout, "MCC hundreds")));
-  row.number("Mobile Network Code", decimal(plmn, indexIn(equivalentPlmn::entryLayout, "MNC hundreds")));
+  row.write(countryRow, decimal(plmn, countryRow.field));
+  row.write(networkRow, decimal(plmn, networkRow.field));
 }
 
 }  // namespace kelvasi

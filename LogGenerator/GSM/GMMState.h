@@ -56,9 +56,18 @@ inline constexpr std::array updateStatuses{
 
 // The rows carry the names of their circuit-switched counterparts.
 inline constexpr std::array rows{
-    Row{.key = "MM State", .field = indexIn(layout, "state"), .texts = states},
-    Row{.key = "MM Sub State", .field = indexIn(layout, "sub-state"), .texts = subStates},
-    Row{.key = "Attach Reject Cause", .field = indexIn(layout, "update status"), .texts = updateStatuses},
+    Row{.key = "MM State",
+        .quantity = quantity::gmmState,
+        .field = indexIn(layout, "state"),
+        .texts = states},
+    Row{.key = "MM Sub State",
+        .quantity = quantity::gmmSubState,
+        .field = indexIn(layout, "sub-state"),
+        .texts = subStates},
+    Row{.key = "Attach Reject Cause",
+        .quantity = quantity::gmmUpdateStatus,
+        .field = indexIn(layout, "update status"),
+        .texts = updateStatuses},
 };
 
 }  // namespace kelvasi::gmmState

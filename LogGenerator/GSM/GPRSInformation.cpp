@@ -18,6 +18,7 @@ constexpr std::array logCodes{packetAccess::logCode,   registeredPlmn::logCode, 
 constexpr std::array operatingModes{"Class 1"sv, "Class 2"sv, "Class 3"sv};
 constexpr std::array plmnRows{
     Row{.key = "Network Operating Mode",
+        .quantity = quantity::operatingMode,
         .field = indexIn(registeredPlmn::layout, "network operating mode"),
         .texts = operatingModes},
 };
@@ -27,19 +28,24 @@ constexpr std::array waits{"500 ms"sv, "1000 ms"sv, "1500 ms"sv, "0 ms"sv,
 constexpr std::array burstTypes{"8-bit format"sv, "11-bit format"sv};
 constexpr std::array optionRows{
     Row{.key = "T3192",
+        .quantity = quantity::cellOption,
         .field = indexIn(gprsCellOptions::layout, "T3192"),
         .texts = waits,
         .otherwise = "?? ms"},
     Row{.key = "Access Burst Type",
+        .quantity = quantity::cellOption,
         .field = indexIn(gprsCellOptions::layout, "access burst type"),
         .texts = burstTypes,
         .isFlag = true},
-    Row{.key = "DRX Timer Max", .field = indexIn(gprsCellOptions::layout, "DRX timer maximum")},
+    Row{.key = "DRX Timer Max",
+        .quantity = quantity::drxTimer,
+        .field = indexIn(gprsCellOptions::layout, "DRX timer maximum")},
 };
 
 constexpr std::array hysteresisTexts{"Not Applied"sv, "Applied"sv};
 constexpr std::array measurementRows{
     Row{.key = "Cell Reselect Hysteresis",
+        .quantity = quantity::cellOption,
         .field = indexIn(gsmMeasurements::layout, "reselect hysteresis"),
         .texts = hysteresisTexts,
         .isFlag = true},

@@ -21,6 +21,7 @@ inline constexpr std::array layout{Field{.name = "position", .byte = 14}};
 inline constexpr std::array positions{"Located on BCCH"sv, "Located on Extended BCCH"sv};
 inline constexpr std::array rows{
     Row{.key = "SI13 Position",
+        .quantity = quantity::cellOption,
         .field = indexIn(layout, "position"),
         .special = notAvailable,
         .texts = positions},
@@ -56,14 +57,17 @@ inline constexpr std::array thresholds{
 // For the packet flow context, other than in its neighbours, 255 stands for "Available".
 inline constexpr std::array rows{
     Row{.key = "Network Control Order",
+        .quantity = quantity::cellOption,
         .field = indexIn(layout, "network control order"),
         .special = notAvailable,
         .texts = controlOrders},
     Row{.key = "PFC Supported",
+        .quantity = quantity::cellOption,
         .field = indexIn(layout, "PFC support"),
         .special = ValueText{255, "Available"},
         .texts = pfcSupports},
     Row{.key = "Priority Access Threshold",
+        .quantity = quantity::cellOption,
         .field = indexIn(layout, "priority access threshold"),
         .special = notAvailable,
         .texts = thresholds},
@@ -78,7 +82,7 @@ inline constexpr LogCode logCode = 0x51FB;
 inline constexpr std::array layout{Field{.name = "PBCCH present", .byte = 13}};
 
 inline constexpr std::array rows{
-    Row{.key = "PBCCH Present", .field = indexIn(layout, "PBCCH present")},
+    Row{.key = "PBCCH Present", .quantity = quantity::cellOption, .field = indexIn(layout, "PBCCH present")},
 };
 inline constexpr RecordRows record{logCode, 34, layout, rows};
 
@@ -98,14 +102,19 @@ static_assert(inWireOrder(layout));
 
 inline constexpr std::array supports{"Not Supported"sv, "Supported"sv};
 inline constexpr std::array rows{
-    Row{.key = "Ext Measurement Order", .field = indexIn(layout, "extended measurement order")},
-    Row{.key = "Packet PSI Status", .field = indexIn(layout, "packet PSI status")},
+    Row{.key = "Ext Measurement Order",
+        .quantity = quantity::cellOption,
+        .field = indexIn(layout, "extended measurement order")},
+    Row{.key = "Packet PSI Status",
+        .quantity = quantity::cellOption,
+        .field = indexIn(layout, "packet PSI status")},
     Row{.key = "Packet SI Status",
+        .quantity = quantity::cellOption,
         .field = indexIn(layout, "packet SI status"),
         .texts = supports,
         .isFlag = true},
-    Row{.key = "Count LR", .field = indexIn(layout, "count LR")},
-    Row{.key = "Count HR", .field = indexIn(layout, "count HR")},
+    Row{.key = "Count LR", .quantity = quantity::count, .field = indexIn(layout, "count LR")},
+    Row{.key = "Count HR", .quantity = quantity::count, .field = indexIn(layout, "count HR")},
 };
 inline constexpr RecordRows record{logCode, 35, layout, rows};
 

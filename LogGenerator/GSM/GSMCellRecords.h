@@ -18,11 +18,16 @@ inline constexpr std::array layout{
 static_assert(inWireOrder(layout));
 
 inline constexpr std::array rows{
-    Row{.key = "Cell ID", .field = indexIn(layout, "cell identity")},
-    Row{.key = "ARFCN", .field = indexIn(layout, "ARFCN")},
-    Row{.key = "BSIC", .field = indexIn(layout, "BSIC")},
+    Row{.key = "Cell ID", .quantity = quantity::cellId, .field = indexIn(layout, "cell identity")},
+    Row{.key = "ARFCN", .quantity = quantity::arfcn, .field = indexIn(layout, "ARFCN")},
+    Row{.key = "BSIC", .quantity = quantity::bsic, .field = indexIn(layout, "BSIC")},
 };
-inline constexpr RecordRows record{logCode, 26, layout, rows};
+inline constexpr CellFields cell{.family = RadioFamily::gsm,
+                                 .channel = fieldIn(layout, "ARFCN"),
+                                 .code = fieldIn(layout, "BSIC"),
+                                 .cellId = fieldIn(layout, "cell identity"),
+                                 .isServing = true};
+inline constexpr RecordRows record{logCode, 26, layout, rows, cell};
 
 }  // namespace gsmCellIdentity
 
@@ -33,7 +38,10 @@ inline constexpr std::array layout{Field{.name = "dedicated ARFCN", .byte = 13, 
 
 // The row shows the low byte alone.
 inline constexpr std::array rows{
-    Row{.key = "MA Dedicated ARFCN", .field = indexIn(layout, "dedicated ARFCN"), .lowBits = 8},
+    Row{.key = "MA Dedicated ARFCN",
+        .quantity = quantity::arfcn,
+        .field = indexIn(layout, "dedicated ARFCN"),
+        .lowBits = 8},
 };
 inline constexpr RecordRows record{logCode, 17, layout, rows};
 

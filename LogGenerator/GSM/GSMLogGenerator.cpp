@@ -3,6 +3,7 @@
 #include <string>
 
 #include "LogGenerator/Exceptions.h"
+#include "LogGenerator/SortPrefix.h"
 #include "Platform/PlistSerialiser.h"
 
 namespace kelvasi {
@@ -32,12 +33,27 @@ std::unique_ptr<LogGenerator> GSMLogGenerator::generator(const Platform& platfor
 }
 
 void GSMLogGenerator::updateState(PlistDictionary& state, std::span<const std::uint8_t> data) {
+  if (readings()) readings()->begin(arrival(), 0);
   const auto message = platform().plists.parse(data);
   if (!message) throw AssertionFailure(source, "Could not deserialize the object");
   const PlistValue display = processObject(*message);
   state.set("DisplayState", *message);
   state.set("Display", display);
   state.set("ExtraInfo", PlistDictionary::make());
+  count(0, Outcome::shown, data);
+  if (readings()) gather(display);
+}
+
+// The whole display is another one; a section is what stands at its top.
+void GSMLogGenerator::gather(const PlistValue& display) const {
+  readings()->addRemovalOfEverything();
+  const PlistDictionary* entries = display.dictionary();
+  if (!entries || entries->empty()) return readings()->addValue(readings()->keep({}), {}, {}, display, true);
+  for (const auto& [key, value] : *entries) {
+    ReadingSection section{.name = std::string(withoutSortPrefix(key))};
+    appendPathStep(section.path, key);
+    readings()->addValue(readings()->keep(std::move(section)), {}, key, value, true);
+  }
 }
 
 PlistValue GSMLogGenerator::generateLogUsingState(PlistDictionary& state) {

@@ -4,7 +4,7 @@
 
 #include <array>
 
-#include "LogGenerator/EntryList.h"
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/LogCode.h"
 
 namespace kelvasi::gsmMeasurements {
@@ -30,5 +30,11 @@ static_assert(inWireOrder(neighbourLayout));
 
 inline constexpr EntryList neighbours{
     .count = fieldIn(layout, "neighbours"), .start = 29, .stride = 14, .layout = neighbourLayout};
+
+// The record says nothing of the serving cell but what it is not.
+inline constexpr CellFields servingCell{.family = RadioFamily::gsm,
+                                        .isServing = true,
+                                        .others = neighbours,
+                                        .otherChannel = fieldIn(neighbourLayout, "ARFCN")};
 
 }  // namespace kelvasi::gsmMeasurements

@@ -48,10 +48,14 @@ inline constexpr std::array states{
 };
 inline constexpr std::array modes{"Voice"sv, "Data"sv};
 inline constexpr std::array rows{
-    Row{.key = "RR State", .field = indexIn(layout, "state"), .texts = states},
-    Row{.key = "RR Sub State", .field = indexIn(layout, "sub-state")},
-    Row{.key = "RR Status", .field = indexIn(layout, "status")},
-    Row{.key = "RR Mode", .field = indexIn(layout, "mode"), .texts = modes, .isFlag = true},
+    Row{.key = "RR State", .quantity = quantity::rrState, .field = indexIn(layout, "state"), .texts = states},
+    Row{.key = "RR Sub State", .quantity = quantity::rrSubState, .field = indexIn(layout, "sub-state")},
+    Row{.key = "RR Status", .quantity = quantity::rrStatus, .field = indexIn(layout, "status")},
+    Row{.key = "RR Mode",
+        .quantity = quantity::rrMode,
+        .field = indexIn(layout, "mode"),
+        .texts = modes,
+        .isFlag = true},
 };
 inline constexpr RecordRows record{logCode, 17, layout, rows};
 
@@ -66,7 +70,11 @@ inline constexpr std::array layout{Field{.name = "DTX in use", .byte = 19}};
 
 inline constexpr std::array states{"OFF"sv, "ON"sv};
 inline constexpr std::array rows{
-    Row{.key = "DTX Used", .field = indexIn(layout, "DTX in use"), .texts = states, .isFlag = true},
+    Row{.key = "DTX Used",
+        .quantity = quantity::dtx,
+        .field = indexIn(layout, "DTX in use"),
+        .texts = states,
+        .isFlag = true},
 };
 inline constexpr RecordRows record{logCode, 20, layout, rows};
 

@@ -13,33 +13,46 @@ constexpr std::array logCodes{gsmCellIdentity::logCode, gsmMeasurements::logCode
 
 // C1 and C2 (3GPP TS 45.008, 6.4) are the low halves of their words.
 constexpr std::array measurementRows{
-    Row{.key = "RSSI", .field = indexIn(gsmMeasurements::layout, "receive level"), .unit = " dBm"},
+    Row{.key = "RSSI",
+        .quantity = quantity::rxlev,
+        .field = indexIn(gsmMeasurements::layout, "receive level"),
+        .unit = " dBm"},
     Row{.key = "C1 Value",
+        .quantity = quantity::c1,
         .field = indexIn(gsmMeasurements::layout, "C1 or full receive quality"),
-        .lowBits = 16},
+        .lowBits = 16,
+        .isSignedNumber = true},
     Row{.key = "C2 Value",
+        .quantity = quantity::c2,
         .field = indexIn(gsmMeasurements::layout, "C2 or sub receive quality"),
-        .lowBits = 16},
+        .lowBits = 16,
+        .isSignedNumber = true},
 };
 constexpr std::array records{
     gsmCellIdentity::record,
     RecordRows{gsmMeasurements::logCode, gsmMeasurements::minimumLength, gsmMeasurements::layout,
-               measurementRows},
+               measurementRows, gsmMeasurements::servingCell},
     dedicatedChannel::record,
 };
 
 constexpr std::array cellRows{
-    CellRow{"Cell ID", kTelvonCellMonitorCellId, "GSMServingCell: Failed to retrieve Cell ID\n"},
-    CellRow{"ARFCN", kTelvonCellMonitorARFCN, "GSMServingCell: Failed to retrieve ARFCN\n"},
+    CellRow{{.key = "Cell ID", .quantity = quantity::cellId},
+            kTelvonCellMonitorCellId,
+            "GSMServingCell: Failed to retrieve Cell ID\n"},
+    CellRow{{.key = "ARFCN", .quantity = quantity::arfcn},
+            kTelvonCellMonitorARFCN,
+            "GSMServingCell: Failed to retrieve ARFCN\n"},
 };
 constexpr std::array technologies{kTelvonCellMonitorRadioAccessTechnologyGSM};
-constexpr CellTable servingCell{technologies, kTelvonCellMonitorCellTypeServing, cellRows};
+constexpr CellTable servingCell{
+    technologies, kTelvonCellMonitorCellTypeServing, cellRows, {RadioFamily::gsm, kTelvonCellMonitorARFCN}};
 
 constexpr StateSection section{.name = "GSM Serving Cell",
                                .trace = "GSMServingCell",
                                .logCodes = logCodes,
                                .records = records,
-                               .cells = &servingCell};
+                               .cells = &servingCell,
+                               .role = CellRole::serving};
 
 }  // namespace
 

@@ -10,10 +10,10 @@ using namespace neighbourSets;
 
 constexpr std::array logCodes{neighbourSets::logCode};
 constexpr std::array rows{
-    Row{.key = "ARFCN", .field = indexIn(gsmLayout, "ARFCN")},
-    Row{.key = "BSIC", .field = indexIn(gsmLayout, "BSIC")},
-    Row{.key = "RSSI", .field = indexIn(gsmLayout, "RSSI"), .unit = " dBm"},
-    Row{.key = "Ranking Value", .field = indexIn(gsmLayout, "ranking value")},
+    Row{.key = "ARFCN", .quantity = quantity::arfcn, .field = indexIn(gsmLayout, "ARFCN")},
+    Row{.key = "BSIC", .quantity = quantity::bsic, .field = indexIn(gsmLayout, "BSIC")},
+    Row{.key = "RSSI", .quantity = quantity::rssi, .field = indexIn(gsmLayout, "RSSI"), .unit = " dBm"},
+    Row{.key = "Ranking Value", .quantity = quantity::ranking, .field = indexIn(gsmLayout, "ranking value")},
 };
 constexpr ListSection section{.name = "GSM Set",
                               .trace = "GSMSet",
@@ -21,7 +21,9 @@ constexpr ListSection section{.name = "GSM Set",
                               .logCode = neighbourSets::logCode,
                               .minimumLength = minimumLength,
                               .list = gsmCells,
-                              .rows = rows};
+                              .rows = rows,
+                              .role = CellRole::neighbour,
+                              .cell = gsmCell};
 
 }  // namespace
 

@@ -44,15 +44,25 @@ inline constexpr EntryList secondary{.count = fieldIn(layout, "secondary process
 
 inline constexpr std::array carriers{"Single Carrier"sv, "MIMO"sv, "Dual Carrier"sv, "Reserved"sv};
 inline constexpr std::array rows{
-    Row{.key = "Version", .field = indexIn(layout, "version")},
-    Row{.key = "Sub Frames", .field = indexIn(layout, "sub-frames")},
-    Row{.key = "Carrier Info", .field = indexIn(layout, "carriers"), .texts = carriers},
+    Row{.key = "Version", .quantity = quantity::version, .field = indexIn(layout, "version")},
+    Row{.key = "Sub Frames", .quantity = quantity::subFrames, .field = indexIn(layout, "sub-frames")},
+    Row{.key = "Carrier Info",
+        .quantity = quantity::carriers,
+        .field = indexIn(layout, "carriers"),
+        .texts = carriers},
 };
 inline constexpr std::array processRows{
-    Row{.key = "Process ID", .field = indexIn(processLayout, "process")},
-    Row{.key = "No Rx Bits", .field = indexIn(processLayout, "bits received"), .isUnsigned = true},
-    Row{.key = "New Tx", .field = indexIn(processLayout, "new transmissions")},
-    Row{.key = "Block Errors", .field = indexIn(processLayout, "block errors")},
+    Row{.key = "Process ID", .quantity = quantity::processId, .field = indexIn(processLayout, "process")},
+    Row{.key = "No Rx Bits",
+        .quantity = quantity::receivedBits,
+        .field = indexIn(processLayout, "bits received"),
+        .isUnsigned = true},
+    Row{.key = "New Tx",
+        .quantity = quantity::newTransmissions,
+        .field = indexIn(processLayout, "new transmissions")},
+    Row{.key = "Block Errors",
+        .quantity = quantity::blockErrors,
+        .field = indexIn(processLayout, "block errors")},
 };
 
 }  // namespace kelvasi::harqStatistics

@@ -14,17 +14,20 @@ constexpr StateSection section{.name = "HSDPA Info", .trace = "HSDPA Info", .log
 HSDPAInformation::HSDPAInformation(const Platform& platform) : StateDecoder(platform, section) {}
 
 // Another code goes without a line in the system log, and a count of 0 leaves the list of before.
-void HSDPAInformation::decodeOther(RecordView record, LogCode logCode) {
+Outcome HSDPAInformation::decodeOther(RecordView record, LogCode logCode) {
   using namespace harqStatistics;
-  if (logCode != harqStatistics::logCode || record.size() < minimumLength || !sectionRows()) return;
-  RowWriter writer(*sectionRows());
+  if (logCode != harqStatistics::logCode) return Outcome::notAskedFor;
+  if (record.size() < minimumLength) return Outcome::tooShort;
+  if (!sectionRows()) return Outcome::sectionMissing;
+  RowWriter writer(*sectionRows(), place());
   show(record, layout, rows, writer);
   if (countOf(record, primary) != 0) {
-    primary_.show(record, primary, processRows, "Primary HARQ Process", *sectionRows());
+    primary_.show(record, primary, processRows, "Primary HARQ Process", *sectionRows(), place());
   }
   if (countOf(record, secondary) != 0) {
-    secondary_.show(record, secondary, processRows, "Secondary HARQ Process", *sectionRows());
+    secondary_.show(record, secondary, processRows, "Secondary HARQ Process", *sectionRows(), place());
   }
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

@@ -11,7 +11,7 @@ class HSDPAInformation : public StateDecoder {
   explicit HSDPAInformation(const Platform& platform);
 
  protected:
-  void decodeOther(RecordView record, LogCode logCode) override;
+  Outcome decodeOther(RecordView record, LogCode logCode) override;
 
  private:
   ListRow primary_;

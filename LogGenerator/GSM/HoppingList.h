@@ -24,7 +24,12 @@ inline constexpr EntryList frequencies{
     .count = fieldIn(layout, "ARFCNs"), .start = 15, .stride = 2, .layout = frequencyLayout};
 
 inline constexpr std::array rows{
-    Row{.key = "HSN", .field = indexIn(layout, "hopping sequence number")},
+    Row{.key = "HSN",
+        .quantity = quantity::hoppingSequence,
+        .field = indexIn(layout, "hopping sequence number")},
 };
+
+inline constexpr Row frequencyRow{
+    .key = "ARFCNs", .quantity = quantity::arfcn, .field = indexIn(frequencyLayout, "ARFCN")};
 
 }  // namespace kelvasi::hoppingList

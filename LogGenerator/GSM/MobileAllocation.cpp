@@ -16,18 +16,15 @@ constexpr StateSection section{
 
 MobileAllocation::MobileAllocation(const Platform& platform) : StateDecoder(platform, section) {}
 
-void MobileAllocation::decodeOther(RecordView record, LogCode logCode) {
+Outcome MobileAllocation::decodeOther(RecordView record, LogCode logCode) {
   using namespace hoppingList;
-  if (logCode != hoppingList::logCode) return logUnknownMessage(logCode);
-  if (record.size() < minimumLength || !sectionRows()) return;
-  RowWriter writer(*sectionRows());
+  if (logCode != hoppingList::logCode) return StateDecoder::decodeOther(record, logCode);
+  if (record.size() < minimumLength) return Outcome::tooShort;
+  if (!sectionRows()) return Outcome::sectionMissing;
+  RowWriter writer(*sectionRows(), place());
   show(record, layout, rows, writer);
-  frequencies_.removeAll();
-  for (std::size_t place = 0; place < countOf(record, frequencies); ++place) {
-    const RecordView frequency = entryOf(record, frequencies, place);
-    frequencies_.append(std::to_string(valueOf(frequency, fieldIn(frequencyLayout, "ARFCN"))));
-  }
-  shown_.show(frequencies_, "ARFCNs", *sectionRows());
+  frequencies_.show(record, frequencies, frequencyRow, *sectionRows(), place());
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

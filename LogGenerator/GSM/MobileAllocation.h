@@ -11,11 +11,10 @@ class MobileAllocation : public StateDecoder {
   explicit MobileAllocation(const Platform& platform);
 
  protected:
-  void decodeOther(RecordView record, LogCode logCode) override;
+  Outcome decodeOther(RecordView record, LogCode logCode) override;
 
  private:
-  PlistArray frequencies_;
-  ListRow shown_;
+  ListRow frequencies_;
 };
 
 }  // namespace kelvasi

@@ -15,23 +15,31 @@ using gsmMeasurements::neighbourLayout;
 constexpr std::array logCodes{gsmMeasurements::logCode, bsicList::logCode, cellInfoLogCode};
 
 constexpr std::array rows{
-    Row{.key = "ARFCN", .field = indexIn(neighbourLayout, "ARFCN")},
-    Row{.key = "RSSI", .field = indexIn(neighbourLayout, "RSSI")},
-    Row{.key = "C1 Value", .field = indexIn(neighbourLayout, "C1")},
+    Row{.key = "ARFCN", .quantity = quantity::arfcn, .field = indexIn(neighbourLayout, "ARFCN")},
+    Row{.key = "RSSI", .quantity = quantity::rxlev, .field = indexIn(neighbourLayout, "RSSI")},
+    Row{.key = "C1 Value", .quantity = quantity::c1, .field = indexIn(neighbourLayout, "C1")},
 };
 
 // The cell list's RSSI is shown doubled; the measured one above as it is, and without a unit.
 constexpr std::array cellRows{
-    CellRow{"ARFCN", kTelvonCellMonitorARFCN, "NeighboringCells: Failed to retrieve ARFCN\n"},
-    CellRow{.key = "RSSI",
-            .cellKey = kTelvonCellMonitorRSSI,
-            .failure = "NeighboringCells: Failed to retrieve RSSI\n",
-            .unit = " dBm",
-            .isMeasurement = true,
-            .factor = 2},
+    CellRow{{.key = "ARFCN", .quantity = quantity::arfcn},
+            kTelvonCellMonitorARFCN,
+            "NeighboringCells: Failed to retrieve ARFCN\n"},
+    CellRow{{.key = "RSSI",
+             .quantity = quantity::rssi,
+             .unit = " dBm",
+             .special = emptyIfNotMeasured,
+             .factor = 2},
+            kTelvonCellMonitorRSSI,
+            "NeighboringCells: Failed to retrieve RSSI\n"},
 };
 constexpr std::array technologies{kTelvonCellMonitorRadioAccessTechnologyGSM};
-constexpr CellTable neighbours{technologies, kTelvonCellMonitorCellTypeNeighbor, cellRows};
+constexpr CellTable neighbours{
+    technologies, kTelvonCellMonitorCellTypeNeighbor, cellRows, {RadioFamily::gsm, kTelvonCellMonitorARFCN}};
+
+// From the record of the codes.
+constexpr Row codeRow{
+    .key = "BSIC", .quantity = quantity::bsic, .field = indexIn(bsicList::cellLayout, "BSIC")};
 
 constexpr ListSection section{.name = "Neighboring Cells",
                               .trace = "NeighboringCells",
@@ -40,7 +48,9 @@ constexpr ListSection section{.name = "Neighboring Cells",
                               .minimumLength = gsmMeasurements::minimumLength,
                               .list = gsmMeasurements::neighbours,
                               .rows = rows,
-                              .cells = &neighbours};
+                              .cells = &neighbours,
+                              .role = CellRole::neighbour,
+                              .cell = {.family = RadioFamily::gsm}};
 
 }  // namespace
 
@@ -50,21 +60,31 @@ void NeighboringCells::addEntry(RecordView record, std::size_t place) {
   const RecordView neighbour = entry(record, place);
   RowWriter row = addRows();
   show(neighbour, neighbourLayout, rows, row);
-  const std::int64_t arfcn = valueOf(neighbour, fieldIn(neighbourLayout, "ARFCN"));
-  const auto coded = std::find_if(arfcnToBsic_.rbegin(), arfcnToBsic_.rend(),
-                                  [&](const CodedCell& cell) { return cell.arfcn == arfcn; });
-  if (coded != arfcnToBsic_.rend()) row.number("BSIC", coded->bsic);
+  if (const auto bsic = bsicOf(valueOf(neighbour, fieldIn(neighbourLayout, "ARFCN"))))
+    row.write(codeRow, *bsic);
 }
 
-void NeighboringCells::decodeOther(RecordView record, LogCode logCode) {
-  if (logCode != bsicList::logCode) return logUnknownMessage(logCode);
-  if (record.size() < bsicList::minimumLength) return;
+std::optional<std::int64_t> NeighboringCells::bsicOf(std::int64_t arfcn) const {
+  const auto coded = std::find_if(arfcnToBsic_.rbegin(), arfcnToBsic_.rend(),
+                                  [&](const CodedCell& cell) { return cell.arfcn == arfcn; });
+  return coded == arfcnToBsic_.rend() ? std::nullopt : std::optional(coded->bsic);
+}
+
+CellIdentity NeighboringCells::cellOf(RecordView record, std::size_t place) const {
+  const std::int64_t arfcn = valueOf(entry(record, place), fieldIn(neighbourLayout, "ARFCN"));
+  return {RadioFamily::gsm, arfcn, bsicOf(arfcn).value_or(CellIdentity::unknown)};
+}
+
+Outcome NeighboringCells::decodeOther(RecordView record, LogCode logCode) {
+  if (logCode != bsicList::logCode) return ListDecoder::decodeOther(record, logCode);
+  if (record.size() < bsicList::minimumLength) return Outcome::tooShort;
   arfcnToBsic_.clear();
   for (std::size_t place = 0; place < countOf(record, bsicList::cells); ++place) {
     const RecordView cell = entryOf(record, bsicList::cells, place);
     arfcnToBsic_.push_back({valueOf(cell, fieldIn(bsicList::cellLayout, "ARFCN")),
                             valueOf(cell, fieldIn(bsicList::cellLayout, "BSIC"))});
   }
+  return listOutcome();
 }
 
 }  // namespace kelvasi

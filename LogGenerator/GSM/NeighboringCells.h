@@ -14,9 +14,12 @@ class NeighboringCells : public ListDecoder {
 
  protected:
   void addEntry(RecordView record, std::size_t place) override;
-  void decodeOther(RecordView record, LogCode logCode) override;
+  CellIdentity cellOf(RecordView record, std::size_t place) const override;
+  Outcome decodeOther(RecordView record, LogCode logCode) override;
 
  private:
+  std::optional<std::int64_t> bsicOf(std::int64_t arfcn) const;
+
   struct CodedCell {
     std::int64_t arfcn;
     std::int64_t bsic;

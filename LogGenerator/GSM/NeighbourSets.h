@@ -3,6 +3,7 @@
 
 #include <array>
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/EntryList.h"
 #include "LogGenerator/LogCode.h"
 
@@ -34,6 +35,12 @@ inline constexpr std::array gsmLayout{
     Field{.name = "ranking value", .byte = 5, .width = 16, .isSigned = true},
 };
 static_assert(inWireOrder(gsmLayout));
+
+inline constexpr CellFields umtsCell{.family = RadioFamily::umts,
+                                     .channel = fieldIn(umtsLayout, "downlink UARFCN"),
+                                     .code = fieldIn(umtsLayout, "scrambling code")};
+inline constexpr CellFields gsmCell{
+    .family = RadioFamily::gsm, .channel = fieldIn(gsmLayout, "ARFCN"), .code = fieldIn(gsmLayout, "BSIC")};
 
 // Both lists begin at the same byte, whatever the other one counts.
 inline constexpr std::size_t firstEntry = 15;

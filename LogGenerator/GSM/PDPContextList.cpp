@@ -14,11 +14,25 @@ std::span<const LogCode> PDPContextList::getLogCodeArray() const {
   return logCodes;
 }
 
-void PDPContextList::updateWithData(RecordView record, LogCode logCode) {
+Outcome PDPContextList::updateWithData(RecordView record, LogCode logCode) {
   trace("PDPContextList");
-  if (logCode != pdpContextLogCode) return logUnknownMessage(logCode);
+  if (logCode != pdpContextLogCode) {
+    logUnknownMessage(logCode);
+    return Outcome::notAskedFor;
+  }
   const auto contexts = platform().plists.parse(record.payload());
-  if (contexts && contexts->array() && sectionList()) replaceArrayWith(*sectionList(), *contexts->array());
+  if (!contexts || !contexts->array()) return Outcome::propertyListRefused;
+  if (!sectionList()) return Outcome::sectionMissing;
+  if (readings()) gather(*contexts->array());
+  replaceArrayWith(*sectionList(), *contexts->array());
+  return Outcome::shown;
+}
+
+void PDPContextList::gather(const PlistArray& contexts) const {
+  const ReadingSection& section = *place().section;
+  readings()->addRemovals(section, {}, sectionList()->size());
+  for (std::size_t at = 0; at < contexts.size(); ++at)
+    readings()->addValue(section, "/" + std::to_string(at), {}, contexts.at(at), true);
 }
 
 }  // namespace kelvasi

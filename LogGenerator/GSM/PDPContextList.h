@@ -9,9 +9,12 @@ class PDPContextList : public Base {
  public:
   using Base::Base;
 
-  void updateWithData(RecordView record, LogCode logCode) override;
+  Outcome updateWithData(RecordView record, LogCode logCode) override;
   std::string_view getSectionName() const override { return "PDP Context Info"; }
   std::span<const LogCode> getLogCodeArray() const override;
+
+ private:
+  void gather(const PlistArray& contexts) const;
 };
 
 }  // namespace kelvasi

@@ -10,7 +10,10 @@ namespace {
 constexpr std::array logCodes{mmState::logCode, registrationState::logCode};
 
 constexpr std::array mmRows{
-    Row{.key = "MM State", .field = indexIn(mmState::layout, "state"), .texts = mmState::states},
+    Row{.key = "MM State",
+        .quantity = quantity::mmState,
+        .field = indexIn(mmState::layout, "state"),
+        .texts = mmState::states},
 };
 constexpr std::array records{
     RecordRows{mmState::logCode, mmState::minimumLength, mmState::layout, mmRows},

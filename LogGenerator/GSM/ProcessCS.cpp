@@ -10,9 +10,16 @@ namespace {
 constexpr std::array logCodes{mmState::logCode, registrationState::logCode};
 
 constexpr std::array mmRows{
-    Row{.key = "MM State", .field = indexIn(mmState::layout, "state"), .texts = mmState::states},
-    Row{.key = "MM Sub State", .field = indexIn(mmState::layout, "sub-state"), .texts = mmState::subStates},
+    Row{.key = "MM State",
+        .quantity = quantity::mmState,
+        .field = indexIn(mmState::layout, "state"),
+        .texts = mmState::states},
+    Row{.key = "MM Sub State",
+        .quantity = quantity::mmSubState,
+        .field = indexIn(mmState::layout, "sub-state"),
+        .texts = mmState::subStates},
     Row{.key = "LU Reject Cause",
+        .quantity = quantity::mmUpdateStatus,
         .field = indexIn(mmState::layout, "update status"),
         .texts = mmState::updateStatuses},
 };

@@ -39,9 +39,14 @@ inline constexpr std::array serviceTypes{"NO_SERVICE"sv, "CS_ONLY"sv, "PS_ONLY"s
                                          "LIMITED_SERVICE"sv};
 
 inline constexpr std::array rows{
-    Row{.key = "Location Area Code", .field = indexIn(layout, "location area code")},
-    Row{.key = "Routing Area Code", .field = indexIn(layout, "routing area code")},
-    Row{.key = "Service Type", .field = indexIn(layout, "service type"), .texts = serviceTypes},
+    Row{.key = "Location Area Code",
+        .quantity = quantity::lac,
+        .field = indexIn(layout, "location area code")},
+    Row{.key = "Routing Area Code", .quantity = quantity::rac, .field = indexIn(layout, "routing area code")},
+    Row{.key = "Service Type",
+        .quantity = quantity::serviceType,
+        .field = indexIn(layout, "service type"),
+        .texts = serviceTypes},
 };
 
 }  // namespace kelvasi::registeredPlmn

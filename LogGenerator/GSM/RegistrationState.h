@@ -27,7 +27,10 @@ inline constexpr std::array states{
 };
 
 inline constexpr std::array serviceStateRows{
-    Row{.key = "MM Service State", .field = indexIn(layout, "registration state"), .texts = states},
+    Row{.key = "MM Service State",
+        .quantity = quantity::registrationState,
+        .field = indexIn(layout, "registration state"),
+        .texts = states},
 };
 inline constexpr RecordRows serviceState{logCode, minimumLength, layout, serviceStateRows};
 

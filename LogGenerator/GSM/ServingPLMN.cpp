@@ -19,6 +19,7 @@ constexpr std::array selectionModes{"Automatic"sv, "Manual"sv, "Limited"sv, "LIM
                                     "LIMITED_MANUAL_ACQ"sv};
 constexpr std::array selectionRows{
     Row{.key = "PLMN Sel Mod",
+        .quantity = quantity::plmnSelection,
         .field = indexIn(registrationState::layout, "PLMN selection mode"),
         .texts = selectionModes},
 };
@@ -28,9 +29,15 @@ constexpr std::array records{
 };
 
 constexpr std::array cellRows{
-    CellRow{mccKey, kTelvonCellMonitorMCC, "ServingPLMN: Failed to retrieve MCC\n"},
-    CellRow{mncKey, kTelvonCellMonitorMNC, "ServingPLMN: Failed to retrieve MNC\n"},
-    CellRow{"Location Area Code", kTelvonCellMonitorLAC, "ServingPLMN: Failed to retrieve LAC\n"},
+    CellRow{{.key = mccKey, .quantity = quantity::mcc},
+            kTelvonCellMonitorMCC,
+            "ServingPLMN: Failed to retrieve MCC\n"},
+    CellRow{{.key = mncKey, .quantity = quantity::mnc},
+            kTelvonCellMonitorMNC,
+            "ServingPLMN: Failed to retrieve MNC\n"},
+    CellRow{{.key = "Location Area Code", .quantity = quantity::lac},
+            kTelvonCellMonitorLAC,
+            "ServingPLMN: Failed to retrieve LAC\n"},
 };
 constexpr std::array technologies{kTelvonCellMonitorRadioAccessTechnologyUMTS,
                                   kTelvonCellMonitorRadioAccessTechnologyGSM};
@@ -43,28 +50,35 @@ constexpr StateSection section{.name = "Serving PLMN",
                                .cells = &servingCell};
 
 // A filler digit shows as a blank, so a two-digit network code ends with one.
-std::array<char, 3> digits(RecordView record, std::span<const std::size_t, 3> fields) {
-  std::array<char, 3> text;
-  for (std::size_t place = 0; place < text.size(); ++place) {
-    const std::int64_t digit = valueOf(record, registeredPlmn::layout[fields[place]]);
-    text[place] = digit < 10 ? static_cast<char>('0' + digit) : ' ';
-  }
-  return text;
+constexpr Row countryRow{.key = mccKey,
+                         .quantity = quantity::mcc,
+                         .field = indexIn(registeredPlmn::layout, "MCC digit 1"),
+                         .digits = 3};
+constexpr Row networkRow{.key = mncKey,
+                         .quantity = quantity::mnc,
+                         .field = indexIn(registeredPlmn::layout, "MNC digit 1"),
+                         .digits = 3};
+
+std::int64_t packed(RecordView record, std::span<const std::size_t, 3> fields) {
+  const auto digit = [&](std::size_t place) {
+    return valueOf(record, registeredPlmn::layout[fields[place]]) << (4 * place);
+  };
+  return digit(0) | digit(1) | digit(2);
 }
 
 }  // namespace
 
 ServingPLMN::ServingPLMN(const Platform& platform) : StateDecoder(platform, section) {}
 
-void ServingPLMN::decodeOther(RecordView record, LogCode logCode) {
-  if (logCode != registeredPlmn::logCode) return logUnknownMessage(logCode);
-  if (record.size() < registeredPlmn::minimumLength || !sectionRows()) return;
-  const auto mcc = digits(record, registeredPlmn::mccDigits);
-  const auto mnc = digits(record, registeredPlmn::mncDigits);
-  RowWriter writer(*sectionRows());
-  writer.text(mccKey, {mcc.data(), mcc.size()});
-  writer.text(mncKey, {mnc.data(), mnc.size()});
+Outcome ServingPLMN::decodeOther(RecordView record, LogCode logCode) {
+  if (logCode != registeredPlmn::logCode) return StateDecoder::decodeOther(record, logCode);
+  if (record.size() < registeredPlmn::minimumLength) return Outcome::tooShort;
+  if (!sectionRows()) return Outcome::sectionMissing;
+  RowWriter writer(*sectionRows(), place());
+  writer.write(countryRow, packed(record, registeredPlmn::mccDigits));
+  writer.write(networkRow, packed(record, registeredPlmn::mncDigits));
   show(record, registeredPlmn::layout, registeredPlmn::rows, writer);
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

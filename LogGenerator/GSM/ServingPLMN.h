@@ -10,7 +10,7 @@ class ServingPLMN : public StateDecoder {
   explicit ServingPLMN(const Platform& platform);
 
  protected:
-  void decodeOther(RecordView record, LogCode logCode) override;
+  Outcome decodeOther(RecordView record, LogCode logCode) override;
 };
 
 }  // namespace kelvasi

@@ -15,23 +15,33 @@ std::span<const LogCode> SimInfo::getLogCodeArray() const {
   return logCodes;
 }
 
-void SimInfo::updateWithData(RecordView record, LogCode logCode) {
+Outcome SimInfo::updateWithData(RecordView record, LogCode logCode) {
   trace("SimInfo");
-  if (logCode != simFilesLogCode) return;
+  if (logCode != simFilesLogCode) return Outcome::notAskedFor;
   const auto parsed = platform().plists.parse(record.payload());
   if (!parsed) {
     log().write(LogPriority::error, "SIM File dictionary data could not be constructed");
     throw LogCode_0xFF000020::UnknownDataException();
   }
-  if (!parsed->dictionary() || !sectionRows()) return;
+  if (!parsed->dictionary()) return Outcome::propertyListRefused;
+  if (!sectionRows()) return Outcome::sectionMissing;
   for (const simFiles::SimFile& file : simFiles::files) {
-    const PlistValue* value = parsed->dictionary()->find(file.key);
-    if (value && value->string()) {
-      sectionRows()->setText(file.row, *value->string());
-    } else if (value) {
-      sectionRows()->set(file.row, *value);
-    }
+    if (const PlistValue* value = parsed->dictionary()->find(file.key)) show(file.row, *value);
   }
+  return Outcome::shown;
+}
+
+void SimInfo::show(std::string_view row, const PlistValue& value) const {
+  const bool isNew = !sectionRows()->find(row);
+  if (value.string()) {
+    sectionRows()->setText(row, *value.string());
+  } else {
+    sectionRows()->set(row, value);
+  }
+  if (!readings()) return;
+  std::string path;
+  appendPathStep(path, row);
+  readings()->addValue(*place().section, std::move(path), row, value, isNew);
 }
 
 }  // namespace kelvasi

@@ -11,9 +11,12 @@ class SimInfo : public Base {
   using Base::Base;
 
   // Throws LogCode_0xFF000020::UnknownDataException when the record carries no property list.
-  void updateWithData(RecordView record, LogCode logCode) override;
+  Outcome updateWithData(RecordView record, LogCode logCode) override;
   std::string_view getSectionName() const override { return "SIM Info"; }
   std::span<const LogCode> getLogCodeArray() const override;
+
+ private:
+  void show(std::string_view row, const PlistValue& value) const;
 };
 
 }  // namespace kelvasi

@@ -29,12 +29,16 @@ inline constexpr EntryList channels{
     .count = fieldIn(layout, "transport channels"), .start = 16, .stride = 9, .layout = channelLayout};
 
 inline constexpr std::array rows{
-    Row{.key = "Window Size", .field = indexIn(layout, "window size")},
+    Row{.key = "Window Size", .quantity = quantity::window, .field = indexIn(layout, "window size")},
 };
 inline constexpr std::array channelRows{
-    Row{.key = "Transport Channel ID", .field = indexIn(channelLayout, "transport channel")},
-    Row{.key = "CRC Received", .field = indexIn(channelLayout, "CRCs received")},
-    Row{.key = "CRC Received in Error", .field = indexIn(channelLayout, "CRCs in error")},
+    Row{.key = "Transport Channel ID",
+        .quantity = quantity::channelId,
+        .field = indexIn(channelLayout, "transport channel")},
+    Row{.key = "CRC Received", .quantity = quantity::crcs, .field = indexIn(channelLayout, "CRCs received")},
+    Row{.key = "CRC Received in Error",
+        .quantity = quantity::crcErrors,
+        .field = indexIn(channelLayout, "CRCs in error")},
 };
 
 }  // namespace kelvasi::transportChannelCrc

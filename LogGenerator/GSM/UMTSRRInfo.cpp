@@ -16,21 +16,35 @@ constexpr auto uarfcnKey = "UARFCN"sv;
 
 constexpr std::array logCodes{rrcState::logCode, transmitPower::logCode, umtsServingCell::logCode,
                               ciphering::logCode, cellInfoLogCode};
+// Calculated.
+constexpr Row powerRow{
+    .key = "Transmit Power", .quantity = quantity::txPower, .unit = " dBm", .scale = Scale{.curve = fromRaw}};
+
 constexpr std::array records{rrcState::record, ciphering::record};
 
 constexpr std::array cellRows{
-    CellRow{"Cell ID", kTelvonCellMonitorCellId, "UMTSRRInfo: Failed to retrieve Cell ID\n"},
-    CellRow{uarfcnKey, kTelvonCellMonitorUARFCN, "UMTSRRInfo: Failed to retrieve UARFCN\n"},
-    CellRow{"Scrambling Code", kTelvonCellMonitorSCN, "UMTSRRInfo: Failed to retrieve Scrambling Code\n"},
+    CellRow{{.key = "Cell ID", .quantity = quantity::cellId},
+            kTelvonCellMonitorCellId,
+            "UMTSRRInfo: Failed to retrieve Cell ID\n"},
+    CellRow{{.key = uarfcnKey, .quantity = quantity::uarfcn},
+            kTelvonCellMonitorUARFCN,
+            "UMTSRRInfo: Failed to retrieve UARFCN\n"},
+    CellRow{{.key = "Scrambling Code", .quantity = quantity::scramblingCode},
+            kTelvonCellMonitorSCN,
+            "UMTSRRInfo: Failed to retrieve Scrambling Code\n"},
 };
 constexpr std::array technologies{kTelvonCellMonitorRadioAccessTechnologyUMTS};
-constexpr CellTable servingCell{technologies, kTelvonCellMonitorCellTypeServing, cellRows};
+constexpr CellTable servingCell{technologies,
+                                kTelvonCellMonitorCellTypeServing,
+                                cellRows,
+                                {RadioFamily::umts, kTelvonCellMonitorUARFCN, kTelvonCellMonitorSCN}};
 
 constexpr StateSection section{.name = "UMTS RR Info",
                                .trace = "UMTSRRInfo",
                                .logCodes = logCodes,
                                .records = records,
-                               .cells = &servingCell};
+                               .cells = &servingCell,
+                               .role = CellRole::serving};
 
 // The mean of the samples in dBm. Not a number when there is none: 0/0, whose sign differs from processor to
 // processor and would show.
@@ -52,26 +66,31 @@ double meanPower(RecordView record) {
 
 UMTSRRInfo::UMTSRRInfo(const Platform& platform) : StateDecoder(platform, section) {}
 
-void UMTSRRInfo::decodeOther(RecordView record, LogCode logCode) {
+Outcome UMTSRRInfo::decodeOther(RecordView record, LogCode logCode) {
   if (logCode == transmitPower::logCode) return showTransmitPower(record);
   if (logCode == umtsServingCell::logCode) return showServingCell(record);
-  logUnknownMessage(logCode);
+  return StateDecoder::decodeOther(record, logCode);
 }
 
-void UMTSRRInfo::showTransmitPower(RecordView record) const {
-  if (record.size() < transmitPower::minimumLength || !sectionRows()) return;
-  std::array<char, 32> text;
-  const int length = std::snprintf(text.data(), text.size(), "%4.2f dBm", meanPower(record));
-  RowWriter(*sectionRows()).text("Transmit Power", {text.data(), static_cast<std::size_t>(length)});
+Outcome UMTSRRInfo::showTransmitPower(RecordView record) const {
+  if (record.size() < transmitPower::minimumLength) return Outcome::tooShort;
+  if (!sectionRows()) return Outcome::sectionMissing;
+  RowWriter(*sectionRows(), place()).write(powerRow, rawOf(meanPower(record)));
+  return Outcome::shown;
 }
 
 // The two frequencies take the place of the UARFCN, until the cell list brings that again.
-void UMTSRRInfo::showServingCell(RecordView record) const {
-  if (record.size() < umtsServingCell::minimumLength || !sectionRows()) return;
-  RowWriter writer(*sectionRows());
+Outcome UMTSRRInfo::showServingCell(RecordView record) const {
+  if (record.size() < umtsServingCell::minimumLength) return Outcome::tooShort;
+  if (!sectionRows()) return Outcome::sectionMissing;
+  RowWriter writer(*sectionRows(), place());
   show(record, umtsServingCell::layout, umtsServingCell::cellRows, writer);
-  sectionRows()->remove(uarfcnKey);
+  writer.remove(uarfcnKey);
   show(record, umtsServingCell::layout, umtsServingCell::areaRows, writer);
+  if (readings())
+    writer.identify(
+        servingCellOf(umtsServingCell::cell, record, umtsServingCell::logCode, readings()->servingCells()));
+  return Outcome::shown;
 }
 
 }  // namespace kelvasi

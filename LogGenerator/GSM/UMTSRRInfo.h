@@ -10,11 +10,11 @@ class UMTSRRInfo : public StateDecoder {
   explicit UMTSRRInfo(const Platform& platform);
 
  protected:
-  void decodeOther(RecordView record, LogCode logCode) override;
+  Outcome decodeOther(RecordView record, LogCode logCode) override;
 
  private:
-  void showTransmitPower(RecordView record) const;
-  void showServingCell(RecordView record) const;
+  Outcome showTransmitPower(RecordView record) const;
+  Outcome showServingCell(RecordView record) const;
 };
 
 }  // namespace kelvasi

@@ -19,7 +19,10 @@ inline constexpr std::array layout{Field{.name = "RRC state", .byte = 13}};
 inline constexpr std::array states{"Disconnected"sv, "Connecting"sv, "CELL_FACH"sv,
                                    "CELL_DCH"sv,     "CELL_PCH"sv,   "URA_PCH"sv};
 inline constexpr std::array rows{
-    Row{.key = "RRC State", .field = indexIn(layout, "RRC state"), .texts = states},
+    Row{.key = "RRC State",
+        .quantity = quantity::rrcState,
+        .field = indexIn(layout, "RRC state"),
+        .texts = states},
 };
 inline constexpr RecordRows record{logCode, 14, layout, rows};
 
@@ -53,12 +56,18 @@ inline constexpr std::array layout{
 static_assert(inWireOrder(layout));
 
 inline constexpr std::array cellRows{
-    Row{.key = "Cell ID", .field = indexIn(layout, "cell identity")},
-    Row{.key = "Downlink Frequency", .field = indexIn(layout, "downlink UARFCN")},
-    Row{.key = "Uplink Frequency", .field = indexIn(layout, "uplink UARFCN")},
+    Row{.key = "Cell ID", .quantity = quantity::cellId, .field = indexIn(layout, "cell identity")},
+    Row{.key = "Downlink Frequency",
+        .quantity = quantity::uarfcn,
+        .field = indexIn(layout, "downlink UARFCN")},
+    Row{.key = "Uplink Frequency", .quantity = quantity::uarfcn, .field = indexIn(layout, "uplink UARFCN")},
 };
+inline constexpr CellFields cell{.family = RadioFamily::umts,
+                                 .channel = fieldIn(layout, "downlink UARFCN"),
+                                 .cellId = fieldIn(layout, "cell identity"),
+                                 .isServing = true};
 inline constexpr std::array areaRows{
-    Row{.key = "URA ID", .field = indexIn(layout, "URA identity")},
+    Row{.key = "URA ID", .quantity = quantity::uraId, .field = indexIn(layout, "URA identity")},
 };
 
 }  // namespace umtsServingCell
@@ -72,7 +81,11 @@ inline constexpr std::array layout{Field{.name = "ciphering", .byte = 13}};
 
 inline constexpr std::array states{"Disabled"sv, "Enabled"sv};
 inline constexpr std::array rows{
-    Row{.key = "Ciphering", .field = indexIn(layout, "ciphering"), .texts = states, .isFlag = true},
+    Row{.key = "Ciphering",
+        .quantity = quantity::ciphering,
+        .field = indexIn(layout, "ciphering"),
+        .texts = states,
+        .isFlag = true},
 };
 inline constexpr RecordRows record{logCode, 19, layout, rows};
 

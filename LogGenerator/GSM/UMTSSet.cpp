@@ -11,34 +11,50 @@ using namespace neighbourSets;
 
 constexpr std::array logCodes{neighbourSets::logCode, cellInfoLogCode};
 constexpr std::array rows{
-    Row{.key = "Scrambling Code", .field = indexIn(umtsLayout, "scrambling code")},
-    Row{.key = "RSCP", .field = indexIn(umtsLayout, "RSCP"), .unit = " dB", .offset = -21},
+    Row{.key = "Scrambling Code",
+        .quantity = quantity::scramblingCode,
+        .field = indexIn(umtsLayout, "scrambling code")},
+    Row{.key = "RSCP",
+        .quantity = quantity::rscp,
+        .field = indexIn(umtsLayout, "RSCP"),
+        .unit = " dB",
+        .offset = -21},
     Row{.key = "Energy Per Chip",
+        .quantity = quantity::ecno,
         .field = indexIn(umtsLayout, "Ec/No in half dB"),
         .unit = " dB",
         .scale = Scale{.factor = 0.5, .format = "%f"}},
-    Row{.key = "Downlink Frequency", .field = indexIn(umtsLayout, "downlink UARFCN")},
-    Row{.key = "Ranking Value", .field = indexIn(umtsLayout, "ranking value")},
-    Row{.key = "Rank Cell RSCP", .field = indexIn(umtsLayout, "rank-cell RSCP"), .unit = " dB"},
+    Row{.key = "Downlink Frequency",
+        .quantity = quantity::uarfcn,
+        .field = indexIn(umtsLayout, "downlink UARFCN")},
+    Row{.key = "Ranking Value", .quantity = quantity::ranking, .field = indexIn(umtsLayout, "ranking value")},
+    Row{.key = "Rank Cell RSCP",
+        .quantity = quantity::rscp,
+        .field = indexIn(umtsLayout, "rank-cell RSCP"),
+        .unit = " dB"},
 };
 
 // Unit and key of the frequency differ from the rows above.
 constexpr std::array cellRows{
-    CellRow{"UARFCN", kTelvonCellMonitorUARFCN, "UMTSSet: Failed to retrieve UARFCN\n"},
-    CellRow{"Scrambling Code", kTelvonCellMonitorSCN, "UMTSSet: Failed to retrieve Scrambling Code\n"},
-    CellRow{.key = "RSCP",
-            .cellKey = kTelvonCellMonitorRSCP,
-            .failure = "UMTSSet: Failed to retrieve RSCP\n",
-            .unit = " dBm",
-            .isMeasurement = true},
-    CellRow{.key = "Energy Per Chip",
-            .cellKey = kTelvonCellMonitorECN0,
-            .failure = "UMTSSet: Failed to retrieve Energy Per Chip\n",
-            .unit = " dB",
-            .isMeasurement = true},
+    CellRow{{.key = "UARFCN", .quantity = quantity::uarfcn},
+            kTelvonCellMonitorUARFCN,
+            "UMTSSet: Failed to retrieve UARFCN\n"},
+    CellRow{{.key = "Scrambling Code", .quantity = quantity::scramblingCode},
+            kTelvonCellMonitorSCN,
+            "UMTSSet: Failed to retrieve Scrambling Code\n"},
+    CellRow{{.key = "RSCP", .quantity = quantity::rscp, .unit = " dBm", .special = emptyIfNotMeasured},
+            kTelvonCellMonitorRSCP,
+            "UMTSSet: Failed to retrieve RSCP\n"},
+    CellRow{
+        {.key = "Energy Per Chip", .quantity = quantity::ecno, .unit = " dB", .special = emptyIfNotMeasured},
+        kTelvonCellMonitorECN0,
+        "UMTSSet: Failed to retrieve Energy Per Chip\n"},
 };
 constexpr std::array technologies{kTelvonCellMonitorRadioAccessTechnologyUMTS};
-constexpr CellTable neighbours{technologies, kTelvonCellMonitorCellTypeNeighbor, cellRows};
+constexpr CellTable neighbours{technologies,
+                               kTelvonCellMonitorCellTypeNeighbor,
+                               cellRows,
+                               {RadioFamily::umts, kTelvonCellMonitorUARFCN, kTelvonCellMonitorSCN}};
 
 constexpr ListSection section{.name = "UMTS Set",
                               .trace = "UMTSSet",
@@ -47,7 +63,9 @@ constexpr ListSection section{.name = "UMTS Set",
                               .minimumLength = minimumLength,
                               .list = umtsCells,
                               .rows = rows,
-                              .cells = &neighbours};
+                              .cells = &neighbours,
+                              .role = CellRole::neighbour,
+                              .cell = umtsCell};
 
 }  // namespace
 

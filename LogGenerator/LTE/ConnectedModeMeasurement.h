@@ -3,6 +3,7 @@
 
 #include <array>
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/EntryList.h"
 #include "LogGenerator/LogCode.h"
 
@@ -32,6 +33,16 @@ static_assert(inWireOrder(measuredLayout));
 inline constexpr std::array detectedLayout{
     Field{.name = "physical cell identity", .byte = 0, .width = 16},
 };
+
+inline constexpr CellFields serving{.family = RadioFamily::lte,
+                                    .channel = fieldIn(layout, "E-ARFCN"),
+                                    .code = fieldIn(layout, "serving physical cell identity")};
+inline constexpr CellFields measuredCell{.family = RadioFamily::lte,
+                                         .code = fieldIn(measuredLayout, "physical cell identity"),
+                                         .headChannel = fieldIn(layout, "E-ARFCN")};
+inline constexpr CellFields detectedCell{.family = RadioFamily::lte,
+                                         .code = fieldIn(detectedLayout, "physical cell identity"),
+                                         .headChannel = fieldIn(layout, "E-ARFCN")};
 
 inline constexpr EntryList measured{
     .count = fieldIn(layout, "measured neighbours"), .start = 29, .stride = 6, .layout = measuredLayout};

@@ -12,6 +12,7 @@ constexpr std::array logCodes{connectedModeMeasurement::logCode};
 
 constexpr std::array rows{
     Row{.key = "Physical Cell ID",
+        .quantity = quantity::pci,
         .field = indexIn(connectedModeMeasurement::detectedLayout, "physical cell identity")},
 };
 
@@ -21,7 +22,9 @@ constexpr ListSection section{.name = "Detected Cells",
                               .logCode = connectedModeMeasurement::logCode,
                               .minimumLength = connectedModeMeasurement::minimumLength,
                               .list = connectedModeMeasurement::detected,
-                              .rows = rows};
+                              .rows = rows,
+                              .role = CellRole::neighbour,
+                              .cell = connectedModeMeasurement::detectedCell};
 
 }  // namespace
 

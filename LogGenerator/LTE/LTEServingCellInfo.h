@@ -9,7 +9,7 @@ class LTEServingCellInfo : public StateDecoder {
  public:
   explicit LTEServingCellInfo(const Platform& platform);
 
-  void updateWithData(RecordView record, LogCode logCode) override;
+  Outcome updateWithData(RecordView record, LogCode logCode) override;
 };
 
 }  // namespace kelvasi

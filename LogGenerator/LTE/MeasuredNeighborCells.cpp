@@ -13,12 +13,16 @@ using connectedModeMeasurement::measuredLayout;
 constexpr std::array logCodes{connectedModeMeasurement::logCode};
 
 constexpr std::array rows{
-    Row{.key = "Physical Cell ID", .field = indexIn(measuredLayout, "physical cell identity")},
+    Row{.key = "Physical Cell ID",
+        .quantity = quantity::pci,
+        .field = indexIn(measuredLayout, "physical cell identity")},
     Row{.key = "Filtered RSRP",
+        .quantity = quantity::rsrp,
         .field = indexIn(measuredLayout, "filtered RSRP"),
         .unit = " dBm",
         .scale = quarterRsrp},
     Row{.key = "Filtered RSRQ",
+        .quantity = quantity::rsrq,
         .field = indexIn(measuredLayout, "filtered RSRQ"),
         .unit = " dB",
         .scale = eighthRsrq},
@@ -30,7 +34,9 @@ constexpr ListSection section{.name = "Measured Neighbor Cells",
                               .logCode = connectedModeMeasurement::logCode,
                               .minimumLength = connectedModeMeasurement::minimumLength,
                               .list = connectedModeMeasurement::measured,
-                              .rows = rows};
+                              .rows = rows,
+                              .role = CellRole::neighbour,
+                              .cell = connectedModeMeasurement::measuredCell};
 
 }  // namespace
 

@@ -17,34 +17,45 @@ constexpr std::size_t frameOffset = indexIn(neighborLayout, "frame offset");
 constexpr std::size_t sampleOffset = indexIn(neighborLayout, "sample offset");
 
 constexpr std::array rows{
-    Row{.key = "Physical Cell ID", .field = identity},
+    Row{.key = "Physical Cell ID", .quantity = quantity::pci, .field = identity},
     Row{.key = "Measured RSSI",
+        .quantity = quantity::rssi,
         .field = indexIn(neighborLayout, "measured RSSI"),
         .unit = " dBm",
         .scale = halfRssi},
     Row{.key = "Measured RSRP",
+        .quantity = quantity::rsrp,
         .field = indexIn(neighborLayout, "measured RSRP"),
         .unit = " dBm",
         .scale = halfRsrp},
     Row{.key = "Average RSRP",
+        .quantity = quantity::rsrp,
         .field = indexIn(neighborLayout, "average RSRP"),
         .unit = " dBm",
         .scale = halfRsrp},
     Row{.key = "Measured RSRQ",
+        .quantity = quantity::rsrq,
         .field = indexIn(neighborLayout, "measured RSRQ"),
         .unit = " dB",
         .scale = quarterRsrq},
     Row{.key = "Average RSRQ",
+        .quantity = quantity::rsrq,
         .field = indexIn(neighborLayout, "average RSRQ"),
         .unit = " dB",
         .scale = quarterRsrq},
-    Row{.key = "Srxlev", .field = indexIn(neighborLayout, "Srxlev"), .unit = " dBm", .offset = -30},
-    Row{.key = "Frequency Offset", .field = indexIn(neighborLayout, "frequency offset")},
-    Row{.key = "Ant 0 Frame Offset", .field = frameOffset},
-    Row{.key = "Ant 0 Sample Offset", .field = sampleOffset},
+    Row{.key = "Srxlev",
+        .quantity = quantity::srxlev,
+        .field = indexIn(neighborLayout, "Srxlev"),
+        .unit = " dBm",
+        .offset = -30},
+    Row{.key = "Frequency Offset",
+        .quantity = quantity::frequencyOffset,
+        .field = indexIn(neighborLayout, "frequency offset")},
+    Row{.key = "Ant 0 Frame Offset", .quantity = quantity::frameOffset, .field = frameOffset},
+    Row{.key = "Ant 0 Sample Offset", .quantity = quantity::sampleOffset, .field = sampleOffset},
     // The record has the offsets of one antenna only; the second one shows them again.
-    Row{.key = "Ant 1 Frame Offset", .field = frameOffset},
-    Row{.key = "Ant 1 Sample Offset", .field = sampleOffset},
+    Row{.key = "Ant 1 Frame Offset", .quantity = quantity::frameOffset, .field = frameOffset},
+    Row{.key = "Ant 1 Sample Offset", .quantity = quantity::sampleOffset, .field = sampleOffset},
 };
 
 constexpr ListSection section{.name = "Neighbor Cells List",
@@ -53,7 +64,9 @@ constexpr ListSection section{.name = "Neighbor Cells List",
                               .logCode = neighborMeasurement::logCode,
                               .minimumLength = neighborMeasurement::minimumLength,
                               .list = neighborMeasurement::neighbors,
-                              .rows = rows};
+                              .rows = rows,
+                              .role = CellRole::neighbour,
+                              .cell = neighborMeasurement::neighborCell};
 
 }  // namespace
 

@@ -3,6 +3,7 @@
 
 #include <array>
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/EntryList.h"
 #include "LogGenerator/LogCode.h"
 
@@ -32,6 +33,10 @@ inline constexpr std::array neighborLayout{
     Field{.name = "sample offset", .byte = 13, .bit = 3, .width = 19},
 };
 static_assert(inWireOrder(neighborLayout));
+
+inline constexpr CellFields neighborCell{.family = RadioFamily::lte,
+                                         .code = fieldIn(neighborLayout, "physical cell identity"),
+                                         .headChannel = fieldIn(layout, "E-ARFCN")};
 
 // The count leaves out one cell, so the list is never empty.
 inline constexpr EntryList neighbors{.count = fieldIn(layout, "neighbours minus 1"),

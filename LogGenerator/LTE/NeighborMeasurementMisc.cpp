@@ -11,9 +11,10 @@ using lte::neighborMeasurement::layout;
 constexpr std::array logCodes{lte::neighborMeasurement::logCode};
 
 constexpr std::array rows{
-    Row{.key = "Version", .field = indexIn(layout, "version")},
-    Row{.key = "E-ARFCN", .field = indexIn(layout, "E-ARFCN")},
+    Row{.key = "Version", .quantity = quantity::version, .field = indexIn(layout, "version")},
+    Row{.key = "E-ARFCN", .quantity = quantity::earfcn, .field = indexIn(layout, "E-ARFCN")},
     Row{.key = "Qrxlevmin",
+        .quantity = quantity::qrxlevmin,
         .field = indexIn(layout, "Qrxlevmin"),
         .unit = " dBm",
         .factor = 2,
@@ -26,7 +27,8 @@ constexpr std::array records{
 constexpr StateSection section{.name = "Neighbor Measurements",
                                .trace = "Neighbor Measurements",
                                .logCodes = logCodes,
-                               .records = records};
+                               .records = records,
+                               .role = CellRole::neighbour};
 
 }  // namespace
 

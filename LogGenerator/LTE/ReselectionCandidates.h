@@ -3,6 +3,7 @@
 
 #include <array>
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/EntryList.h"
 #include "LogGenerator/LogCode.h"
 
@@ -18,6 +19,10 @@ inline constexpr std::array layout{
     Field{.name = "candidates", .byte = 19, .width = 16},
 };
 static_assert(inWireOrder(layout));
+
+inline constexpr CellFields serving{.family = RadioFamily::lte,
+                                    .channel = fieldIn(layout, "serving E-ARFCN"),
+                                    .code = fieldIn(layout, "serving cell identity")};
 
 inline constexpr std::array candidateLayout{
     Field{.name = "priority", .byte = 0, .width = 16},

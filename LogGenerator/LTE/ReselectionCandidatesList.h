@@ -12,6 +12,7 @@ class ReselectionCandidatesList : public ListDecoder {
 
  protected:
   void addEntry(RecordView record, std::size_t place) override;
+  CellIdentity cellOf(RecordView record, std::size_t place) const override;
 };
 
 }  // namespace kelvasi

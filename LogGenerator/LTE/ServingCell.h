@@ -4,6 +4,7 @@
 #include <array>
 #include <string_view>
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/Row.h"
 
@@ -23,6 +24,12 @@ inline constexpr std::array layout{
     Field{.name = "frequency band indicator", .byte = 28, .width = 32},
 };
 static_assert(inWireOrder(layout));
+
+inline constexpr CellFields cell{.family = RadioFamily::lte,
+                                 .channel = fieldIn(layout, "downlink E-ARFCN"),
+                                 .code = fieldIn(layout, "physical cell identity"),
+                                 .cellId = fieldIn(layout, "cell identity"),
+                                 .isServing = true};
 
 // By the number of resource blocks (3GPP TS 36.101, table 5.6-1).
 inline constexpr auto bandwidths = [] {

@@ -3,6 +3,7 @@
 
 #include <array>
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 
@@ -32,5 +33,10 @@ inline constexpr std::array layout{
     Field{.name = "measurement rules", .byte = 32, .bit = 2, .width = 4},
 };
 static_assert(inWireOrder(layout));
+
+inline constexpr CellFields cell{.family = RadioFamily::lte,
+                                 .channel = fieldIn(layout, "E-ARFCN"),
+                                 .code = fieldIn(layout, "physical cell identity"),
+                                 .isServing = true};
 
 }  // namespace kelvasi::lte::servingCellMeasurement

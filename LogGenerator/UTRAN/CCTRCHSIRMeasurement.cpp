@@ -12,9 +12,13 @@ using channelMeasurement::compositeLayout;
 constexpr std::array logCodes{channelMeasurement::logCode};
 
 constexpr std::array rows{
-    Row{.key = "CCTRCH ID", .field = indexIn(compositeLayout, "CCTRCH identity")},
-    Row{.key = "TSNUM", .field = indexIn(compositeLayout, "timeslot number")},
+    Row{.key = "CCTRCH ID",
+        .quantity = quantity::channelId,
+        .field = indexIn(compositeLayout, "CCTRCH identity")},
+    Row{.key = "TSNUM", .quantity = quantity::timeslot, .field = indexIn(compositeLayout, "timeslot number")},
 };
+
+constexpr Row ratioRow{.key = "SIR", .quantity = quantity::sir, .field = indexIn(compositeLayout, "SIR 0")};
 
 constexpr ListSection section{.name = "CCTRCH SIR",
                               .trace = "CCTRCH SIR Measurement",
@@ -31,11 +35,11 @@ CCTRCHSIRMeasurement::CCTRCHSIRMeasurement(const Platform& platform) : ListDecod
 void CCTRCHSIRMeasurement::addEntry(RecordView record, std::size_t place) {
   const RecordView channel = entry(record, place);
   const auto ratios = PlistArray::make();
-  for (std::size_t timeslot = 0; timeslot < channelMeasurement::timeslots; ++timeslot)
-    ratios->append(std::to_string(channelMeasurement::ratioOf(channel, timeslot)));
   RowWriter row = addRows();
   show(channel, compositeLayout, rows, row);
-  row.value("SIR", ratios);
+  row.list(ratioRow.key, ratios);
+  for (std::size_t timeslot = 0; timeslot < channelMeasurement::timeslots; ++timeslot)
+    row.element(*ratios, ratioRow, channelMeasurement::ratioOf(channel, timeslot));
 }
 
 }  // namespace kelvasi

@@ -11,13 +11,13 @@ using utran::gsmNeighborCells::cellLayout;
 constexpr std::array logCodes{utran::gsmNeighborCells::logCode};
 
 constexpr std::array rows{
-    Row{.key = "Cell ID", .field = indexIn(cellLayout, "cell identity")},
-    Row{.key = "Band Indicator", .field = indexIn(cellLayout, "band indicator")},
-    Row{.key = "BSIC Valid", .field = indexIn(cellLayout, "BSIC valid")},
-    Row{.key = "NCC", .field = indexIn(cellLayout, "NCC")},
-    Row{.key = "BCC", .field = indexIn(cellLayout, "BCC")},
-    Row{.key = "ARFCN", .field = indexIn(cellLayout, "ARFCN")},
-    Row{.key = "RSSI", .field = indexIn(cellLayout, "RSSI")},
+    Row{.key = "Cell ID", .quantity = quantity::cellId, .field = indexIn(cellLayout, "cell identity")},
+    Row{.key = "Band Indicator", .quantity = quantity::band, .field = indexIn(cellLayout, "band indicator")},
+    Row{.key = "BSIC Valid", .quantity = quantity::flag, .field = indexIn(cellLayout, "BSIC valid")},
+    Row{.key = "NCC", .quantity = quantity::ncc, .field = indexIn(cellLayout, "NCC")},
+    Row{.key = "BCC", .quantity = quantity::bcc, .field = indexIn(cellLayout, "BCC")},
+    Row{.key = "ARFCN", .quantity = quantity::arfcn, .field = indexIn(cellLayout, "ARFCN")},
+    Row{.key = "RSSI", .quantity = quantity::rssi, .field = indexIn(cellLayout, "RSSI")},
 };
 
 constexpr ListSection section{.name = "GSM Neighbor Cell List",

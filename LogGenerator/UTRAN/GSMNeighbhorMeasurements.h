@@ -11,7 +11,7 @@ class GSMNeighbhorMeasurements : public ListDecoder {
 
  protected:
   // A code that it did not ask for is not worth a line.
-  void decodeOther(RecordView, LogCode) override {}
+  Outcome decodeOther(RecordView, LogCode) override { return Outcome::notAskedFor; }
 };
 
 }  // namespace kelvasi

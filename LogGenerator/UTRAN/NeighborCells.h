@@ -3,6 +3,7 @@
 
 #include <array>
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/EntryList.h"
 #include "LogGenerator/LogCode.h"
 
@@ -21,6 +22,10 @@ inline constexpr std::array cellLayout{
     Field{.name = "in the JDCS", .byte = 3, .bit = 7, .width = 1},
 };
 static_assert(inWireOrder(cellLayout));
+
+inline constexpr CellFields cell{.family = RadioFamily::utraTdd,
+                                 .channel = fieldIn(cellLayout, "UARFCN"),
+                                 .code = fieldIn(cellLayout, "cell identity")};
 
 inline constexpr EntryList cells{
     .count = fieldIn(layout, "cells"), .start = 168, .stride = 16, .layout = cellLayout};

@@ -9,12 +9,13 @@ class RRC_State : public Base {
  public:
   using Base::Base;
 
-  void updateWithData(RecordView record, LogCode logCode) override;
+  Outcome updateWithData(RecordView record, LogCode logCode) override;
   std::string_view getSectionName() const override { return "RRC Info"; }
   std::span<const LogCode> getLogCodeArray() const override;
+  std::optional<std::size_t> versionAt(LogCode) const override;
 
  private:
-  void traceDisplay(std::int64_t mode, std::string_view text) const;
+  void traceDisplay(std::int64_t mode, const std::string& text) const;
 };
 
 }  // namespace kelvasi

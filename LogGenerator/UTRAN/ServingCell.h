@@ -3,6 +3,7 @@
 
 #include <array>
 
+#include "LogGenerator/CellFields.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 
@@ -20,5 +21,10 @@ inline constexpr std::array layout{
     Field{.name = "emergency calls only", .byte = 25, .bit = 0, .width = 1},
 };
 static_assert(inWireOrder(layout));
+
+inline constexpr CellFields cell{.family = RadioFamily::utraTdd,
+                                 .channel = fieldIn(layout, "downlink UARFCN"),
+                                 .cellId = fieldIn(layout, "cell identity"),
+                                 .isServing = true};
 
 }  // namespace kelvasi::utran::servingCell

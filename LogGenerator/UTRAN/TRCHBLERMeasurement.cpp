@@ -12,8 +12,12 @@ using channelMeasurement::transportLayout;
 constexpr std::array logCodes{channelMeasurement::logCode};
 
 constexpr std::array rows{
-    Row{.key = "TRCH ID", .field = indexIn(transportLayout, "TRCH identity")},
-    Row{.key = "TRCH BLER Measurement", .field = indexIn(transportLayout, "BLER measurement")},
+    Row{.key = "TRCH ID",
+        .quantity = quantity::channelId,
+        .field = indexIn(transportLayout, "TRCH identity")},
+    Row{.key = "TRCH BLER Measurement",
+        .quantity = quantity::bler,
+        .field = indexIn(transportLayout, "BLER measurement")},
 };
 
 constexpr ListSection section{.name = "TRCH BLER",

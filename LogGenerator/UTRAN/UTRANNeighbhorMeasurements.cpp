@@ -16,13 +16,20 @@ constexpr std::array<std::string_view, 2> truth{"FALSE", "TRUE"};
 constexpr Scale rscp{.factor = 0.00390625, .format = "%f"};
 
 constexpr std::array rows{
-    Row{.key = "UARFCN", .field = indexIn(cellLayout, "UARFCN")},
-    Row{.key = "Cell ID", .field = indexIn(cellLayout, "cell identity")},
-    Row{.key = "Filter RSCP", .field = indexIn(cellLayout, "filtered RSCP"), .scale = rscp},
+    Row{.key = "UARFCN", .quantity = quantity::uarfcn, .field = indexIn(cellLayout, "UARFCN")},
+    Row{.key = "Cell ID", .quantity = quantity::cellParameter, .field = indexIn(cellLayout, "cell identity")},
+    Row{.key = "Filter RSCP",
+        .quantity = quantity::rscpLevel,
+        .field = indexIn(cellLayout, "filtered RSCP"),
+        .scale = rscp},
 };
-constexpr std::array membershipRows{Row{.key = "Status", .field = membership, .texts = sets}};
+constexpr std::array membershipRows{
+    Row{.key = "Status", .quantity = quantity::cellSet, .field = membership, .texts = sets}};
 constexpr std::array lastRows{
-    Row{.key = "inJDCS", .field = indexIn(cellLayout, "in the JDCS"), .texts = truth},
+    Row{.key = "inJDCS",
+        .quantity = quantity::flag,
+        .field = indexIn(cellLayout, "in the JDCS"),
+        .texts = truth},
 };
 
 constexpr ListSection section{.name = "Neighbor Cell List",
@@ -31,7 +38,9 @@ constexpr ListSection section{.name = "Neighbor Cell List",
                               .logCode = utran::neighborCells::logCode,
                               .minimumLength = utran::neighborCells::minimumLength,
                               .list = utran::neighborCells::cells,
-                              .rows = rows};
+                              .rows = rows,
+                              .role = CellRole::neighbour,
+                              .cell = utran::neighborCells::cell};
 
 }  // namespace
 

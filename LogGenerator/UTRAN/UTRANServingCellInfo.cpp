@@ -19,34 +19,53 @@ constexpr std::array logCodes{utran::servingCell::logCode, cellInfoLogCode};
 constexpr std::array<std::string_view, 2> allowedAccess{"All Calls", "Emergency Calls Only"};
 
 constexpr std::array rows{
-    Row{.key = "Cell Access Restrictions", .field = indexIn(layout, "cell access restrictions")},
-    Row{.key = "URA ID", .field = indexIn(layout, "URA identity")},
-    Row{.key = uplinkKey, .field = indexIn(layout, "uplink UARFCN")},
-    Row{.key = downlinkKey, .field = indexIn(layout, "downlink UARFCN")},
-    Row{.key = cellKey, .field = indexIn(layout, "cell identity")},
-    Row{.key = "Allowed Access", .field = indexIn(layout, "emergency calls only"), .texts = allowedAccess},
+    Row{.key = "Cell Access Restrictions",
+        .quantity = quantity::accessRestrictions,
+        .field = indexIn(layout, "cell access restrictions")},
+    Row{.key = "URA ID", .quantity = quantity::uraId, .field = indexIn(layout, "URA identity")},
+    Row{.key = uplinkKey, .quantity = quantity::uarfcn, .field = indexIn(layout, "uplink UARFCN")},
+    Row{.key = downlinkKey, .quantity = quantity::uarfcn, .field = indexIn(layout, "downlink UARFCN")},
+    Row{.key = cellKey, .quantity = quantity::cellId, .field = indexIn(layout, "cell identity")},
+    Row{.key = "Allowed Access",
+        .quantity = quantity::access,
+        .field = indexIn(layout, "emergency calls only"),
+        .texts = allowedAccess},
 };
 constexpr std::array records{
-    RecordRows{utran::servingCell::logCode, utran::servingCell::minimumLength, layout, rows},
+    RecordRows{utran::servingCell::logCode, utran::servingCell::minimumLength, layout, rows,
+               utran::servingCell::cell},
 };
 
-constexpr StateSection section{
-    .name = "Serving Cell Info", .trace = "Serving Cell Info", .logCodes = logCodes, .records = records};
+constexpr StateSection section{.name = "Serving Cell Info",
+                               .trace = "Serving Cell Info",
+                               .logCodes = logCodes,
+                               .records = records,
+                               .role = CellRole::serving};
 
 constexpr std::array cellRows{
-    CellRow{"Local Area Code", kTelvonCellMonitorLAC, "Serving Cell Info: Failed to retrieve LAC\n"},
-    CellRow{cellKey, kTelvonCellMonitorCellId, "Serving Cell Info: Failed to retrieve Cell ID\n"},
-    CellRow{"Freq Band Indicator", kTelvonCellMonitorBandInfo,
+    CellRow{{.key = "Local Area Code", .quantity = quantity::lac},
+            kTelvonCellMonitorLAC,
+            "Serving Cell Info: Failed to retrieve LAC\n"},
+    CellRow{{.key = cellKey, .quantity = quantity::cellId},
+            kTelvonCellMonitorCellId,
+            "Serving Cell Info: Failed to retrieve Cell ID\n"},
+    CellRow{{.key = "Freq Band Indicator", .quantity = quantity::bandInfo},
+            kTelvonCellMonitorBandInfo,
             "Serving Cell Info: Failed to retrieve Freq Band Indicator\n"},
-    CellRow{"Cell Scrambling Code", kTelvonCellMonitorSCN,
+    CellRow{{.key = "Cell Scrambling Code", .quantity = quantity::cellParameter},
+            kTelvonCellMonitorSCN,
             "Serving Cell Info: Failed to retrieve Cell Scrambling Code\n"},
-    CellRow{uplinkKey, kTelvonCellMonitorUARFCN, "Serving Cell Info: Failed to retrieve UARFCN\n"},
+    CellRow{{.key = uplinkKey, .quantity = quantity::uarfcn},
+            kTelvonCellMonitorUARFCN,
+            "Serving Cell Info: Failed to retrieve UARFCN\n"},
     // The one number for both directions; its absence has been said.
-    CellRow{downlinkKey, kTelvonCellMonitorUARFCN, {}},
+    CellRow{{.key = downlinkKey, .quantity = quantity::uarfcn}, kTelvonCellMonitorUARFCN, {}},
 };
 constexpr std::array technologies{kTelvonCellMonitorRadioAccessTechnologyUTRAN2};
-constexpr CellTable cells{
-    .technologies = technologies, .type = kTelvonCellMonitorCellTypeServing, .rows = cellRows};
+constexpr CellTable cells{.technologies = technologies,
+                          .type = kTelvonCellMonitorCellTypeServing,
+                          .rows = cellRows,
+                          .keys = {RadioFamily::utraTdd, kTelvonCellMonitorUARFCN, kTelvonCellMonitorSCN}};
 
 }  // namespace
 
@@ -54,16 +73,17 @@ UTRANServingCellInfo::UTRANServingCellInfo(const Platform& platform) : StateDeco
 
 // Every serving cell of the list is shown, so the last one wins. A code that it did not ask for is not worth
 // a line.
-void UTRANServingCellInfo::decodeOther(RecordView record, LogCode logCode) {
-  if (logCode != cellInfoLogCode) return;
+Outcome UTRANServingCellInfo::decodeOther(RecordView record, LogCode logCode) {
+  if (logCode != cellInfoLogCode) return Outcome::notAskedFor;
   const CellInfoArray cellInfo(platform(), record.payload());
-  if (!cellInfo.cells()) return;
+  if (!cellInfo.cells()) return Outcome::propertyListRefused;
   PlistDictionary unbound;
   for (const PlistValue& cell : *cellInfo.cells()) {
     if (!cells.takes(cell)) continue;
-    RowWriter writer(sectionRows() ? *sectionRows() : unbound);
-    kelvasi::showCell(*cell.dictionary(), cellRows, writer, log());
+    RowWriter writer(sectionRows() ? *sectionRows() : unbound, place());
+    kelvasi::showCell(*cell.dictionary(), cells, writer, log());
   }
+  return rowsOutcome();
 }
 
 }  // namespace kelvasi

@@ -10,7 +10,7 @@ class UTRANServingCellInfo : public StateDecoder {
   explicit UTRANServingCellInfo(const Platform& platform);
 
  protected:
-  void decodeOther(RecordView record, LogCode logCode) override;
+  Outcome decodeOther(RecordView record, LogCode logCode) override;
 };
 
 }  // namespace kelvasi

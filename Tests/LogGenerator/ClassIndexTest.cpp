@@ -176,34 +176,37 @@ TEST(Base, AReaderOfAnArrayThatIsBeingClearedWaitsAndSeesItEmpty) {
   EXPECT_EQ(reader.get(), 0u);
 }
 
+constexpr Row rowA{.key = "a", .quantity = quantity::count};
+constexpr Row rowB{.key = "b", .quantity = quantity::count};
+
 TEST(RowList, UsesTheDictionariesOfTheLastRoundAgain) {
   RowList list;
-  { list.add().text("k", "1"); }
+  { list.add().write(rowA, 1); }
   const PlistDictionary* const before = list.entries().at(0).dictionary();
-  list.startAgain();
-  { list.add().text("k", "2"); }
+  list.startAgain({});
+  { list.add().write(rowA, 2); }
   EXPECT_EQ(list.entries().at(0).dictionary(), before);
-  EXPECT_EQ(*before->get("k").string(), "2");
+  EXPECT_EQ(*before->get("a").string(), "2");
 }
 
 TEST(RowList, LeavesADictionaryAloneThatSomebodyElseHolds) {
   RowList list;
-  { list.add().text("k", "1"); }
+  { list.add().write(rowA, 1); }
   const PlistValue held = list.entries().at(0);
-  list.startAgain();
-  { list.add().text("k", "2"); }
-  EXPECT_EQ(*held.dictionary()->get("k").string(), "1");
+  list.startAgain({});
+  { list.add().write(rowA, 2); }
+  EXPECT_EQ(*held.dictionary()->get("a").string(), "1");
 }
 
 TEST(RowList, KeepsNoRowOfTheLastRound) {
   RowList list;
   {
     RowWriter row = list.add();
-    row.text("a", "1");
-    row.text("b", "2");
+    row.write(rowA, 1);
+    row.write(rowB, 2);
   }
-  list.startAgain();
-  { list.add().text("a", "3"); }
+  list.startAgain({});
+  { list.add().write(rowA, 3); }
   EXPECT_EQ(list.entries().at(0), PlistValue(PlistDictionary::make({{"a", "3"}})));
 }
 

@@ -22,8 +22,9 @@ class Recorder : public Base {
   using Base::Base;
   std::string_view getSectionName() const override { return "Recorded"; }
   std::span<const LogCode> getLogCodeArray() const override { return wantedCodes; }
-  void updateWithData(RecordView view, LogCode logCode) override {
+  Outcome updateWithData(RecordView view, LogCode logCode) override {
     if (sectionRows()) sectionRows()->setText(std::to_string(logCode), std::to_string(view.size()));
+    return rowsOutcome();
   }
 };
 

@@ -242,7 +242,7 @@ TEST(C2KLogGenerator, WithoutATemplateRecordsAreKeptAndNothingIsShown) {
   EXPECT_EQ(*fixture.state.find("DisplayState")->data(), emptyActiveSet());
 }
 
-TEST(SetByLookup, StopsAtAnEntryThatIsNotWhole) {
+TEST(EachLeaf, StopsAtAnEntryThatIsNotWhole) {
   const auto first = PlistDictionary::make();
   const auto last = PlistDictionary::make();
   const PlistDictionary lookup{
@@ -250,9 +250,10 @@ TEST(SetByLookup, StopsAtAnEntryThatIsNotWhole) {
                                  PlistDictionary::make({{"key", 7}, {"dict", last}}),
                                  PlistDictionary::make({{"key", "leaf"}, {"dict", last}})})},
       {"no list", "text"}};
-  setByLookup("name", "value", lookup);
-  setByLookup("no list", "value", lookup);
-  setByLookup("no such name", "value", lookup);
+  const auto fill = [](PlistDictionary& display, const std::string& key) { display.set(key, "value"); };
+  forEachLeaf("name", lookup, fill);
+  forEachLeaf("no list", lookup, fill);
+  forEachLeaf("no such name", lookup, fill);
   EXPECT_EQ(test::asText(first), "leaf=value\n");
   EXPECT_TRUE(last->empty());
 }

@@ -12,14 +12,9 @@ namespace {
 constexpr std::array layout{Field{.name = "raw", .byte = 0, .width = 16}};
 
 std::string shown(const Scale& scale, unsigned raw) {
-  const Row row{.key = "k", .unit = " dBm", .scale = scale};
+  const Row row{.key = "k", .quantity = quantity::rsrp, .unit = " dBm", .scale = scale};
   const Bytes bytes{static_cast<std::uint8_t>(raw), static_cast<std::uint8_t>(raw >> 8)};
-  PlistDictionary rows;
-  {
-    RowWriter writer(rows);
-    show(RecordView(bytes), layout, std::span(&row, 1), writer);
-  }
-  return *rows.get("k").string();
+  return textOf(row, rawOf(RecordView(bytes), layout, row));
 }
 
 std::string byPrintf(double factor, double offset, unsigned raw) {

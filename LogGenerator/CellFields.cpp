@@ -1,0 +1,31 @@
+#include "LogGenerator/CellFields.h"
+
+namespace kelvasi {
+
+CellIdentity cellOf(const CellFields& fields, RecordView record, RecordView entry) {
+  CellIdentity cell{.family = fields.family};
+  if (fields.channel) cell.channel = valueOf(entry, *fields.channel);
+  if (fields.headChannel) cell.channel = valueOf(record, *fields.headChannel);
+  if (fields.code) cell.code = valueOf(entry, *fields.code);
+  return cell;
+}
+
+CellIdentity servingCellOf(const CellFields& fields, RecordView record, LogCode logCode,
+                           ServingCells& cells) {
+  CellIdentity cell = cellOf(fields, record, record);
+  const bool saysOne = fields.channel || fields.code || fields.cellId;
+  if (!fields.isServing) return saysOne ? cell : CellIdentity{};
+  if (saysOne) {
+    const auto cellId = fields.cellId ? std::optional(valueOf(record, *fields.cellId)) : std::nullopt;
+    cells.say(logCode, {.cell = cell, .cellId = cellId});
+  }
+  if (cell.isWhole()) return cell;
+  for (std::size_t place = 0; fields.others && place < countOf(record, *fields.others); ++place) {
+    const RecordView other = entryOf(record, *fields.others, place);
+    cells.deny({.family = fields.family, .channel = valueOf(other, *fields.otherChannel)});
+  }
+  const CellIdentity certain = cells.certain(fields.family);
+  return certain || !saysOne ? certain : cell;
+}
+
+}  // namespace kelvasi
