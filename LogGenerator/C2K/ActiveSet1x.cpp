@@ -43,12 +43,12 @@ struct EnergyScale {
 
 }  // namespace
 
-PilotList activeSet1x(RecordView subPacket, std::int64_t channel) {
+PilotList activeSet1x(RecordView subPacket, std::int64_t channel, bool isGathered) {
   const EnergyScale scale(subPacket);
   const std::int64_t count = valueOf(subPacket, fieldIn(activeSetLayout, "count"));
   const std::int64_t fingers = valueOf(subPacket, fieldIn(activeSetLayout, "fingers"));
   const std::int64_t reference = valueOf(subPacket, fieldIn(activeSetLayout, "reference PN offset"));
-  PilotList pilots(RadioFamily::cdma);
+  PilotList pilots(RadioFamily::cdma, isGathered);
   for (std::size_t place = 0; place < static_cast<std::size_t>(count); ++place) {
     const RecordView pilot = subPacket.from(pilotStride(fingers) * place);
     const std::int64_t offset = valueOf(pilot, fieldIn(pilotLayout, "PN offset"));

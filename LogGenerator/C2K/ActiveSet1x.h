@@ -7,7 +7,7 @@
 namespace kelvasi {
 
 // The list of the active-set sub-packet; without pilots it is empty, never "(none)". `channel` is theirs.
-PilotList activeSet1x(RecordView subPacket, std::int64_t channel);
+PilotList activeSet1x(RecordView subPacket, std::int64_t channel, bool isGathered);
 
 // The cell of the reference pilot; none without pilots.
 CellIdentity referenceCell(RecordView subPacket, std::int64_t channel);

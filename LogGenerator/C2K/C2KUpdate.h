@@ -40,6 +40,7 @@ struct C2KUpdate {
     const PlistValue extraInfo = state.get("ExtraInfo");
     if (extraInfo.dictionary()) extraInfo.dictionary()->set(key, std::move(value));
   }
+  bool isGathered() const { return readings != nullptr; }
   unsigned length() const { return static_cast<unsigned>(record.size()); }
 
  private:

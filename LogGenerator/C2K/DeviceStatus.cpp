@@ -104,7 +104,7 @@ Outcome parseDeviceStatus(const C2KUpdate& update) {
   if (update.readings && serving) update.readings->servingCells().say(logCode, {.cell = serving});
   show(update, *state, stateLayout, stateRows);
   showRadio(update, *radio, isTraffic, serving);
-  update.write(activeSetRow, activeSet1x(*activeSet, channel));
+  update.write(activeSetRow, activeSet1x(*activeSet, channel, update.isGathered()));
   if (!isTraffic) showOldErrorRate(update);
   return Outcome::shown;
 }

@@ -28,7 +28,7 @@ Outcome parseEvdoActiveSet(const C2KUpdate& update) {
                      update.length(), static_cast<int>(count));
     return Outcome::tooShort;
   }
-  PilotList pilots(RadioFamily::evdo);
+  PilotList pilots(RadioFamily::evdo, update.isGathered());
   for (std::size_t place = 0; place < count; ++place) {
     const RecordView pilot = update.record.from(firstPilot + pilotSize * place);
     pilots.add(place, valueOf(pilot, fieldIn(pilotLayout, "PN offset")), pilotRow,

@@ -30,7 +30,7 @@ Outcome parseFingers(const C2KUpdate& update) {
                      update.length(), static_cast<int>(count), static_cast<unsigned long>(minimumLength));
     return Outcome::notUnderstood;
   }
-  PilotList pilots(RadioFamily::cdma);
+  PilotList pilots(RadioFamily::cdma, update.isGathered());
   for (std::size_t place = 0; place < count; ++place) {
     const RecordView finger = update.record.from(firstFinger + fingerSize * place);
     const std::int64_t pilot = valueOf(finger, fieldIn(fingerLayout, "PN offset"));

@@ -15,12 +15,15 @@ constexpr Row mark{.key = sortedMark,
 
 }  // namespace
 
-PilotList::PilotList(RadioFamily family)
-    : family_(family), list_(PlistDictionary::make({{std::string(sortedMark), PlistValue(sortedMark)}})) {}
+PilotList::PilotList(RadioFamily family, bool isGathered)
+    : family_(family),
+      isGathered_(isGathered),
+      list_(PlistDictionary::make({{std::string(sortedMark), PlistValue(sortedMark)}})) {}
 
 void PilotList::add(std::size_t place, std::int64_t pilot, const Row& row, std::int64_t raw,
                     std::int64_t channel) {
   list_->set(std::to_string(place) + ";" + std::to_string(pilot), deferredText(row, raw));
+  if (!isGathered_) return;
   pilots_.push_back({&row, raw, {family_, channel, pilot == noPilot ? CellIdentity::unknown : pilot}});
 }
 

@@ -11,12 +11,13 @@ namespace kelvasi {
 
 class PilotList {
  public:
-  explicit PilotList(RadioFamily family);
+  // `isGathered`: somebody listens, and readings() will be asked for.
+  PilotList(RadioFamily family, bool isGathered);
 
   // `row` lasts as long as the process.
   void add(std::size_t place, std::int64_t pilot, const Row& row, std::int64_t raw,
            std::int64_t channel = CellIdentity::unknown);
-  bool empty() const { return pilots_.empty(); }
+  bool empty() const { return list_->size() == 1; }  // there is always the mark
   RadioFamily family() const { return family_; }
 
   PlistValue list() const { return list_; }
@@ -31,8 +32,9 @@ class PilotList {
   };
 
   RadioFamily family_;
+  bool isGathered_;
   PlistValue::Dictionary list_;
-  std::vector<Pilot> pilots_;  // in the order of the list
+  std::vector<Pilot> pilots_;  // in the order of the list, where they are gathered
 };
 
 }  // namespace kelvasi
