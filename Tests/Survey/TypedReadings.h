@@ -41,10 +41,7 @@ class Message {
  private:
   Message& add(const ReadingSection& section, const CellIdentity& cell, const Quantity& quantity,
                std::int64_t raw, std::int32_t entry, std::span<const std::string_view> texts = {}) {
-    Row& row = rows_.emplace_back();
-    row.key = quantity.id;
-    row.quantity = quantity;
-    row.texts = texts;
+    const Row& row = rows_.emplace_back(Row{.key = quantity.id, .quantity = quantity, .texts = texts});
     Reading reading;
     reading.entry = entry;
     reading.section = &section;
