@@ -58,7 +58,7 @@ void CaptureReader::skip(CaptureFault message) {
 
 std::unique_ptr<CaptureReader> openCapture(const std::string& path, const PlistSerialiser& plists) {
   auto input = std::make_unique<InputBytes>(path);
-  if (isDlf(bareName(path), *input)) return std::make_unique<DlfReader>(*input);
+  if (isDlf(bareName(path), *input)) return std::make_unique<DlfReader>(std::move(input));
   if (isSnapshot(bareName(path), *input)) return std::make_unique<SnapshotReader>(*input, plists);
   return std::make_unique<PcapReader>(std::move(input));
 }

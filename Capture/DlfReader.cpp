@@ -4,8 +4,6 @@
 #include <utility>
 
 #include "Capture/PlistBeginning.h"
-#include "LogGenerator/RecordView.h"
-
 namespace kelvasi {
 
 namespace {
@@ -26,54 +24,73 @@ nanoseconds fromSystemTime(std::uint64_t stamp) {
   return systemTimeBegin + std::chrono::seconds(second) + nanoseconds(fraction);
 }
 
+// Further than this nobody looks for the first stamp.
+constexpr std::size_t mostLookedThrough = std::size_t{16} << 20;
+
 }  // namespace
 
-DlfReader::DlfReader(InputBytes& input)
-    : name_(input.name()), file_(input.readToEnd(largestFile, "a DLF file")) {
-  fault_ = input.fault();
-  if (!fault_) findRecords();
+DlfReader::DlfReader(std::unique_ptr<InputBytes> input)
+    : name_(input->name()), input_(std::move(input)), bytes_(input_->bytes()), records_(bytes_) {
+  begin();
 }
 
-DlfReader::DlfReader(std::string name, Bytes file) : name_(std::move(name)), file_(std::move(file)) {
-  findRecords();
+DlfReader::DlfReader(std::string name, Bytes file)
+    : name_(std::move(name)), held_(std::move(file)), bytes_(*held_), records_(bytes_) {
+  begin();
 }
 
-void DlfReader::findRecords() {
-  records_ = findDlfRecords(file_);
-  const std::size_t end = records_.empty() ? 0 : records_.back().end;
-  if (end < file_.size()) faultAtEnd_ = CaptureFault{name_, end, "no whole DLF record begins here"};
-  if (!records_.empty() && isVersionReport(records_.front())) nextRecord_ = 1;
-  for (std::size_t at = nextRecord_; at < records_.size(); ++at) {
-    const auto stamp = stampOf(records_[at]);
+void DlfReader::begin() {
+  records_.findMore();
+  if (!records_.found().empty() && isVersionReport(records_.found().front())) records_.take();
+  while (!findFirstStamp() && records_.held() < mostLookedThrough && records_.findMore()) {
+  }
+}
+
+bool DlfReader::findFirstStamp() {
+  for (const DlfRecordPlace& place : records_.found()) {
+    const auto stamp = stampOf(place);
     if (!stamp) continue;
     time_ = *stamp;
-    break;
+    return true;
   }
+  return false;
 }
 
 std::optional<CapturedMessage> DlfReader::next() {
-  if (nextRecord_ == records_.size()) {
-    if (faultAtEnd_) fault_ = std::exchange(faultAtEnd_, std::nullopt);
+  if (records_.found().empty() && !records_.findMore()) {
+    end();
     return std::nullopt;
   }
-  const DlfRecordPlace& place = records_[nextRecord_++];
+  const DlfRecordPlace place = records_.take();
   time_ = stampOf(place).value_or(time_);
   return CapturedMessage{.bytes = messageOf(place), .arrival = time_};
 }
 
+void DlfReader::end() {
+  fault_ = bytes_.fault();
+  if (fault_) return;
+  if (records_.bytesRead() == 0) fault_ = CaptureFault{name_, 0, "an empty file"};
+  if (records_.end() < records_.bytesRead())
+    fault_ = CaptureFault{name_, records_.end(), "no whole DLF record begins here"};
+}
+
+RecordView DlfReader::recordAt(const DlfRecordPlace& place) const {
+  return RecordView(records_.bytes(place.record, place.end));
+}
+
 bool DlfReader::isVersionReport(const DlfRecordPlace& place) const {
-  return RecordView(file_).u16(place.record + logCodeOffset) == versionReportLogCode;
+  return recordAt(place).u16(logCodeOffset) == versionReportLogCode;
 }
 
 std::optional<nanoseconds> DlfReader::stampOf(const DlfRecordPlace& place) const {
-  const RecordView stamp = RecordView(file_).from(place.record + stampOffset);
+  const RecordView stamp = recordAt(place).from(stampOffset);
   const std::uint64_t value = stamp.u32(0) | std::uint64_t{stamp.u32(4)} << 32;
   return value == 0 ? std::nullopt : std::optional(fromSystemTime(value));
 }
 
 std::span<const std::uint8_t> DlfReader::messageOf(const DlfRecordPlace& place) {
-  const auto whole = std::span<const std::uint8_t>(file_).subspan(place.begin, place.end - place.begin);
-  const std::size_t lead = place.record - place.begin;
+  const auto whole = records_.bytes(place.begin, place.end);
+  const std::uint64_t lead = place.record - place.begin;
   if (lead == 2) return whole.subspan(1);  // what is left of a prefix
   if (lead != 0) return whole;
   typed_.assign(1, beginsAsPlist(whole.subspan(dlfRecordHeaderSize)) ? 0xFF : 0x01);

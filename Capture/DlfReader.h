@@ -6,42 +6,46 @@
 // - The time stamp is taken for CDMA system time as 3GPP2 C.S0002 has it: since 6 January 1980, the upper 48
 //   bits in units of 1.25 ms, the lower 16 a fraction of that; leap seconds are not taken off. A record
 //   without a stamp has the time of the one before; at the beginning of the file, that of the first stamp, or
-//   1970 where there is no stamp at all.
+//   1970 where there is none in the first 16 MiB.
 // - Records are found by their lengths, so a message whose length field is wrong ends what can be read of a
 //   snapshot's DLF file.
 #pragma once
 
-#include <vector>
+#include <memory>
+#include <optional>
+#include <string>
 
 #include "Capture/CaptureReader.h"
 #include "Capture/DlfRecords.h"
+#include "Capture/HeldBytes.h"
 #include "Capture/InputBytes.h"
-#include "Plist/PlistValue.h"
+#include "LogGenerator/RecordView.h"
 
 namespace kelvasi {
 
 class DlfReader : public CaptureReader {
  public:
-  static constexpr std::size_t largestFile = std::size_t{256} << 20;
-
-  // Reads the whole input; a larger one than `largestFile` is a fault.
-  explicit DlfReader(InputBytes& input);
+  explicit DlfReader(std::unique_ptr<InputBytes> input);
   // `name` stands for the file in a fault.
   DlfReader(std::string name, Bytes file);
 
   std::optional<CapturedMessage> next() override;
+  std::uint64_t filePosition() const override { return input_ ? input_->filePosition() : 0; }
 
  private:
-  void findRecords();
+  void begin();
+  bool findFirstStamp();
+  void end();
+  RecordView recordAt(const DlfRecordPlace& place) const;
   bool isVersionReport(const DlfRecordPlace& place) const;
   std::optional<std::chrono::nanoseconds> stampOf(const DlfRecordPlace& place) const;
   std::span<const std::uint8_t> messageOf(const DlfRecordPlace& place);
 
   std::string name_;
-  Bytes file_;
-  std::vector<DlfRecordPlace> records_;
-  std::size_t nextRecord_ = 0;
-  std::optional<CaptureFault> faultAtEnd_;
+  std::unique_ptr<InputBytes> input_;  // null when the file is held
+  std::optional<HeldBytes> held_;
+  ByteSource& bytes_;  // of one of the two
+  DlfRecordFinder records_;
   std::chrono::nanoseconds time_{0};  // of the record last read
   Bytes typed_;                       // a record with the log type that it lacked
 };

@@ -26,6 +26,7 @@ class InputBytes {
   // For the places in what the input holds: "drive.pcap", of a packed file "drive.pcap.gz, unpacked".
   std::string name() const;
   const std::optional<CaptureFault>& fault() const { return fault_ ? fault_ : content().fault(); }
+  ByteSource& bytes() { return content(); }
   // As PeekedBytes has it.
   std::span<const std::uint8_t> firstBytes(std::size_t count) { return content().firstBytes(count); }
   // In what the input holds.

@@ -7,7 +7,9 @@ import plistlib
 import pty
 import signal
 import stat
+import struct
 import subprocess
+import sys
 import time
 import unittest
 
@@ -248,6 +250,47 @@ class ProgressLine(KelvasictlTest):
         os.close(writing)
         with os.fdopen(reading, "rb") as pipe:
             self.assertRegex(pipe.read(), rb"\Akelvasictl: standard input: byte \d+: truncated.*\n\Z")
+
+
+@unittest.skipIf(os.environ.get("KELVASI_SANITIZE"), "sanitizers keep memory back")
+class Memory(KelvasictlTest):
+    """Does not grow with the capture."""
+
+    PAYLOAD = bytes(range(256))
+
+    def messages(self, count):
+        """A hundred a second, for what came in one interval is kept."""
+        for number in range(count):
+            stamp = (1_393_682_829 * 800 + number * 8) << 16  # units of 1.25 ms since 1980
+            yield number / 100, record(0x7199, self.PAYLOAD, stamp=struct.pack("<Q", stamp))
+
+    # A process begins with the size of the one that it was forked from, so that has to be a small one.
+    MEASURE = ("import resource, subprocess, sys; subprocess.run(sys.argv[1:], check=True, stdout=subprocess.DEVNULL); "
+               "print(resource.getrusage(resource.RUSAGE_CHILDREN).ru_maxrss)")
+
+    def decode_kilobytes(self, path):
+        decode = [PROGRAM, "decode", "--technology", "Orvane_GSM", "--resources", TEMPLATES, path]
+        result = subprocess.run([sys.executable, "-c", self.MEASURE, *decode], env=self.environment,
+                                stdout=subprocess.PIPE, stderr=subprocess.DEVNULL, timeout=60, check=True)
+        return int(result.stdout)
+
+    def assert_steady(self, name, contents):
+        sizes = []
+        for count in (40_000, 120_000):
+            sizes.append(self.decode_kilobytes(self.write(name, contents(self.messages(count)))))
+        self.assertLess(sizes[1] - sizes[0], 6_000, sizes)  # of more than 20 MB more to read
+
+    def test_of_pcap(self):
+        self.assert_steady("a.pcap", lambda messages: pcap(*messages))
+
+    def test_of_gzip(self):
+        self.assert_steady("a.pcap.gz", lambda messages: gzip.compress(pcap(*messages), 1))
+
+    def test_of_dlf_without_log_types(self):
+        self.assert_steady("plain.dlf", lambda messages: b"".join(message[1:] for _, message in messages))
+
+    def test_of_dlf_with_log_types(self):
+        self.assert_steady("typed.dlf", lambda messages: b"".join(message for _, message in messages))
 
 
 class Technology(KelvasictlTest):
