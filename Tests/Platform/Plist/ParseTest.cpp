@@ -126,7 +126,7 @@ TEST(Parse, PaddingBehindAnXmlDocumentIsForgiven) {
 
 TEST(Parse, PaddingBehindABinaryDocumentIsForgiven) {
   const Bytes document = BinaryDocument().addText("hi").bytes();
-  for (const std::uint8_t padding : {'\0', ' ', '\n', '\r', '\t'}) {
+  for (const std::uint8_t padding : Bytes{'\0', ' ', '\n', '\r', '\t'}) {
     Bytes padded = document;
     for (int count = 1; count <= 40; ++count) {
       padded.push_back(padding);

@@ -130,7 +130,7 @@ TEST_F(FilesTest, AReplacementThatFailsLeavesTheOldFileAndNothingElse) {
 }
 
 TEST_F(FilesTest, FilesAreTheirOwnersAloneWhateverTheUmask) {
-  for (const mode_t mask : {0000, 0022, 0277, 0777}) {
+  for (const mode_t mask : {0000u, 0022u, 0277u, 0777u}) {
     const Umask umask(mask);
     for (const std::string& name : {directory.file("new"), path, path}) {
       EXPECT_EQ(replaceFile(name, Bytes{1}), std::nullopt);

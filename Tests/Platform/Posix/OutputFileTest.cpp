@@ -21,7 +21,7 @@ struct OutputFileTest : ::testing::Test {
 };
 
 TEST_F(OutputFileTest, IsItsOwnersAloneWhateverTheUmask) {
-  for (const mode_t mask : {0000, 0777}) {
+  for (const mode_t mask : {0000u, 0777u}) {
     for (const Existing existing : {Existing::stays, Existing::isReplaced, Existing::isReplaced}) {
       const Umask umask(mask);
       OutputFile file(path, existing);

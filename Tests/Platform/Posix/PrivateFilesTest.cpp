@@ -18,7 +18,7 @@ TEST(PrivateFiles, FoldersAreTheirOwnersAloneWhateverTheUmask) {
   const TemporaryDirectory directory;
   std::filesystem::create_directory(directory.file("there"));
   std::filesystem::permissions(directory.file("there"), std::filesystem::perms(0755));
-  for (const mode_t mask : {0000, 0022, 0377}) {
+  for (const mode_t mask : {0000u, 0022u, 0377u}) {
     const Umask umask(mask);
     makeFolders(directory.path() / "there" / "new" / "newer");
     EXPECT_EQ(permissionsOf(directory.file("there")), std::filesystem::perms(0755));
