@@ -7,10 +7,8 @@ namespace kelvasi::survey {
 
 namespace {
 
-// Whether the value speaks of the handset where it is: of its serving cell, or of no cell at all.
-bool isOfServing(const SeenCell* cell, const SeenCell* serving, const Reading& reading) {
-  if (cell) return cell == serving;
-  return reading.entry == Reading::notInList && reading.element == Reading::notInList;
+bool isInList(const Reading& reading) {
+  return reading.entry != Reading::notInList || reading.element != Reading::notInList;
 }
 
 }  // namespace
@@ -48,9 +46,10 @@ void Survey::pass(Arrival time) {
 void Survey::measured(const SeenCell* cell, const Reading& reading, double value) {
   const Quantity* quantity = quantityOf(reading);
   if (series_) series_->add({cell ? cell->number : 0, quantity}, now_, static_cast<float>(value));
-  const SeenCell* serving = cells_.serving();
-  if (isOfServing(cell, serving, reading))
-    alarms_.value(*quantity, now_, value, serving ? serving->identity : CellIdentity());
+  // Alarms are about the handset where it is: its serving cell, and what is of no cell at all.
+  if (cell ? !cells_.isServing(*cell) : isInList(reading)) return;
+  const SeenCell* whose = cell ? cell : cells_.serving();
+  alarms_.value(*quantity, now_, value, whose ? whose->identity : CellIdentity());
 }
 
 void Survey::happened(const Event& event) {

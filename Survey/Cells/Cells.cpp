@@ -27,11 +27,27 @@ bool isInList(const Reading& reading) {
   return reading.entry != Reading::notInList || reading.element != Reading::notInList;
 }
 
+// The sections of CDMA hold all sorts of rows; there a row itself tells: a pilot of the active set by its
+// Ec/Io, the serving cell by its channel or PN offset.
+CellRole roleOf(const Reading& reading, const Quantity& quantity) {
+  const CellRole role = reading.section ? reading.section->role : CellRole::none;
+  const RadioFamily family = reading.cell.family;
+  if (role != CellRole::none || (family != RadioFamily::cdma && family != RadioFamily::evdo)) return role;
+  if (&quantity == &quantity::ecio) return CellRole::active;
+  return quantity.kind == QuantityKind::identity ? CellRole::serving : CellRole::none;
+}
+
 // Whether the reading says which cell serves: it is the channel, the code or the name of that cell.
 bool namesServingCell(const Reading& reading, const Quantity& quantity, double number) {
-  if (!reading.section || reading.section->role != CellRole::serving || !reading.cell) return false;
+  if (!reading.cell || roleOf(reading, quantity) != CellRole::serving) return false;
   const auto whole = static_cast<std::int64_t>(number);
   return whole == reading.cell.channel || whole == reading.cell.code || &quantity == &quantity::cellId;
+}
+
+// 1x and EV-DO serve side by side.
+std::size_t airInterfaceOf(RadioFamily family) {
+  if (family == RadioFamily::cdma) return 1;
+  return family == RadioFamily::evdo ? 2 : 0;
 }
 
 }  // namespace
@@ -79,14 +95,14 @@ void Cells::learn(const Naming& naming, Arrival time) {
 
 void Cells::serve(std::size_t cell, Arrival time) {
   const SeenCell& now = cells_[cell];
-  const SeenCell* before = serving();
-  servingTime_ = time;
+  lastServing_ = airInterfaceOf(now.identity.family);
+  Serving& serving = servings_[lastServing_];
+  const SeenCell* before = cellOf(serving);
+  serving = {cell, now.number, time};
   if (before == &now) return;
-  serving_ = {cell, now.number};
   // The same cell, of which more or less was said.
-  if (before && canBeSame(before->identity, now.identity) &&
-      !(before->identity.isWhole() && now.identity.isWhole()))
-    return;
+  const bool areWhole = before && before->identity.isWhole() && now.identity.isWhole();
+  if (before && !areWhole && canBeSame(before->identity, now.identity)) return;
   if (onServing_) onServing_(before, now, time);
 }
 
@@ -96,7 +112,7 @@ void Cells::measure(const Reading& reading, Arrival time) {
   std::optional<std::size_t> cell;
   if (reading.cell) {
     cell = cellFor(reading.cell, time);
-    mention(*cell, reading.section ? reading.section->role : CellRole::none, time);
+    mention(*cell, roleOf(reading, *quantity), time);
   }
   if (quantity->kind != QuantityKind::measurement) return;
   const auto number = numberOf(reading);
@@ -108,7 +124,7 @@ void Cells::measure(const Reading& reading, Arrival time) {
 void Cells::mention(std::size_t cell, CellRole role, Arrival time) {
   SeenCell& seen = cells_[cell];
   // Lists of neighbours may hold the serving cell too.
-  if (role == CellRole::neighbour && serving_.number == seen.number) role = CellRole::serving;
+  if (role == CellRole::neighbour && isServing(seen)) role = CellRole::serving;
   if (role != CellRole::none) seen.role = role;
   seen.roles.add(role);
   seen.last = std::max(seen.last, time);
@@ -117,8 +133,21 @@ void Cells::mention(std::size_t cell, CellRole role, Arrival time) {
 }
 
 const SeenCell* Cells::serving() const {
-  if (serving_.number == 0 || cells_[serving_.cell].number != serving_.number) return nullptr;
-  return &cells_[serving_.cell];
+  return cellOf(servings_[lastServing_]);
+}
+
+const SeenCell* Cells::serving(RadioFamily family) const {
+  return cellOf(servings_[airInterfaceOf(family)]);
+}
+
+bool Cells::isServing(const SeenCell& cell) const {
+  return std::ranges::any_of(servings_,
+                             [&](const Serving& serving) { return serving.number == cell.number; });
+}
+
+const SeenCell* Cells::cellOf(const Serving& serving) const {
+  if (serving.number == 0 || cells_[serving.cell].number != serving.number) return nullptr;
+  return &cells_[serving.cell];
 }
 
 const SeenCell* Cells::find(std::uint32_t number) const {
@@ -220,6 +249,16 @@ std::size_t Cells::room() {
   return cell;
 }
 
+void Cells::takeServing(const Cells& other, const SeenCell& there, std::size_t here) {
+  for (std::size_t at = 0; at < servings_.size(); ++at) {
+    const Serving& serving = other.servings_[at];
+    if (serving.number != there.number || (servings_[at].number != 0 && serving.time < servings_[at].time))
+      continue;
+    servings_[at] = {here, cells_[here].number, serving.time};
+    if (serving.time >= servings_[lastServing_].time) lastServing_ = at;
+  }
+}
+
 std::optional<std::size_t> Cells::sameAs(const SeenCell& other) const {
   for (std::size_t cell = 0; cell < cells_.size(); ++cell) {
     if (cells_[cell].identity == other.identity && !cells_[cell].names.contradicts(other.names)) return cell;
@@ -233,11 +272,7 @@ void Cells::merge(const Cells& other, const OnMerged& onMerged) {
     const std::size_t cell = same ? *same : add(there.identity, there.first);
     cells_[cell].merge(there);
     if (onMerged) onMerged(there.number, cells_[cell].number);
-    if (other.serving_.number == there.number &&
-        (serving_.number == 0 || other.servingTime_ >= servingTime_)) {
-      serving_ = {cell, cells_[cell].number};
-      servingTime_ = other.servingTime_;
-    }
+    takeServing(other, there, cell);
   }
   dropped_ += other.dropped_;
 }

@@ -8,6 +8,7 @@
 // Bounded: past the most cells the one that was heard of longest ago makes way and is counted.
 #pragma once
 
+#include <array>
 #include <chrono>
 #include <cstddef>
 #include <cstdint>
@@ -35,9 +36,14 @@ class Cells {
   // The readings of one message.
   void take(const Readings& readings);
 
-  // The cell that records named as the serving one last; when they did is for the asker to weigh.
+  // The cell that records named as the serving one last; when they did is for the asker to weigh. A CDMA
+  // handset may have two, one for each air interface: this is the one that was named last.
   const SeenCell* serving() const;
-  Arrival servingTime() const { return servingTime_; }
+  // Of the air interface that this family is of.
+  const SeenCell* serving(RadioFamily family) const;
+  Arrival servingTime() const { return servings_[lastServing_].time; }
+  // Whether it is a serving cell, of whichever air interface.
+  bool isServing(const SeenCell& cell) const;
   const SeenCell* find(std::uint32_t number) const;
 
   // In no order.
@@ -74,6 +80,7 @@ class Cells {
   std::size_t add(const CellIdentity& identity, Arrival time);
   std::size_t room();
   void setIdentity(std::size_t cell, const CellIdentity& identity);
+  void takeServing(const Cells& other, const SeenCell& there, std::size_t here);
   std::optional<std::size_t> sameAs(const SeenCell& other) const;
   bool isFresh(std::size_t cell, Arrival time) const;
 
@@ -83,13 +90,16 @@ class Cells {
   std::vector<SeenCell> cells_;
   std::vector<std::uint64_t> mentioned_;  // by cell: the message that spoke of it last
   std::vector<Place> index_;              // by identity; the latest cell of each
-  struct Known {
+  struct Serving {
     std::size_t cell = 0;
     std::uint32_t number = 0;  // 0: none
+    Arrival time{0};           // when it was named last
   };
-  Known serving_;
-  Arrival servingTime_{0};
-  CellIdentity lastAsked_;  // in the message at hand; most readings ask for the same cell again
+  const SeenCell* cellOf(const Serving& serving) const;
+
+  std::array<Serving, 3> servings_;  // of 3GPP's technologies together, of 1x and of EV-DO
+  std::size_t lastServing_ = 0;      // the one that was named last
+  CellIdentity lastAsked_;           // in the message at hand; most readings ask for the same cell again
   std::size_t lastFound_ = 0;
   std::uint64_t message_ = 0;
   std::uint32_t lastNumber_ = 0;

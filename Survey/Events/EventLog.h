@@ -21,9 +21,10 @@ class EventLog {
       events_.push_back(std::move(event));
       return;
     }
+    ++dropped_;
+    if (most_ == 0) return;
     events_[oldest_] = std::move(event);
     oldest_ = (oldest_ + 1) % most_;
-    ++dropped_;
   }
 
   std::size_t size() const { return events_.size(); }

@@ -222,6 +222,26 @@ TEST(Cells, EachChangeOfTheServingCellIsToldOnce) {
   EXPECT_EQ(cells.servingTime(), noon + 4s);
 }
 
+// Each air interface of a CDMA handset has a cell of its own.
+TEST(Cells, TwoAirInterfacesServeSideBySide) {
+  int changes = 0;
+  Cells cells({}, [&](const SeenCell*, const SeenCell&, Arrival) { ++changes; });
+  const CellIdentity voice{RadioFamily::cdma, 384, 12};
+  const CellIdentity data{RadioFamily::evdo, 507, 24};
+  for (int second = 0; second < 10; second += 2) {
+    cells.take(Message(second * 1s).serving(voice, quantity::cdmaChannel, 384));
+    cells.take(Message((second + 1) * 1s).serving(data, quantity::pnOffset, 24));
+  }
+  EXPECT_EQ(changes, 2);  // the first of each
+  EXPECT_TRUE(cells.isServing(onlyCell(cells, voice)));
+  EXPECT_TRUE(cells.isServing(onlyCell(cells, data)));
+  EXPECT_EQ(cells.serving()->identity, data);
+  cells.take(Message(20s).serving({RadioFamily::cdma, 384, 36}, quantity::pnOffset, 36));
+  EXPECT_EQ(changes, 3);
+  EXPECT_FALSE(cells.isServing(onlyCell(cells, voice)));
+  EXPECT_TRUE(cells.isServing(onlyCell(cells, data)));
+}
+
 // Many kinds of record have a serving section; only one that names the cell says where the handset is.
 TEST(Cells, AStateOfTheOldCellIsNoWayBack) {
   Cells cells;

@@ -20,6 +20,13 @@ TEST(EventLog, KeepsTheNewestAndCountsTheRest) {
   EXPECT_EQ(log.dropped(), 2U);
 }
 
+TEST(EventLog, MayKeepNone) {
+  EventLog log(0);
+  log.add(numbered(1));
+  EXPECT_EQ(log.size(), 0U);
+  EXPECT_EQ(log.dropped(), 1U);
+}
+
 TEST(EventLog, AnEmptyLogIsEmpty) {
   EXPECT_EQ(EventLog().size(), 0U);
 }
