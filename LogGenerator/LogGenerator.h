@@ -59,6 +59,8 @@ class LogGenerator {
   virtual void gatherInto(Readings* readings) { readings_ = readings; }
   // What became of the messages so far.
   const Intake& intake() const { return intake_; }
+  // Goes on counting where another generator of the technology has left off.
+  void continueIntake(Intake intake) { intake_ = std::move(intake); }
 
   // The generator for what the daemon calls the technology; null for one that is not known.
   static std::unique_ptr<LogGenerator> generatorFromTechnology(std::string_view technology,

@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "Platform/Clock.h"
 #include "Platform/SystemLog.h"
 
 namespace kelvasi {
@@ -20,9 +21,16 @@ void KelvasiModel::updateWithData(std::span<const std::uint8_t> data) noexcept {
   if (messageHandler_) {
     messageHandler_(data);
   } else if (logGenerator_) {
+    logGenerator_->setArrival(arrivalAt(platform_.clock.now()));
     logGenerator_->updateState(*state_, data);
+    if (readingsHandler_) readingsHandler_(readings_, logGenerator_->intake());
   }
   updated_ = true;
+}
+
+void KelvasiModel::gatherReadings(ReadingsHandler handler) {
+  readingsHandler_ = std::move(handler);
+  if (logGenerator_) logGenerator_->gatherInto(&readings_);
 }
 
 void KelvasiModel::refresh() {

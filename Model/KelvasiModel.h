@@ -8,6 +8,7 @@
 #include <span>
 
 #include "LogGenerator/LogGenerator.h"
+#include "LogGenerator/Readings.h"
 #include "Model/KelvasiModelNode.h"
 #include "Platform/MainQueue.h"
 #include "Platform/MessagePort.h"
@@ -21,6 +22,7 @@ class KelvasiModel {
   // Called from the main queue after each tick that saw new data.
   using ViewControllerUpdate = std::function<void()>;
   using MessageHandler = std::function<void(std::span<const std::uint8_t> message)>;
+  using ReadingsHandler = std::function<void(const Readings& readings, const Intake& intake)>;
   using StartCommandChange = std::function<PlistValue(PlistValue command)>;
 
   KelvasiModel(const Platform& platform, const LinkPlatform& link,
@@ -41,6 +43,8 @@ class KelvasiModel {
   void updateWithData(std::span<const std::uint8_t> data) noexcept;
   // From now on hands every log message that arrives to `handler`, as it came, instead of to the generator.
   void divertMessages(MessageHandler handler) { messageHandler_ = std::move(handler); }
+  // From now on tells what each log message said, once the generator has taken it in.
+  void gatherReadings(ReadingsHandler handler);
   // From now on a session begins with what `change` makes of the generator's start command.
   void changeStartCommand(StartCommandChange change) { startCommandChange_ = std::move(change); }
   // The display tick, every 2.0 s while the monitor runs.
@@ -61,11 +65,16 @@ class KelvasiModel {
   // Whether the tree last built shows what a generator of another technology has left. A session's records
   // have nowhere to go then.
   bool showsAnotherTechnology() const { return showsAnotherTechnology_; }
+  // The same for who wants to ask it after the session has another one.
+  std::shared_ptr<const LogGenerator> sharedLogGenerator() const { return logGenerator_; }
+  // What the daemon called the technology when it was asked last; empty before.
+  const std::string& technology() const { return technology_; }
 
  private:
   void retryMonitor();
   bool connectSendPort(const std::string& portName);
   std::optional<Bytes> askForTechnology();
+  void makeGenerator(const std::string& technology);
   bool sendStartCommand();
   void portWasInvalidated(const void* port);
   void lookWhoseDisplayItIs();
@@ -76,13 +85,16 @@ class KelvasiModel {
   LinkPlatform link_;
   ViewControllerUpdate updateViewControllerFromModel_;
   MessageHandler messageHandler_;  // empty: messages go to the generator
+  ReadingsHandler readingsHandler_;
+  Readings readings_;
   StartCommandChange startCommandChange_;
 
   std::unique_ptr<LocalPort> recvPort_;
   std::unique_ptr<RemotePort> sendPort_;
   std::unique_ptr<Timer> displayUpdateTimer_;  // the monitor counts as started while it exists
   bool updated_ = false;                       // data arrived since the last tick that consumed it
-  std::unique_ptr<LogGenerator> logGenerator_;
+  std::shared_ptr<LogGenerator> logGenerator_;
+  std::string technology_;
   PlistValue::Dictionary state_ = PlistDictionary::make();  // survives reconnections and changes of generator
   bool showsAnotherTechnology_ = false;
   NodeRef nodes_;  // set and dropped together with its index

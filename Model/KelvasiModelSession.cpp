@@ -119,9 +119,17 @@ void KelvasiModel::configureGenerator() {
     platform_.log.print(LogPriority::error, " ***** Reply to GetTechnology had no answer; cannot configure");
     return;
   }
-  logGenerator_ =
-      technology.string() ? LogGenerator::generatorFromTechnology(*technology.string(), platform_) : nullptr;
+  makeGenerator(technology.string() ? *technology.string() : std::string());
   platform_.log.print(LogPriority::error, "Got log generated: %p", static_cast<void*>(logGenerator_.get()));
+}
+
+void KelvasiModel::makeGenerator(const std::string& technology) {
+  auto generator = LogGenerator::generatorFromTechnology(technology, platform_);
+  if (generator && logGenerator_ && technology == technology_)
+    generator->continueIntake(logGenerator_->intake());
+  if (generator && readingsHandler_) generator->gatherInto(&readings_);
+  logGenerator_ = std::move(generator);
+  technology_ = technology;
 }
 
 std::optional<Bytes> KelvasiModel::askForTechnology() {

@@ -57,6 +57,40 @@ TEST_F(KelvasiModelTest, TheTreeStaysUntilTheNextTickThoughDataArrives) {
   EXPECT_EQ(stateShown(), "MM_CONNECTION_ACTIVE");
 }
 
+TEST_F(KelvasiModelTest, TellsWhatAMessageSaidAndWhenItCame) {
+  std::vector<std::string> told;
+  model.gatherReadings([&](const Readings& readings, const Intake& intake) {
+    for (const Reading& reading : readings.all()) told.push_back(textOf(reading).value_or("removed"));
+    EXPECT_EQ(readings.arrival(), 1709647629s);
+    EXPECT_EQ(intake.messages(), 1U);
+  });
+  model.startMonitor();
+  take(record(0x7131, "13", 16));
+  EXPECT_EQ(told, std::vector<std::string>{"MM_IDLE"});
+  EXPECT_EQ(model.technology(), kTelvonLogChannelTechnology_Orvane_GSM);
+}
+
+TEST_F(KelvasiModelTest, ReadingsMayBeAskedForLater) {
+  model.startMonitor();
+  take(record(0x7131, "13", 16));
+  std::size_t told = 0;
+  model.gatherReadings([&](const Readings& readings, const Intake&) { told += readings.all().size(); });
+  take(record(0x7131, "06", 16));
+  EXPECT_EQ(told, 1U);
+}
+
+TEST_F(KelvasiModelTest, MessagesAreCountedOnAfterANewSession) {
+  model.startMonitor();
+  take(record(0x7131, "13", 16));
+  model.restartMonitor();
+  take(record(0x7131, "13", 16));
+  ASSERT_TRUE(model.logGenerator());
+  EXPECT_EQ(model.logGenerator()->intake().messages(), 2U);
+  answerTechnology(kTelvonLogChannelTechnology_IFX);
+  model.restartMonitor();
+  EXPECT_EQ(model.logGenerator()->intake().messages(), 0U);
+}
+
 TEST_F(KelvasiModelTest, DataWithoutAGeneratorStillMarksTheModelUpdated) {
   model.updateWithData(record(0x7131, "13", 16));
   model.refresh();
