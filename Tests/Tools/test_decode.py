@@ -317,7 +317,8 @@ class Technology(KelvasictlTest):
         found = self.find(first, second)
         self.assertEqual(found.stderr.decode().splitlines(), [
             f"kelvasictl: {first}: Orvane_GSM",
-            f"kelvasictl: {second}: fits Orvane_LTE (2 of 2 messages) and Orvane_GSM (0); taken for Orvane_GSM"])
+            f"kelvasictl: {second}: fits Orvane_LTE (2 of 2 messages) and Orvane_GSM (0); taken for Orvane_GSM",
+            "kelvasictl: 67 % of 3 messages were not shown"])
         self.assertEqual(found.returncode, 0)
         self.assertEqual(found.stdout, self.decode(first).stdout)
 
@@ -325,7 +326,8 @@ class Technology(KelvasictlTest):
         capture = self.write("a.pcap", pcap(self.LTE))
         given = self.decode(capture)
         self.assertEqual(given.stderr.decode(),
-                         f"kelvasictl: {capture}: fits Orvane_LTE (1 of 1 messages) and Orvane_GSM (0); taken for Orvane_GSM\n")
+                         f"kelvasictl: {capture}: fits Orvane_LTE (1 of 1 messages) and Orvane_GSM (0); taken for Orvane_GSM\n"
+                         "kelvasictl: 100 % of 1 message was not shown\n")
         self.assertEqual(given.returncode, 0)
 
     def test_that_cannot_be_found_is_a_fault(self):

@@ -27,6 +27,7 @@ class Decode {
 
   // The display of the last tick; absent before.
   const PlistValue& display() const { return display_; }
+  const Intake& intake() const { return generator_->intake(); }
   PlistValue saveContents() const { return generator_->getSaveContentsFromState(*state_); }
 
  private:

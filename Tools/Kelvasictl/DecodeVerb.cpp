@@ -11,6 +11,7 @@
 #include "Telvon/TechnologyName.h"
 #include "Tools/Kelvasictl/Decode.h"
 #include "Tools/Kelvasictl/DisplayJson.h"
+#include "Tools/Kelvasictl/MessageTally.h"
 #include "Tools/Kelvasictl/Progress.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/Surroundings.h"
@@ -62,14 +63,17 @@ class DecodeVerb {
   explicit DecodeVerb(const DecodeOptions& options)
       : options_(options), surroundings_(options.surroundings) {}
 
-  int run() {
+  int run(MessageTally& tally) {
     if (options_.startCommand) {
       printOut(inXml(generatorFor(options_.technology)->getStartCommand(), surroundings_.plists));
       return exitSuccess;
     }
     if (!options_.technology.empty()) start(options_.technology);
     const bool isWhole = decodeCaptures();
-    if (decode_) decode_->finish();
+    if (decode_) {
+      decode_->finish();
+      tally.add(decode_->intake());
+    }
     if (!options_.everyTick) printDisplay(decode_ ? decode_->display() : PlistValue());
     save(decode_ ? decode_->saveContents() : PlistValue());
     return isWhole ? exitSuccess : exitFault;
@@ -204,7 +208,7 @@ Action declareDecode(CLI::App& verb) {
     refuseInput(*options, "--dlf", options->dlf);
     refuseInput(*options, "--snapshot", options->snapshot);
   });
-  return [options] { return DecodeVerb(*options).run(); };
+  return [options](MessageTally& tally) { return DecodeVerb(*options).run(tally); };
 }
 
 }  // namespace kelvasi

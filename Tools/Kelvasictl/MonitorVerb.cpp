@@ -7,6 +7,7 @@
 #include "Platform/Clock.h"
 #include "Tools/Kelvasictl/DisplayJson.h"
 #include "Tools/Kelvasictl/LiveSession.h"
+#include "Tools/Kelvasictl/MessageTally.h"
 #include "Tools/Kelvasictl/MonitorView.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
@@ -47,7 +48,7 @@ class MonitorVerb {
   explicit MonitorVerb(const MonitorOptions& options)
       : options_(options), session_(options.live, [this] { update(); }) {}
 
-  int run() {
+  int run(MessageTally& tally) {
     std::unique_ptr<Timer> statusTimer;
     if (::isatty(STDERR_FILENO) == 1)
       statusTimer = session_.queue().repeat(200ms, [this] { status_.show(session_.model().isConnected()); });
@@ -58,6 +59,7 @@ class MonitorVerb {
       throw;
     }
     status_.show(true);
+    if (const LogGenerator* generator = session_.model().logGenerator()) tally.add(generator->intake());
     return exitSuccess;
   }
 
@@ -108,7 +110,7 @@ Action declareMonitor(CLI::App& verb) {
       ->check(CLI::IsMember({"tree", "json"}));
   verb.add_flag("--once", options->once, "end after the first update");
   options->live.addTo(verb);
-  return [options] { return MonitorVerb(*options).run(); };
+  return [options](MessageTally& tally) { return MonitorVerb(*options).run(tally); };
 }
 
 }  // namespace kelvasi

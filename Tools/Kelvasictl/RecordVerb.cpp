@@ -2,10 +2,12 @@
 #include <CLI/CLI.hpp>
 
 #include "Capture/PcapWriter.h"
+#include "LogGenerator/Arrival.h"
 #include "Model/MoreLogCodes.h"
 #include "Platform/Clock.h"
 #include "Tools/Kelvasictl/LiveSession.h"
 #include "Tools/Kelvasictl/LogCodeOptions.h"
+#include "Tools/Kelvasictl/MessageTally.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
 #include "Tools/Kelvasictl/Verb.h"
@@ -21,10 +23,6 @@ struct RecordOptions {
   bool force = false;
   LiveOptions live;
 };
-
-std::chrono::nanoseconds sinceEpoch(PlistDate date) {
-  return std::chrono::round<std::chrono::microseconds>(std::chrono::duration<double>(date.secondsSince1970));
-}
 
 const std::string& writable(const RecordOptions& options) {
   if (const std::string refusal = refusalOf(options.file, options.force); !refusal.empty())
@@ -61,7 +59,7 @@ class RecordVerb {
 
  private:
   void take(std::span<const std::uint8_t> message) {
-    if (!writer_.write(message, sinceEpoch(session_.clock().now()))) return session_.end(writer_.error());
+    if (!writer_.write(message, arrivalAt(session_.clock().now()))) return session_.end(writer_.error());
     ++count_;
     if (message.size() > PcapWriter::largestPacket) tellCut(message.size());
   }
@@ -95,7 +93,8 @@ Action declareRecord(CLI::App& verb) {
   options->logCodes.addTo(verb);
   verb.add_flag("--force", options->force, "replace a file that is there, once the first message has come");
   options->live.addTo(verb);
-  return [options] { return RecordVerb(*options).run(); };
+  // Nothing is decoded, so nothing can fail to be shown.
+  return [options](MessageTally&) { return RecordVerb(*options).run(); };
 }
 
 }  // namespace kelvasi

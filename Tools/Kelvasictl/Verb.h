@@ -10,11 +10,17 @@ class App;
 
 namespace kelvasi {
 
-// Returns the exit status; throws ToolError.
-using Action = std::function<int()>;
+class MessageTally;
+
+// Adds the messages that it took in; returns the exit status; throws ToolError.
+using Action = std::function<int(MessageTally& tally)>;
 
 // `verb` outlives the action.
+Action declareAlarms(CLI::App& verb);
+Action declareCells(CLI::App& verb);
+Action declareCoverage(CLI::App& verb);
 Action declareDecode(CLI::App& verb);
+Action declareEvents(CLI::App& verb);
 Action declareMonitor(CLI::App& verb);
 Action declareRecord(CLI::App& verb);
 

@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "Platform/Posix/PackageResources.h"
+#include "Tools/Kelvasictl/MessageTally.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
 #include "Tools/Kelvasictl/Verb.h"
@@ -16,9 +17,22 @@ constexpr std::array verbs{
     Verb{"decode", "decode captures and print the display", declareDecode},
     Verb{"monitor", "print the display of a live link at every update", declareMonitor},
     Verb{"record", "record a live link to a capture", declareRecord},
+    Verb{"cells", "the cells of captures or of a live link, with their levels", declareCells},
+    Verb{"events", "what happened: cell changes, states, rejects, service, link", declareEvents},
+    Verb{"coverage", "what became of the messages, by log code", declareCoverage},
+    Verb{"alarms", "watch captures or a live link by rules", declareAlarms},
 };
 
-int run(int argumentCount, char** arguments) {
+std::string verbNames() {
+  std::string names;
+  for (const Verb& verb : verbs) {
+    if (!names.empty()) names += &verb == &verbs.back() ? " or " : ", ";
+    names += verb.name;
+  }
+  return names;
+}
+
+int run(int argumentCount, char** arguments, MessageTally& tally) {
   CLI::App app("Decodes, watches and records the diagnostic stream of a cellular modem.", "kelvasictl");
   app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
   std::vector<Action> actions;
@@ -33,9 +47,9 @@ int run(int argumentCount, char** arguments) {
     return exitWrongUsage;
   }
   for (std::size_t place = 0; place < verbs.size(); ++place) {
-    if (app.got_subcommand(verbs[place].name)) return actions[place]();
+    if (app.got_subcommand(verbs[place].name)) return actions[place](tally);
   }
-  complain("a subcommand is missing: decode, monitor or record (try --help)");
+  complain("a subcommand is missing: " + verbNames() + " (try --help)");
   return exitWrongUsage;
 }
 
@@ -46,10 +60,13 @@ int run(int argumentCount, char** arguments) {
 // NOLINTNEXTLINE(bugprone-exception-escape): the terminate handler tells of what is no ToolError
 int main(int argumentCount, char** arguments) {
   kelvasi::secureStandardStreams();
+  kelvasi::MessageTally tally;
+  int status = kelvasi::exitFault;
   try {
-    return kelvasi::run(argumentCount, arguments);
+    status = kelvasi::run(argumentCount, arguments, tally);
   } catch (const kelvasi::ToolError& error) {
     kelvasi::complain(error.what());
-    return kelvasi::exitFault;
   }
+  if (const std::string notShown = tally.text(); !notShown.empty()) kelvasi::complain(notShown);
+  return status;
 }

@@ -1,0 +1,54 @@
+// Surveys captures or a live link for the verbs that tell what was in them.
+#pragma once
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "Survey/Survey.h"
+#include "Tools/Kelvasictl/LiveSession.h"
+#include "Tools/Kelvasictl/RecordOutput.h"
+
+namespace CLI {
+class App;
+}
+
+namespace kelvasi {
+
+struct SurveyOptions {
+  std::string technology;  // its identifier; empty: each capture's is found
+  std::vector<std::string> captures;
+  unsigned jobs = 1;  // captures that are surveyed side by side
+  bool isLive = false;
+  LiveOptions live;
+  FormatOption format;
+
+  void addTo(CLI::App& verb);
+  void addJobsTo(CLI::App& verb);
+};
+
+// One capture, or a live link as long as its technology is the same. It lasts for a call.
+struct Surveyed {
+  std::string technology;  // its short name
+  const LogGenerator& generator;
+  const survey::Survey& survey;
+};
+
+// What a verb does with a survey. With several jobs setUp and what it sets up are called in threads, each
+// capture in one.
+struct SurveyUse {
+  using Print = RecordOutput::Print;
+
+  // Sets up the survey of a capture. What is printed while it goes on comes in the order of the captures.
+  std::function<survey::SurveySetUp(const std::string& technology, Print print)> setUp;
+  // After each capture, in their order, in the caller's thread.
+  std::function<void(const Surveyed& surveyed)> take;
+  bool printsMeanwhile = false;
+  // Now and then while a live link is surveyed.
+  std::function<void()> tick = [] {};
+};
+
+// Returns the exit status: that of a fault when something could not be read. Throws ToolError.
+int runSurvey(const SurveyOptions& options, const SurveyUse& use);
+
+}  // namespace kelvasi
