@@ -1,13 +1,17 @@
 #include "LogGenerator/CellFields.h"
 
+#include <algorithm>
+
 namespace kelvasi {
 
 CellIdentity cellOf(const CellFields& fields, RecordView record, RecordView entry) {
-  CellIdentity cell{.family = fields.family};
-  if (fields.channel) cell.channel = valueOf(entry, *fields.channel);
-  if (fields.headChannel) cell.channel = valueOf(record, *fields.headChannel);
-  if (fields.code) cell.code = valueOf(entry, *fields.code);
-  return cell;
+  // A number below 0 names nothing.
+  const auto part = [](RecordView view, const std::optional<Field>& field) {
+    return field ? std::max(valueOf(view, *field), CellIdentity::unknown) : CellIdentity::unknown;
+  };
+  return {.family = fields.family,
+          .channel = fields.headChannel ? part(record, fields.headChannel) : part(entry, fields.channel),
+          .code = part(entry, fields.code)};
 }
 
 CellIdentity servingCellOf(const CellFields& fields, RecordView record, LogCode logCode,

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "LogGenerator/SortPrefix.h"
+
 namespace kelvasi {
 
 void Readings::begin(Arrival arrival, LogCode logCode) {
@@ -14,7 +16,9 @@ void Readings::begin(Arrival arrival, LogCode logCode) {
 }
 
 void Readings::identify(std::size_t from, const CellIdentity& cell) {
-  for (; from < readings_.size(); ++from) readings_[from].cell = cell;
+  for (; from < readings_.size(); ++from) {
+    if (readings_[from].kind != Reading::Kind::removal) readings_[from].cell = cell;
+  }
 }
 
 void Readings::takeChannel(std::size_t from, const CellIdentity& serving) {
@@ -37,31 +41,51 @@ void Readings::addRemovals(const ReadingSection& section, std::string_view list,
   }
 }
 
-void Readings::addValue(const ReadingSection& section, std::string path, std::string_view row,
-                        const PlistValue& value, bool isNew) {
-  addLeaves(section, path, row, values_.emplace_back(value), isNew);
+void Readings::addValue(const ReadingSection& section, std::string_view row, const PlistValue& value,
+                        bool isNew) {
+  std::string path;
+  appendPathStep(path, row);
+  addLeaves({.section = &section}, path, row, values_.emplace_back(value), isNew);
 }
 
-void Readings::addLeaves(const ReadingSection& section, const std::string& path, std::string_view row,
+void Readings::addEntry(const ReadingSection& section, std::size_t entry, const PlistValue& value) {
+  addLeaves({.entry = static_cast<std::int32_t>(entry), .section = &section}, {}, {},
+            values_.emplace_back(value), true);
+}
+
+void Readings::addDisplay(const PlistValue& display) {
+  addRemovalOfEverything();
+  const PlistDictionary* entries = display.dictionary();
+  if (!entries || entries->empty())
+    return addLeaves({.section = &sections_.emplace_back()}, {}, {}, values_.emplace_back(display), true);
+  for (const auto& [key, value] : *entries) {
+    ReadingSection& section = sections_.emplace_back();
+    section.name = withoutSortPrefix(key);
+    appendPathStep(section.path, key);
+    addLeaves({.section = &section}, {}, key, values_.emplace_back(value), true);
+  }
+}
+
+void Readings::addLeaves(const Reading& place, const std::string& path, std::string_view row,
                          const PlistValue& value, bool isNew) {
   const PlistDictionary* entries = value.dictionary();
   const PlistArray* elements = value.array();
   if (!isNew || !entries || entries->empty()) {
-    add({.kind = Reading::Kind::value,
-         .keyKind = Reading::Key::path,
-         .section = &section,
-         .list = row,
-         .key = texts_.emplace_back(path),
-         .value = &value});
+    Reading& reading = readings_.emplace_back(place);
+    reading.kind = Reading::Kind::value;
+    reading.keyKind = Reading::Key::path;
+    reading.list = row;
+    reading.key = texts_.emplace_back(path);
+    reading.value = &value;
   }
   for (std::size_t at = 0; entries && at < entries->size(); ++at) {
     const auto& [key, entry] = *(entries->begin() + static_cast<std::ptrdiff_t>(at));
     std::string step = path;
     appendPathStep(step, key);
-    addLeaves(section, step, key, entry, true);
+    addLeaves(place, step, key, entry, true);
   }
   for (std::size_t at = 0; elements && at < elements->size(); ++at)
-    addLeaves(section, path + "/" + std::to_string(at), row, elements->at(at), true);
+    addLeaves(place, path + "/" + std::to_string(at), row, elements->at(at), true);
 }
 
 }  // namespace kelvasi

@@ -38,12 +38,13 @@ class Readings {
   void addRemovalOfEverything() { add({.kind = Reading::Kind::removal}); }
   // Of the entries of a list, the last one first. `list` is empty where the section itself is the list.
   void addRemovals(const ReadingSection& section, std::string_view list, std::size_t entries);
-  // A property-list value that comes to stand at `path` on from the section, and after it what is in it.
-  // `isNew`: nothing stood there, so that a group with something in it needs no reading of its own.
-  void addValue(const ReadingSection& section, std::string path, std::string_view row,
-                const PlistValue& value, bool isNew);
-  // A section that lasts until the next message.
-  const ReadingSection& keep(ReadingSection section) { return sections_.emplace_back(std::move(section)); }
+  // A property-list value that a row comes to hold, and after it what is in it. `isNew`: nothing stood there,
+  // so that a group with something in it needs no reading of its own.
+  void addValue(const ReadingSection& section, std::string_view row, const PlistValue& value, bool isNew);
+  // The same for an entry behind the last one of a section that is a list.
+  void addEntry(const ReadingSection& section, std::size_t entry, const PlistValue& value);
+  // A display in place of the whole one before. What stands at its top are its sections.
+  void addDisplay(const PlistValue& display);
 
   // Gives all readings from this one on their cell.
   void identify(std::size_t from, const CellIdentity& cell);
@@ -52,8 +53,8 @@ class Readings {
   ServingCells& servingCells() { return servingCells_; }
 
  private:
-  void addLeaves(const ReadingSection& section, const std::string& path, std::string_view row,
-                 const PlistValue& value, bool isNew);
+  void addLeaves(const Reading& place, const std::string& path, std::string_view row, const PlistValue& value,
+                 bool isNew);
 
   Arrival arrival_{0};
   LogCode logCode_ = 0;

@@ -15,8 +15,8 @@ bool CellTable::takes(const PlistValue& cell) const {
 
 ServingCells::Word CellTable::identityOf(const PlistDictionary& cell) const {
   const auto number = [&](std::string_view key) {
-    return key.empty() ? std::int64_t{CellIdentity::unknown}
-                       : cellNumber(cell, key).value_or(CellIdentity::unknown);
+    const auto stated = key.empty() ? std::nullopt : cellNumber(cell, key);
+    return stated && *stated >= 0 ? std::int64_t{*stated} : CellIdentity::unknown;
   };
   const auto cellId = cellNumber(cell, kTelvonCellMonitorCellId);
   return {.cell = {keys.family, number(keys.channel), number(keys.code)},

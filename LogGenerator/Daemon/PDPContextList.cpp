@@ -31,8 +31,7 @@ Outcome PDPContextList::updateWithData(RecordView record, LogCode logCode) {
 void PDPContextList::gather(const PlistArray& contexts) const {
   const ReadingSection& section = *place().section;
   readings()->addRemovals(section, {}, sectionList()->size());
-  for (std::size_t at = 0; at < contexts.size(); ++at)
-    readings()->addValue(section, "/" + std::to_string(at), {}, contexts.at(at), true);
+  for (std::size_t at = 0; at < contexts.size(); ++at) readings()->addEntry(section, at, contexts.at(at));
 }
 
 }  // namespace kelvasi

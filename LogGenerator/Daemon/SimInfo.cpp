@@ -38,10 +38,7 @@ void SimInfo::show(std::string_view row, const PlistValue& value) const {
   } else {
     sectionRows()->set(row, value);
   }
-  if (!readings()) return;
-  std::string path;
-  appendPathStep(path, row);
-  readings()->addValue(*place().section, std::move(path), row, value, isNew);
+  if (readings()) readings()->addValue(*place().section, row, value, isNew);
 }
 
 }  // namespace kelvasi

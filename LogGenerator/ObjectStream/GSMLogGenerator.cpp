@@ -3,7 +3,6 @@
 #include <string>
 
 #include "LogGenerator/Exceptions.h"
-#include "LogGenerator/SortPrefix.h"
 #include "Platform/PlistSerialiser.h"
 
 namespace kelvasi {
@@ -42,19 +41,7 @@ void GSMLogGenerator::updateState(PlistDictionary& state, std::span<const std::u
   state.set("Display", display);
   state.set("ExtraInfo", PlistDictionary::make());
   count(0, Outcome::shown, data);
-  if (readings()) gather(display);
-}
-
-// The whole display is another one; a section is what stands at its top.
-void GSMLogGenerator::gather(const PlistValue& display) const {
-  readings()->addRemovalOfEverything();
-  const PlistDictionary* entries = display.dictionary();
-  if (!entries || entries->empty()) return readings()->addValue(readings()->keep({}), {}, {}, display, true);
-  for (const auto& [key, value] : *entries) {
-    ReadingSection section{.name = std::string(withoutSortPrefix(key))};
-    appendPathStep(section.path, key);
-    readings()->addValue(readings()->keep(std::move(section)), {}, key, value, true);
-  }
+  if (readings()) readings()->addDisplay(display);
 }
 
 PlistValue GSMLogGenerator::generateLogUsingState(PlistDictionary& state) {

@@ -26,9 +26,6 @@ class GSMLogGenerator : public LogGenerator {
   static PlistValue processObject(const PlistValue& object);
   // The value of the only entry of a dictionary; absent for anything else.
   static PlistValue canCollapse(const PlistValue& object);
-
- private:
-  void gather(const PlistValue& display) const;
 };
 
 }  // namespace kelvasi

@@ -110,7 +110,7 @@ TEST(Readings, OfAPropertyListNameEveryLeafAndEveryContainerThatNothingElseMakes
                                                   {"data", Bytes{1, 2}},
                                                   {"list", PlistArray::make({"b", PlistDictionary::make()})},
                                                   {"group", PlistDictionary::make({{"~key", "c"}})}});
-  readings.addValue(section, "/0", "", value, true);
+  readings.addEntry(section, 0, value);
   EXPECT_EQ(linesOf(readings),
             "/01;Cell/Serving Cell/0/text text a\n"
             "/01;Cell/Serving Cell/0/number number 7\n"
@@ -127,10 +127,21 @@ TEST(Readings, OfAPropertyListNameEveryLeafAndEveryContainerThatNothingElseMakes
 
 TEST(Readings, OfAGroupThatTakesAnotherValuesPlaceBeginWithTheEmptyGroup) {
   Readings readings;
-  readings.addValue(section, "/EF-AD", "EF-AD", PlistDictionary::make({{"key", "c"}}), false);
+  readings.addValue(section, "EF-AD", PlistDictionary::make({{"key", "c"}}), false);
   EXPECT_EQ(linesOf(readings),
             "/01;Cell/Serving Cell/EF-AD EF-AD {}\n"
             "/01;Cell/Serving Cell/EF-AD/key key c\n");
+}
+
+TEST(Readings, OfAWholeDisplayBeginWithTheRemovalOfTheOneBefore) {
+  Readings readings;
+  readings.addDisplay(
+      PlistDictionary::make({{"01;Cell", PlistDictionary::make({{"RSSI", "-95 dBm"}})}, {"Mode", "idle"}}));
+  EXPECT_EQ(linesOf(readings),
+            "  -\n"
+            "/01;Cell/RSSI RSSI -95 dBm\n"
+            "/Mode Mode idle\n");
+  EXPECT_EQ(readings.all()[1].section->name, "Cell");
 }
 
 TEST(Readings, AreThoseOfTheMessageTakenInLast) {

@@ -5,7 +5,7 @@ namespace kelvasi {
 void Decode::take(const CapturedMessage& message) {
   if (const auto time = schedule_.tickBefore(message.arrival)) tick(*time);
   clock_.set(message.arrival);
-  update(message.bytes);
+  update(message);
 }
 
 void Decode::finish() {

@@ -31,7 +31,10 @@ class Decode {
   PlistValue saveContents() const { return generator_->getSaveContentsFromState(*state_); }
 
  private:
-  void update(std::span<const std::uint8_t> message) noexcept { generator_->updateState(*state_, message); }
+  void update(const CapturedMessage& message) noexcept {
+    generator_->setArrival(message.arrival);
+    generator_->updateState(*state_, message.bytes);
+  }
   PlistValue generate() noexcept { return generator_->generateLogUsingState(*state_); }
   void tick(TickSchedule::Time time);
 

@@ -15,6 +15,7 @@
 #include "Tools/Kelvasictl/Progress.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/Surroundings.h"
+#include "Tools/Kelvasictl/TechnologyOption.h"
 #include "Tools/Kelvasictl/ToolError.h"
 #include "Tools/Kelvasictl/TreeText.h"
 #include "Tools/Kelvasictl/Verb.h"
@@ -147,13 +148,6 @@ class DecodeVerb {
   std::optional<Decode> decode_;
 };
 
-std::string readTechnology(std::string& text) {
-  const auto id = technologyId(text);
-  if (!id) return "there is no technology \"" + text + "\"";
-  text = *id;
-  return {};
-}
-
 // By whatever names; pipes and devices are not compared.
 bool isSameFile(const std::string& capture, const std::string& output) {
   std::error_code error;
@@ -172,11 +166,7 @@ std::string named(const std::string& file) {
 }
 
 void addOptions(CLI::App& verb, DecodeOptions& options) {
-  verb.add_option("--technology", options.technology,
-                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2; otherwise it is found from the "
-                  "messages")
-      ->type_name("TECH")
-      ->transform(CLI::Validator(readTechnology, ""));
+  addTechnology(verb, options.technology);
   verb.add_option("--format", options.format, "json (the default), tree (path TAB value), or plist")
       ->type_name("FORMAT")
       ->check(CLI::IsMember({"json", "tree", "plist"}));

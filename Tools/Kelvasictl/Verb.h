@@ -22,6 +22,7 @@ Action declareCoverage(CLI::App& verb);
 Action declareDecode(CLI::App& verb);
 Action declareEvents(CLI::App& verb);
 Action declareMonitor(CLI::App& verb);
+Action declareReadings(CLI::App& verb);
 Action declareRecord(CLI::App& verb);
 
 struct Verb {

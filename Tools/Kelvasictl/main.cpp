@@ -16,6 +16,7 @@ namespace {
 constexpr std::array verbs{
     Verb{"decode", "decode captures and print the display", declareDecode},
     Verb{"monitor", "print the display of a live link at every update", declareMonitor},
+    Verb{"readings", "print what every message wrote or removed, a line each", declareReadings},
     Verb{"record", "record a live link to a capture", declareRecord},
     Verb{"cells", "the cells of captures or of a live link, with their levels", declareCells},
     Verb{"events", "what happened: cell changes, states, rejects, service, link", declareEvents},

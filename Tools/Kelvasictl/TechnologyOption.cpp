@@ -1,0 +1,28 @@
+#include "Tools/Kelvasictl/TechnologyOption.h"
+
+#include <CLI/CLI.hpp>
+
+#include "Telvon/TechnologyName.h"
+
+namespace kelvasi {
+
+namespace {
+
+std::string readTechnology(std::string& text) {
+  const auto id = technologyId(text);
+  if (!id) return "there is no technology \"" + text + "\"";
+  text = *id;
+  return {};
+}
+
+}  // namespace
+
+void addTechnology(CLI::App& verb, std::string& technology) {
+  verb.add_option("--technology", technology,
+                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2; otherwise it is found from the "
+                  "messages")
+      ->type_name("TECH")
+      ->transform(CLI::Validator(readTechnology, ""));
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,15 @@
+// The option --technology of the verbs that read captures.
+#pragma once
+
+#include <string>
+
+namespace CLI {
+class App;
+}
+
+namespace kelvasi {
+
+// `technology` becomes an identifier, and stays as it is where the option is not given.
+void addTechnology(CLI::App& verb, std::string& technology);
+
+}  // namespace kelvasi
