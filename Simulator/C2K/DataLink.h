@@ -37,9 +37,8 @@ class DataLink {
   // As of the last whole second.
   const Report<ForwardCounters>& forward() const { return forward_; }
   const Report<ReverseCounters>& reverse() const { return reverse_; }
-  // Whether the report before the last one was the first without new packets: both rates have been told to be
-  // 0.
-  bool isTold() const { return quietReports_ > 1; }
+  // Whether the records of both rates have told that no packets are carried any more.
+  bool hasToldItsEnd() const { return quietReports_ > 1; }
 
  private:
   void receive(double carrierToInterference, double seconds);
@@ -52,7 +51,7 @@ class DataLink {
   Report<ForwardCounters> forwardNow_;
   Report<ReverseCounters> reverseNow_;
   double inSecond_ = 0;
-  int quietReports_ = 2;
+  int quietReports_ = 2;  // in a row, without new packets
 };
 
 }  // namespace kelvasi::sim::c2k

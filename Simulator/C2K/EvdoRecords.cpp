@@ -17,7 +17,7 @@ constexpr std::array counterLayout{Field{.name = "packets", .byte = 0, .width = 
 
 // Off, and done with telling that it is.
 bool isSilent(const World& world) {
-  return world.evdo().state() == Evdo::State::inactive && world.dataLink().isTold();
+  return world.evdo().state() == Evdo::State::inactive && world.dataLink().hasToldItsEnd();
 }
 
 Bytes counterBytes(std::uint32_t packets) {

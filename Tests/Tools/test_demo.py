@@ -13,6 +13,36 @@ VIEWER = os.environ["KELVASI"]
 SOURCES = pathlib.Path(__file__).resolve().parent.parent.parent
 
 
+# What the first display of each technology shows: lines that are there, and sections that have rows.
+FIRST_DISPLAY = {
+    "IFX": (
+        {"/Power\tOn", "/Network/Packet Switched/State\tGMM_REGISTERED"},
+        {"/Network/PLMN", "/Network/Packet Switched/Contexts", "/Serving Cell", "/Neighbor Cells/GSM",
+         "/Neighbor Cells/UMTS"}),
+    "Orvane_GSM": (
+        {"/Registration/Serving PLMN/Service Type\tCS_PS_SERVICE",
+         "/Registration/Process CO/MM Service State\tREG_STATE_IDLE"},
+        {"/Registration/Process CS", "/Registration/Process PS", "/Registration/Equivalent PLMN List",
+         "/GSM/GSM Serving Cell", "/GSM/Neighboring Cells", "/GSM/GSM RR Info", "/GSM/GPRS Information",
+         "/GSM/Mobile Allocation", "/UMTS/UMTS RR Info", "/UMTS/UMTS Set", "/UMTS/GSM Set",
+         "/Packet Data/PDP Context Info", "/SIM/SIM Info"}),
+    "Orvane_CDMA": (
+        {"/EV-DO/Device State\tConnected [5]", "/EV-DO/Session State\tOpen [4]"},
+        {"/1x/Device State", "/1x/Active Set Ec/Io/", "/1x/Finger C/I/", "/1x System/SID", "/EV-DO/UATI24",
+         "/EV-DO/Active Set Pilots/", "/EV-DO Data Rates/Forward Link", "/EV-DO Data Rates/Reverse Link"}),
+    "Orvane_LTE": (
+        set(),
+        {"/Serving Cell/Serving Cell Info", "/Serving Cell/Serving Cell Measurements",
+         "/Idle Mode Neighbors/Neighbor Measurements", "/Idle Mode Neighbors/Neighbor Cells List",
+         "/Reselection/Reselection Candidates/Serving EARFCN",
+         "/Connected Mode/Connected mode LTE Intra-frequency Measurement"}),
+    "Orvane_UTRAN2": (
+        {"/Serving Cell/RRC Info/State\tCell DCH"},
+        {"/Serving Cell/Serving Cell Info", "/Neighbor Cells/Neighbor Cell List", "/Channel Quality/TRCH BLER",
+         "/Channel Quality/CCTRCH SIR"}),
+}
+
+
 class Demo(LiveTest):
     def setUp(self):
         super().setUp()
@@ -80,6 +110,20 @@ class Demo(LiveTest):
         demo = self.start_demo("--seconds", "5")
         self.assertIn(b"/Registration/Process CS/MM State", demo.stdout.read())
         self.check_ended(demo)
+
+    def first_display(self, technology):
+        """The lines of it that have a value."""
+        demo = self.start_demo("--technology", technology, "--seconds", "3")
+        display = demo.communicate(timeout=PATIENCE)[0].decode().split("\n---\n")[0]
+        return {line for line in display.splitlines() if line.split("\t")[1] not in ("", "N/A", "(none)")}
+
+    def test_a_newcomer_sees_a_registered_handset_and_most_sections_at_once(self):
+        for technology, (lines, sections) in FIRST_DISPLAY.items():
+            with self.subTest(technology):
+                shown = self.first_display(technology)
+                self.assertEqual(lines - shown, set())
+                empty = {name for name in sections if not any(line.startswith(name) for line in shown)}
+                self.assertEqual(empty, set())
 
     def test_without_a_display_it_leaves_pictures(self):
         self.check_ended(self.start_demo("--seconds", "1"))
