@@ -135,8 +135,9 @@ TEST(Readings, OfAGroupThatTakesAnotherValuesPlaceBeginWithTheEmptyGroup) {
 
 TEST(Readings, OfAWholeDisplayBeginWithTheRemovalOfTheOneBefore) {
   Readings readings;
-  readings.addDisplay(
-      PlistDictionary::make({{"01;Cell", PlistDictionary::make({{"RSSI", "-95 dBm"}})}, {"Mode", "idle"}}));
+  const PlistValue display =
+      PlistDictionary::make({{"01;Cell", PlistDictionary::make({{"RSSI", "-95 dBm"}})}, {"Mode", "idle"}});
+  readings.addDisplay(display);
   EXPECT_EQ(linesOf(readings),
             "  -\n"
             "/01;Cell/RSSI RSSI -95 dBm\n"

@@ -17,6 +17,7 @@
 #include "Simulator/Handset/CellLayout.h"
 #include "Simulator/LTE/CellLayout.h"
 #include "Simulator/LTE/DriveScenario.h"
+#include "Simulator/Radio/Reported.h"
 #include "Simulator/UTRAN/CellLayout.h"
 #include "Simulator/UTRAN/DriveScenario.h"
 #include "Survey/Survey.h"
@@ -59,15 +60,17 @@ struct Gsm {
   static std::optional<std::size_t> serving(const sim::gsm::World& world) { return world.serving(); }
   static std::optional<Truth> truth(const sim::gsm::World& world, const Named& cell,
                                     const Quantity& quantity) {
+    // As handsets report it: the scales end before the air does.
     const sim::Reception& heard = world.reception(cell.place);
-    if (&quantity == &quantity::rssi) return Truth{heard.level, 2.1};  // the daemon counts in steps of 2 dB
-    if (&quantity == &quantity::rxlev) return Truth{std::clamp(heard.level + 110, 0.0, 63.0), 1.1};
+    const double level = sim::reportedGsmLevel(heard);
+    if (&quantity == &quantity::rssi) return Truth{level, 2.1};  // the daemon counts in steps of 2 dB
+    if (&quantity == &quantity::rxlev) return Truth{std::clamp(level + 110, 0.0, 63.0), 1.1};
+    const double rscp = sim::reportedRscp(heard);
+    const double ecNo = sim::reportedEcNo(heard);
     // One of the records goes through a ladder that bends far down.
-    const double ladder =
-        Base::lookUpECNO(static_cast<std::uint32_t>(524288 * std::pow(10, heard.ecNo / 10)));
-    const double bend = ladder - heard.ecNo;
-    if (&quantity == &quantity::rscp) return between(heard.level, heard.level + bend, 1.1);
-    if (&quantity == &quantity::ecno) return between(heard.ecNo, ladder, 0.6);
+    const double ladder = Base::lookUpECNO(static_cast<std::uint32_t>(524288 * std::pow(10, ecNo / 10)));
+    if (&quantity == &quantity::rscp) return between(rscp, rscp + ladder - ecNo, 1.1);
+    if (&quantity == &quantity::ecno) return between(ecNo, ladder, 0.6);
     return std::nullopt;
   }
 };
@@ -132,7 +135,7 @@ struct C2k {
                                     const Quantity& quantity) {
     if (&quantity != &quantity::ecio) return std::nullopt;
     if (cell.identity.family == RadioFamily::cdma) {
-      const double ratio = std::pow(10, world.oneXRatios()[cell.place] / 10);
+      const double ratio = std::pow(10, sim::c2k::reportedRatio(world.oneXRatios()[cell.place]) / 10);
       const auto decibel = [](double linear) { return 10 * std::log10(std::max(linear, 1e-5)); };
       return between(decibel(ratio - steps1x), decibel(ratio + steps1x), 0.01);
     }
@@ -244,7 +247,7 @@ TYPED_TEST_SUITE(Drive, Kinds);
 // shows, under its name; every level is its cell's; and each change of cell is
 // an event.
 TYPED_TEST(Drive, IsWhatTheWorldIs) {
-  for (const std::uint64_t seed : {1, 11, 2024}) {
+  for (const std::uint64_t seed : {1u, 11u, 2024u}) {
     SCOPED_TRACE(seed);
     SurveyedDrive<TypeParam> drive(seed);
     std::optional<std::size_t> last;
@@ -295,7 +298,7 @@ TYPED_TEST(Drive, NamesStayWithTheirCells) {
 
 // 1x and EV-DO each have a cell that serves.
 TEST(CdmaDrive, IsWhatTheWorldIs) {
-  for (const std::uint64_t seed : {1, 11, 2024}) {
+  for (const std::uint64_t seed : {1u, 11u, 2024u}) {
     SCOPED_TRACE(seed);
     SurveyedDrive<C2k> drive(seed);
     std::optional<std::size_t> lastOneX;

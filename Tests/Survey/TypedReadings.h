@@ -3,6 +3,7 @@
 
 #include <deque>
 #include <initializer_list>
+#include <memory>
 
 #include "LogGenerator/Readings.h"
 #include "LogGenerator/Row.h"
@@ -41,7 +42,7 @@ class Message {
  private:
   Message& add(const ReadingSection& section, const CellIdentity& cell, const Quantity& quantity,
                std::int64_t raw, std::int32_t entry, std::span<const std::string_view> texts = {}) {
-    const Row& row = rows_.emplace_back(Row{.key = quantity.id, .quantity = quantity, .texts = texts});
+    const Row& row = rows_->emplace_back(Row{.key = quantity.id, .quantity = quantity, .texts = texts});
     Reading reading;
     reading.entry = entry;
     reading.section = &section;
@@ -54,7 +55,8 @@ class Message {
   }
 
   Readings readings_;
-  std::deque<Row> rows_;
+  // Shared with copies, whose readings refer to the same rows.
+  std::shared_ptr<std::deque<Row>> rows_ = std::make_shared<std::deque<Row>>();
   std::int32_t entry_ = 0;
 };
 
