@@ -307,6 +307,7 @@ class Alarms(Survey):
         self.assertEqual(self.end(alarms)[0], 3)
 
 
+@unittest.skipIf(os.environ.get("KELVASI_SANITIZE"), "sanitizers keep memory back")
 class Memory(Survey):
     def test_it_does_not_grow_with_the_capture(self):
         def peak(path):
