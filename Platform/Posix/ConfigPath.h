@@ -8,7 +8,7 @@
 namespace kelvasi {
 
 // kelvasi/NAME in $XDG_CONFIG_HOME, or in ~/.config where that is not set or no absolute path (XDG Base
-// Directory Specification). Whether it is there is another matter; nothing when the environment says nowhere.
+// Directories). Whether it is there is another matter; nothing when the environment says nowhere.
 std::optional<std::filesystem::path> configPath(std::string_view name);
 
 }  // namespace kelvasi
