@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The application object: builds the window and the stack of panes, runs the model and keeps every pane in
 // step with it.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A row of a pane. A key cell shows a name; a value cell a name and a value that can be scrolled sideways
 // when both do not fit.
 #pragma once

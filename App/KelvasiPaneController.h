@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // One screen of the viewer: the children of a branch of the display tree, a row each.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The view that lists what a snapshot will hold and writes it, with the user's description.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What panes and the save view ask of the application.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Runs the benchmarks and prints their table. `--smoke` runs each as briefly as it can be; what else is given
 // goes to the benchmark library, as in --benchmark_filter=tree.
 #include <cstring>

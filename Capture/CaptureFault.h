@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What of a capture could not be read.
 #pragma once
 

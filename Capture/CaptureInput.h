@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Any number of captures, one after the other, as one run of messages, for every verb that is not live. What
 // cannot be read is told and passed over; the rest is read all the same. Memory does not grow with them.
 //

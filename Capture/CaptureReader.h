@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A capture: log-channel messages, as delivered with id 0, in the order in which they arrived.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A DLF file, plain or from a snapshot (DlfRecords.h), as log-channel messages.
 //
 // - A version report at the beginning is no message.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Where the records of a DLF file are.
 //
 // A record is a length (16 bits, little-endian, the whole record), a log code (16 bits), a time stamp (8

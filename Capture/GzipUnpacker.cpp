@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Capture/GzipUnpacker.h"
 
 #define ZLIB_CONST  // input is not written to

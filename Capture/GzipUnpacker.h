@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // gzip, by zlib.
 #pragma once
 

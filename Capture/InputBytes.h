@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A file or the standard input, read from its beginning to its end, unpacked where it is packed (gzip, zstd).
 // The first bytes can be looked at before anybody reads them, and the place that was read up to is known for
 // pipes too.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A pcap or pcapng file with link type DLT_USER0: one log-channel message per packet.
 #pragma once
 

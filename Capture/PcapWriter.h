@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Writes a pcap file with link type DLT_USER0, one log-channel message per packet, stamps in microseconds.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Bytes of which the first can be looked at before anybody reads them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A capture into which one can look before one reads it, to find its technology.
 #pragma once
 

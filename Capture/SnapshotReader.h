@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A snapshot, the property list that Save writes, as the log-channel messages of its DLF file (DlfReader.h):
 // those of the display intervals that it kept, at most five.
 #pragma once

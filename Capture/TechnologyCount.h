@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How many messages of a run only one technology asks for, for each of them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How packed files are unpacked: gzip (RFC 1952) and Zstandard (RFC 8878).
 #pragma once
 

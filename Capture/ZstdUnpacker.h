@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Zstandard, by libzstd, with windows of up to 128 MiB.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A DLF file: the version report, then the raw messages of the history's intervals.
 #pragma once
 

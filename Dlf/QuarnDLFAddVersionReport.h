@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The version report record that every DLF file starts with.
 #pragma once
 

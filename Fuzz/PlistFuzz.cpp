@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Whatever bytes are parsed, nothing breaks; and what was parsed is written so that it reads the same again.
 #include <cstddef>
 #include <cstdint>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Runs a fuzz entry over the files given as arguments, where libFuzzer's main is not there to do it.
 #include <cstddef>
 #include <cstdint>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The one lock of the process: taken around replacing, clearing and walking the arrays of a display.
 #pragma once
 

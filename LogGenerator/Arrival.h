@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // When a message came in: the time stamp of its capture, or the clock at that moment.
 #pragma once
 

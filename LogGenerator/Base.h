@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The base of all record decoders. A decoder names its section, lists the log codes that it wants, and writes
 // rows into its section's container inside the display dictionary. It keeps no copy of a record.
 //

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Which fields of a record, or of an entry of its list, say which cell it is about.
 #pragma once
 

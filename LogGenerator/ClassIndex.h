@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The decoders of one technology, found by section name and by effective log code.
 #pragma once
 

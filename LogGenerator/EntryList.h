@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A list inside a record: a count, then that many entries of one size. Declared once and read by both the
 // decoder and the simulated daemon's encoder.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What decoding throws. Nothing catches the two record exceptions: a throw ends the process.
 #pragma once
 

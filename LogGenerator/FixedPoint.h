@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Decimal texts of measurements without the cost of printf.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What became of the messages that came in: each ends in exactly one way, and every way is counted. Never
 // part of a display or a snapshot.
 #pragma once

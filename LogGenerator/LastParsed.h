@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Remembers what the last bytes parsed gave, so that the decoders that read one record parse it once.
 //
 // What it hands out is shared: readers may pass parts of it on, and change none of it. For one thread.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A decoder of an array section: one dictionary for each entry of a record's list, and, where it asks for
 // the cell list, one for each cell that its table takes. A record with a twist of its own overrides addEntry.
 #pragma once

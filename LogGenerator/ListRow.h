@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A row of a dictionary section that holds a list. The list is written in place as long as only the section
 // shows it, so that one whose length does not change costs no allocation.
 #pragma once

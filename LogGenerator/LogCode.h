@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Effective log codes: the 16-bit code of a baseband record, or 0xFF0000 and above for the extra records that
 // the telephony daemon itself supplies.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A log generator turns the diagnostic stream of one radio technology into the generator state, from which
 // the display tree and the snapshot are made.
 //

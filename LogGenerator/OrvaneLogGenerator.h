@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The common base of the Orvane generators: gathers the raw messages of an interval and writes them as a DLF
 // file.
 #pragma once

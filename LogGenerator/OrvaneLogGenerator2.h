@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The template-driven generator: builds the display once from a property-list template, hands every section
 // in it to the decoder of that name, and dispatches each log record to the decoders that subscribe to its
 // code.

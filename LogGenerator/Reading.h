@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A reading: a row of the display and its raw value, as one message wrote it. Number, unit, state and text
 // are functions of the two.
 //

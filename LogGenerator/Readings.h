@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The readings of one message. A generator that is given one gathers into it; without one, decoding costs
 // nothing more than a test for null.
 //

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Log records as they arrive in the messages of the log channel.
 #pragma once
 

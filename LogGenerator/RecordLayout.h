@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The layout of a record, declared once and read by both its decoder and the simulated daemon's encoder.
 #pragma once
 

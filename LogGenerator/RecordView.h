@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A window on one log record. Every byte past the record's end reads as zero, so no read leaves the record
 // whatever its counts say.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Builds a log record by the names of its fields, from the same layout that its decoder reads.
 #pragma once
 

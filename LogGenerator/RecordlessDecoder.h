@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A decoder that asks for no records, so that its section shows what the template holds.
 #pragma once
 

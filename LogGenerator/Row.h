@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A display row of a record: which field it shows, what that is, and how it is shown. Text, number and unit
 // are functions of the row and the field's value, the raw value.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The entries of a list section while they are built. The dictionaries are used again from record to record,
 // as long as nobody else holds them, so that a list whose length does not change costs no allocation.
 #pragma once

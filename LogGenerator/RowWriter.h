@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Writes the rows of a display dictionary in place: a row that stands is overwritten where it stands.
 //
 // `Rows::kept` leaves every row that is not written as it is; `Rows::anew` ends with exactly the rows that

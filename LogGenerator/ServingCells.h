@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Which cell serves the handset, as far as the kinds of record that say so agree.
 #pragma once
 

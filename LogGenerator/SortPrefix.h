@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The keys of a dictionary that is shown sorted: "01;Serving Cell" is shown as "Serving Cell".
 #pragma once
 

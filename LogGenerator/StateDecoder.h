@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A decoder of a dictionary section whose records are rows by tables. For a record with a twist of its own a
 // decoder overrides decodeOther, and keeps to the tables for the rest.
 #pragma once

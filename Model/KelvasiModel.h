@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The one model of the application: the log-channel session with the telephony daemon, the generator and its
 // state, and the display tree that the panes show. Everything runs on the main queue's thread.
 #pragma once

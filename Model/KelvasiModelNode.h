@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The display tree: immutable named nodes, each a leaf with a text or a branch with ordered children. A
 // branch is told from a leaf by whether childNodes() is null, never by its count.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A start command that asks for more than the display shows.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The snapshot file: a property list of save contents with a description.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The wall clock and the local time zone.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Dates as texts for the user, in the current locale and time zone.
 #pragma once
 

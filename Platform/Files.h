@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The little that is asked of the file system.
 #pragma once
 

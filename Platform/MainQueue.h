@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The main thread's queue: tasks run one after another, never inside the call that posts them.
 #pragma once
 

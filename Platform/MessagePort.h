@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Named message ports between processes of one user. All handlers run on the main queue's thread.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What the system is given of its surroundings, as references that outlive every user.
 #pragma once
 

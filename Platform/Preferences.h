@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Preferences in named domains, kept from run to run.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A clock that somebody sets: offline, whoever reads the capture.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Resources of the application package, and what the package says of itself.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The system log. A line is asked for its priority before it is formatted, so a masked trace costs one test.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The telephony daemon: its server seen from an application, and the server itself for whoever plays the
 // daemon.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Where the few traces go that are meant for the standard output and not for the system log.
 #pragma once
 

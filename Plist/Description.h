@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The textual description of property-list values, as "%@" prints them in log lines and snapshot texts.
 #pragma once
 

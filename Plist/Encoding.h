@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Data and dates as plain text, for documents that have no kind of their own for them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The two containers of a property list. Reached through PlistValue.h.
 #pragma once
 

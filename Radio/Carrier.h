@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a channel number stands for: a band and its frequencies.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // From a cell's identity to its carriers.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Which cell a number is about, the same from every kind of record that speaks of the cell.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A row of a table of channel numbers.
 #pragma once
 

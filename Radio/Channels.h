@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Channel numbers to bands and frequencies, for every number of 32 bits. Where the standards let one number
 // mean several carriers, all of them are given; where they give none, or leave it to the network, none.
 //

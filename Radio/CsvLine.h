@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // One line of comma-separated values (RFC 4180; a quoted field ends with its line).
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A frequency, exact to the hertz, wide enough for every band there is.
 #pragma once
 

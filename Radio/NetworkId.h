@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The number of a network: mobile country code and mobile network code (ITU-T E.212, 3GPP TS 23.003, 2.2).
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The names that are built in, each table in the order of its numbers. The build writes them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Who runs a network, and where: what is built in, and a user's own names over it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a number of a record is: the closed list of quantities, each with its true unit whatever a row of the
 // display shows beside it.
 //

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // One application's log channel, seen from the daemon: what it subscribed to, and the way to its port.
 #pragma once
 

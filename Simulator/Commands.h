@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The commands of an application, and the daemon's answers to them.
 #pragma once
 

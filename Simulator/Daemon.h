@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The simulated telephony daemon: opens log channels on request, answers their commands, and sends every
 // channel the messages that it subscribed to. An application that does not keep up costs its own messages
 // only. Everything runs on the main queue's thread.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Takes a source's messages as fast as they can be made, without waiting for their times.
 #pragma once
 

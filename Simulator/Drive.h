@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A scenario that moves a world on and tells of it by a feed of records.
 #pragma once
 

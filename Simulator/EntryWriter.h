@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Writes a record's list from the same declaration that its decoder reads.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The faults that a simulated daemon shows on request. To add one: a row in Faults.cpp, and the place where
 // it shows.
 #pragma once

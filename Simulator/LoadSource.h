@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Synthetic load: a scenario's messages, made once and repeated at a steady rate.
 #pragma once
 

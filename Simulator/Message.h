@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What the simulated daemon sends: log messages, each with what is needed to tell who wants it.
 #pragma once
 

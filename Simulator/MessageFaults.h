@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Damages the stream of messages as the requested faults say.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Where the daemon's messages come from: a scenario, a capture, a synthetic load.
 #pragma once
 

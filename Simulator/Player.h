@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Plays a source of messages to the daemon's applications: in its own time, faster or slower, or as fast as
 // the applications take it. Time in the world stands still while no application streams.
 #pragma once

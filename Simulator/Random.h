@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Numbers that look random and are the same for the same seed on every machine.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Sends the records of a world when they have news, and now and then when they have none.
 #pragma once
 

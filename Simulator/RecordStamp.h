@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The header fields of a log record that no decoder reads, but readers of files do: length and time.
 #pragma once
 

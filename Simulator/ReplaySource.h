@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Plays a capture's messages with the timing with which they arrived.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A simulated handset and its surroundings, moved on in steps. Equal seeds give equal messages.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The scenarios, by technology and name. To add one: a row in ScenarioList.cpp.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A whole simulated handset: the daemon's server, its log channels, what is played to them, and the faults
 // that come with time.
 #pragma once

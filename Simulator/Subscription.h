@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The log codes that an application asked for in its start command.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a run of readings says: series, cells, events and alarms. Plain values in, no clock and no output.
 #pragma once
 

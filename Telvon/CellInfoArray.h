@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The telephony daemon's cell list, as its cell-information record carries it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Keys and values of the cell dictionaries in the telephony daemon's cell list.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Technology identifiers of the telephony interface: what a daemon answers to "GetTechnology".
 #pragma once
 

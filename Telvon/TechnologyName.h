@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Technology identifiers as people write them.
 #pragma once
 

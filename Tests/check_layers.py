@@ -1,8 +1,9 @@
 #!/usr/bin/env python3
+# SPDX-License-Identifier: Apache-2.0
 """Checks the one rule of direction: a folder includes only what stands below it.
 
 Also that one technology includes nothing of another, that headers other than the C++ standard library's are included
-only where the platform, captures or tools are, and that every test is built.
+only where the platform, captures or tools are, that every test is built, and that every source names its licence.
 """
 
 import pathlib
@@ -16,6 +17,7 @@ HOUSE = ["Plist", "Platform", "Radio", "Telvon", "Dlf", "LogGenerator", "Model",
 TECHNOLOGIES = {"GSM", "LTE", "UTRAN", "C2K", "ObjectStream"}
 MIRRORS = ["Tests", "Bench"]
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
+LICENCE = "SPDX-License-Identifier: Apache-2.0"
 STANDARD = re.compile(r"^[a-z_]+$")  # <vector>, <cstdint>; neither <syslog.h> nor <QTimer>
 
 
@@ -75,6 +77,11 @@ def builds(targets: pathlib.Path, name: str) -> bool:
     return any(("SOURCES" in call) == (name in call) for call in calls)
 
 
+def faults_of_licence(path: pathlib.Path):
+    if LICENCE not in (ROOT / path).read_text().split("\n", 1)[0]:
+        yield f"{path}: its first line does not say {LICENCE}"
+
+
 def sources(folders):
     for folder in folders:
         for path in sorted((ROOT / folder).rglob("*")):
@@ -85,7 +92,8 @@ def sources(folders):
 def main() -> int:
     house = list(sources(HOUSE))
     found = [fault for path in house for fault in faults_of_direction(path)]
-    found += [fault for path in [*house, *sources(MIRRORS)] for fault in faults_of_technology(path)]
+    for path in [*house, *sources(MIRRORS)]:
+        found += [*faults_of_technology(path), *faults_of_licence(path)]
     found += tests_not_built()
     for fault in found:
         print(fault, file=sys.stderr)

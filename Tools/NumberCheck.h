@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A check of an option's number that says in plain words what is wrong with it.
 #pragma once
 

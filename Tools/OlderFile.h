@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What --force is for.
 #pragma once
 

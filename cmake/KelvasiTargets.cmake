@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 # How every target of the project is compiled.
 add_library(kelvasi_options INTERFACE)
 target_compile_options(kelvasi_options INTERFACE -Wall -Wextra -Wconversion -Wshadow)
@@ -9,6 +10,11 @@ if(KELVASI_SANITIZE)
   target_compile_options(kelvasi_options INTERFACE $<$<CXX_COMPILER_ID:GNU>:-Wno-maybe-uninitialized>)
   target_link_options(kelvasi_options INTERFACE -fsanitize=${KELVASI_SANITIZE})
 endif()
+
+# Tests are compiled for the time until they run: what they test is optimised, they themselves are not.
+add_library(kelvasi_test_options INTERFACE)
+target_compile_options(kelvasi_test_options INTERFACE -O0 -g1)
+target_link_libraries(kelvasi_test_options INTERFACE kelvasi_options)
 
 # kelvasi_sources(OUT [EXCEPT ...]): the sources of the folder and of the rooms in it, found anew when some come or go.
 # A room with a CMakeLists.txt is a target of its own.
@@ -43,7 +49,7 @@ function(kelvasi_test NAME)
     kelvasi_sources(ARG_SOURCES EXCEPT ${ARG_EXCEPT})
   endif()
   add_executable(${NAME} ${ARG_SOURCES} ${ARG_ALSO})
-  target_link_libraries(${NAME} PRIVATE kelvasi_options ${ARG_LINK} GTest::gmock GTest::gtest_main)
+  target_link_libraries(${NAME} PRIVATE kelvasi_test_options ${ARG_LINK} GTest::gmock GTest::gtest_main)
   kelvasi_precompiled(${NAME} ${ARG_PRECOMPILED} test)
   gtest_discover_tests(${NAME} DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 120)
 endfunction()

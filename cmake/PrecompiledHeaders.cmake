@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 # Headers that are parsed once instead of in every source. A source still includes all that it needs itself.
 
 set(KELVASI_STANDARD_HEADERS
@@ -36,8 +37,8 @@ if(KELVASI_PRECOMPILE)
   if(KELVASI_TESTS)
     find_package(GTest REQUIRED)
     set(TEST_HEADERS <gmock/gmock.h> <gtest/gtest.h>)
-    kelvasi_precompile(test HEADERS ${TEST_HEADERS} LINK GTest::gmock)
-    kelvasi_precompile(qt_test HEADERS ${TEST_HEADERS} ${CORE_HEADERS} LINK GTest::gmock Qt6::Core)
-    kelvasi_precompile(widgets_test HEADERS ${TEST_HEADERS} ${WIDGETS_HEADERS} LINK GTest::gmock Qt6::Widgets)
+    kelvasi_precompile(test HEADERS ${TEST_HEADERS} LINK kelvasi_test_options GTest::gmock)
+    kelvasi_precompile(qt_test HEADERS ${TEST_HEADERS} ${CORE_HEADERS} LINK kelvasi_test_options GTest::gmock Qt6::Core)
+    kelvasi_precompile(widgets_test HEADERS ${TEST_HEADERS} ${WIDGETS_HEADERS} LINK kelvasi_test_options GTest::gmock Qt6::Widgets)
   endif()
 endif()

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The viewer without a display: its start, and a tick from the state to painted rows.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Captures for the benchmarks, made in the build directory.
 #pragma once
 

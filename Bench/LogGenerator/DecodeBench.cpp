@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Bench/LogGenerator/DecodeBench.h"
 
 #include "Bench/LogGenerator/Decoding.h"

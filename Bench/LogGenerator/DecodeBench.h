@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Decoding, record type by record type and in mixtures.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A generator at work, driven as the model drives it.
 #pragma once
 

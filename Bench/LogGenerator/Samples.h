@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records that the benchmarks decode. To add one, add a line to the table of its technology.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The display tree and the tick that builds it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Bench/Platform/ChannelBench.h"
 
 #include "Bench/LogGenerator/DecodeBench.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The far end of the measured log channel: a telephony daemon that sends as many messages as it is told to.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a measurement is compared with, on the same messages.
 #pragma once
 

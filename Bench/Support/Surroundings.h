@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The surroundings of the benchmarks: the real ones, with traces masked and the system log's lines dropped.
 #pragma once
 

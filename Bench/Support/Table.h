@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The table that the benchmarks fill: a row per measurement, each the median of its repetitions.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How figures and tables are written.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Bench/Tools/DecodeToolBench.h"
 
 #include "Bench/Capture/MixedCapture.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What `kelvasictl decode` does: captures to displays, and its start.
 #pragma once
 

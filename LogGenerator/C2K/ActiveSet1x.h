@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The pilots of the 1x active set with their Ec/Io.
 #pragma once
 

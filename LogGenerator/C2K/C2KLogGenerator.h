@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The generator of the Orvane CDMA2000 baseband. It has no decoder classes: the template is walked into a
 // display and a lookup table, and the record parsers write by lookup name.
 //

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The CDMA display is addressed by lookup names: the template says which leaves of the display each name
 // fills.
 #pragma once

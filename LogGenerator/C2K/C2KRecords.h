@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The CDMA record parsers, one per log code. Each checks the record's length, and on a failure logs it and
 // leaves every row as it was.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/C2K/C2KSections.h"
 
 #include <algorithm>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Where the dictionaries of a CDMA display stand, for the readings of what is written into them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a record parser is given: the record, the generator state, and where to write.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x119C: state, RF and active set of the 1x air interface (3GPP2 C.S0005), in four sub-packets.
 #pragma once
 

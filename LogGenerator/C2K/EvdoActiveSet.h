@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x12B6: the pilots of the EV-DO active set.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Records 0x1192 and 0x127E: packet counters of the EV-DO forward and reverse links, from which the data
 // rates follow.
 #pragma once

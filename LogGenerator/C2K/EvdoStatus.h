@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x1183: state and RF of the EV-DO air interface (3GPP2 C.S0024).
 #pragma once
 

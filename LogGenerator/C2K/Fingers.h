@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x108A: carrier to interference of the rake receiver's fingers.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What the records hold in place of a PN offset where there is no pilot.
 #pragma once
 

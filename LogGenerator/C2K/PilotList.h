@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A list of pilots as the display shows it: sorted, keyed by the place in the record and the PN offset.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Records that are made of sub-packets: a count at byte 14, then from byte 17 on one sub-packet after the
 // other.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x134F: identities of the 1x system.
 #pragma once
 

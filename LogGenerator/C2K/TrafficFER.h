@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x119D: whether a frame of the 1x traffic channel was received in error.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Texts of the values that several records show. Each ends with its value, as the texts of values past them
 // do.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Rows of cells from the telephony daemon's cell list.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "PDP Context Info": the PDP contexts as the telephony daemon lists them, whatever their keys.
 #pragma once
 

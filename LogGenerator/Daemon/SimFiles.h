@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The SIM-file record of the telephony daemon: a property-list dictionary of elementary files (3GPP TS
 // 31.102, 4.2).
 #pragma once

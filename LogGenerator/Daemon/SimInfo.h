@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "SIM Info": elementary files of the SIM as the telephony daemon hands them over, whatever their
 // kind.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Active Set" (3GPP TS 25.331, 8.4): the WCDMA cells of the active set, record 0x417A.
 #pragma once
 

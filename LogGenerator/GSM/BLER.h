@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "BLER": what the block error rate of each transport channel is made of, record 0x4116.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x51FF: the base-station identity codes (3GPP TS 23.003, 4.3.2) of cells, by ARFCN.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x417A: the WCDMA cells that the searcher follows, with the set that each belongs to and its energy.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Coding Scheme": asks for no records, so it shows what the template holds.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x7150: a count, then the equivalent PLMNs.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/GSM/EquivalentPLMNList.h"
 
 #include "LogGenerator/GSM/EquivalentPLMN.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Equivalent PLMN List" (3GPP TS 24.008, 10.5.1.13), record 0x7150.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x7130: the GPRS mobility-management state (3GPP TS 24.008, 4.1.3.1) of the packet-switched domain.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x51F6: the GPRS cell options (3GPP TS 44.060, 12.24). Two sections show the DRX timer of it.
 #pragma once
 

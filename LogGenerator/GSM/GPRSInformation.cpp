@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/GSM/GPRSInformation.h"
 
 #include "LogGenerator/GSM/GPRSCellOptions.h"

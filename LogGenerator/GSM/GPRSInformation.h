@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "GPRS Information": what the GSM serving cell offers for GPRS.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records of GPRS in the serving cell: where SI13 is, access, the packet broadcast channel and its
 // status.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records of the GSM serving cell: its identity and the dedicated channel.
 #pragma once
 

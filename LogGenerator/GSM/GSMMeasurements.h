@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x5137: measurements of the GSM serving cell and its neighbours. Four sections read it, two of them
 // the same two words as different things.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "GSM RR Info": state and reception of GSM radio resource management.
 #pragma once
 

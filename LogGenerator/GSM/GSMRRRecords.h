@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records of GSM radio resource management (3GPP TS 44.018): its state, and discontinuous transmission.
 #pragma once
 

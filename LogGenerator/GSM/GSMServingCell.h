@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "GSM Serving Cell": identity, channel and measurements of the GSM serving cell.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "GSM Set": the GSM cells ranked for reselection, record 0x4005.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x4221: statistics of the HARQ processes of HSDPA (3GPP TS 25.321, 4.2.3).
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "HSDPA Info": statistics of the HARQ processes, record 0x4221.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A set of WCDMA cells (3GPP TS 25.331, 8.4) whose section every cell-sets record empties and none fills.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x51F8: the hopping sequence number and the frequencies of the mobile allocation (3GPP TS 45.002,
 // 6.2.2).
 #pragma once

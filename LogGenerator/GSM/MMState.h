@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x7131: the mobility-management state (3GPP TS 24.008, 4.1.2.1) of the circuit-switched domain.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Mobile Allocation": the frequencies that the dedicated channel hops over, record 0x51F8.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Monitored Set": emptied by each cell-sets record, never filled.
 #pragma once
 

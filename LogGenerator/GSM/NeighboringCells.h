@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Neighboring Cells": the GSM neighbours, as measured in record 0x5137 or as the cell list has them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x4005: the UMTS and GSM cells ranked for reselection (3GPP TS 25.304, 5.2.6).
 #pragma once
 

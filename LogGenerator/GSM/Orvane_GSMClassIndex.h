@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The decoders of the GSM/UMTS technology.
 //
 // To add one: declare the record in a header of its own (layout, count and entries, rows), write the decoder

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/GSM/Orvane_GSMLogGenerator.h"
 
 #include "LogGenerator/GSM/Orvane_GSMClassIndex.h"

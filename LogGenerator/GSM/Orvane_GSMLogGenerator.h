@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The generator of the Orvane GSM/UMTS baseband.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Process CO": the service and MM states that both domains have in common.
 #pragma once
 

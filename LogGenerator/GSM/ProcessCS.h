@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Process CS": mobility management of the circuit-switched domain.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Process PS": mobility management of the packet-switched domain.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x7135: the registered PLMN with its location and routing area.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x7132: registration state and PLMN selection mode. The three Process decoders show the same row of
 // it, each in its own section.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Serving PLMN": the network that the handset is registered in.
 #pragma once
 

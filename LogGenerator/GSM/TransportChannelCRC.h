@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x4116: CRCs of each transport channel, received and received in error, over a window.
 #pragma once
 

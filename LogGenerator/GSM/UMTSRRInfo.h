@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "UMTS RR Info": RRC state, transmit power and serving cell in UMTS.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/GSM/UMTSSet.h"
 
 #include "LogGenerator/GSM/NeighbourSets.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "UMTS Set": the UMTS cells ranked for reselection, record 0x4005, or the UMTS neighbours of the
 // cell list.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xB179: the intra-frequency measurement in connected mode, with its measured and detected cells.
 #pragma once
 

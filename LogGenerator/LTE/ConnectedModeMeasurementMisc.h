@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Connected mode LTE Intra-frequency Measurement": the serving cell as measured in connected mode.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Detected Cells": the cells detected and not measured in connected mode.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The decoders of the LTE technology.
 //
 // To add one: write its class beside the others, then add a line below. The order is the order of creation,

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/LTE/MeasuredNeighborCells.h"
 
 #include "LogGenerator/LTE/ConnectedModeMeasurement.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Measured Neighbor Cells": the neighbour cells measured in connected mode.
 #pragma once
 

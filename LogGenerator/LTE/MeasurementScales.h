@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How the measurements of LTE records are scaled (ranges after 3GPP TS 36.133, 9.1). The records do not agree
 // on the steps: each names its own.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Neighbor Cells List": the neighbour cells as measured in idle mode.
 #pragma once
 

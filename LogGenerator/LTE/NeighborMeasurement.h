@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xB180: the neighbour cells measured on one frequency in idle mode.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Neighbor Measurements": what the neighbour cells of a measurement have in common.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xB186: the cells of any technology that are candidates for reselection.
 #pragma once
 

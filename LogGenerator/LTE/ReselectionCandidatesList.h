@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Reselection Candidates List": the candidates for reselection, each with the rows of its
 // technology.
 #pragma once

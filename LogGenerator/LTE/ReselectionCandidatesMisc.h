@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Reselection Candidates": the cell from which reselection looks for candidates.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xB0C2: the identity, frequencies and bandwidths of the serving cell.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Serving Cell Measurements": the serving cell as measured in idle mode.
 #pragma once
 

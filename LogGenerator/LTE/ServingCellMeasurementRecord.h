@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xB17F: the measurement of the serving cell in idle mode, with what cell selection makes of it.
 #pragma once
 

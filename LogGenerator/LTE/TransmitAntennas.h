@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xB0C1: the antennas of the serving cell.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The generator of the IFX baseband, whose messages are property lists that already hold the whole display:
 // they are parsed, simplified and shown. No template, no decoders, no DLF file.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/UTRAN/CCTRCHSIRMeasurement.h"
 
 #include "LogGenerator/UTRAN/ChannelMeasurement.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "CCTRCH SIR": the signal-to-interference ratios of the coded composite channels.
 #pragma once
 

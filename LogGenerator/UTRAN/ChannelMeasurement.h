@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xD00C: the transport channels with their block error rates, and behind them the coded composite
 // transport channels with their signal-to-interference ratios.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "GSM Neighbor Cell List": stays empty, whatever the GSM neighbour record says.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xD00E: the GSM neighbour cells.
 #pragma once
 

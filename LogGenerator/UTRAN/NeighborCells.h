@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xD00A: the UTRAN neighbour cells.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xD0E0: the state of the radio resource control (3GPP TS 25.331, 7.1).
 #pragma once
 

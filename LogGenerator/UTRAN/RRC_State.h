@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "RRC Info": the state of the radio resource control.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0xD0E2: the serving cell.
 #pragma once
 

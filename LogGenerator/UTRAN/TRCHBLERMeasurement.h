@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "TRCH BLER": the block error rates of the transport channels.
 #pragma once
 

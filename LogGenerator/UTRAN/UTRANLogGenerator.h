@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The generator of the Orvane UTRAN baseband. Its template is the first property-list resource with "UTRAN",
 // in any case, in its path within the package; without one the generator asks for no records and shows
 // nothing.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Neighbor Cell List": the UTRAN neighbour cells.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Section "Serving Cell Info": the serving cell.
 #pragma once
 

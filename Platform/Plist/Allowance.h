@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a property list may still hold while it is walked.
 #pragma once
 

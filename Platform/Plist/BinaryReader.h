@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Binary property lists, read into values.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Where a binary property list keeps its objects: the trailer and the table of offsets.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A date goes through a binary document that holds nothing else, where it is a double.
 #include <array>
 #include <bit>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Property lists: read by XmlReader.h and BinaryReader.h, written through libplist.
 #pragma once
 

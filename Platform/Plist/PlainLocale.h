@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The "C" locale, for this thread and as long as the object lives: numbers are read and written as property
 // lists have them, whatever the user's locale says of decimal commas.
 #pragma once

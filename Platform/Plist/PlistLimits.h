@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How much of a property list from outside is accepted.
 #pragma once
 

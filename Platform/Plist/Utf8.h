@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // UTF-8 texts and the characters XML 1.0 can hold.
 #pragma once
 

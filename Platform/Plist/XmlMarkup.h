@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The markup around the values of an XML property list.
 #pragma once
 

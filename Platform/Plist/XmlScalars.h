@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What the elements of an XML property list that hold no others contain. Each gives nothing for a text that
 // is no such value, white space around it aside.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // When the program was built.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Another program, run beside this one without a shell, once at a time.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Where a user's own settings lie.
 #pragma once
 

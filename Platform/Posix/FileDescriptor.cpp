@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Platform/Posix/FileDescriptor.h"
 
 #include <sys/stat.h>

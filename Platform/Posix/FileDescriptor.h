@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // An open file descriptor, owned, and whole transfers over it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How the process keeps the memory of large, short-lived blocks.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Which lines of the system log are written.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A file that grows piece by piece: each piece is in it whole or not at all, and the system has it when the
 // call returns. It is its owner's alone (0600), as far as this class has made it.
 #pragma once

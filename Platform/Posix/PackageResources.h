@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The application package as a directory of files.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The system's clock and the user's time zone (TZ, else the machine's).
 #pragma once
 

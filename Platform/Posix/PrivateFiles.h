@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Files and folders for their owner's eyes only, whatever the umask: 0600 and 0700.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The system log: syslog(3), or the standard error for whoever watches the program run. Both write a text as
 // it is: a line feed inside it stays, so a text with several lines, as a printed dictionary has, reads as it
 // was composed. Only strings of received property lists can bring line feeds from outside.

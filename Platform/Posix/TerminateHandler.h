@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The last words of a process that ends by an uncaught exception.
 #pragma once
 

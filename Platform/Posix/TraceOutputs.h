@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Traces on the standard streams, each line flushed: the process may be about to abort.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Sockets that processes left in the runtime directory when they were killed.
 #pragma once
 

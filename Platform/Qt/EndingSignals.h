@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The signals that end a program well.
 #pragma once
 

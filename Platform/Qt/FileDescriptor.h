@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The owner of one file descriptor.
 #pragma once
 

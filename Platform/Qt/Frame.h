@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // One frame of the log channel's sockets, as Docs/log-channel.md lays it out: a header of 16 bytes, then
 // data.
 #pragma once

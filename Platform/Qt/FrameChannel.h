@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // One connected socket that carries frames, on the event loop or, for a bounded time, waited for.
 #pragma once
 

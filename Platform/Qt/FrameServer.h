@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A name of the runtime directory and the connections to it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A socket under a name of the runtime directory, and those who connect to it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What an application and the daemon's server tell each other in their frames.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Who is at the other end of a Unix-domain socket.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // An application's connection to the daemon's server.
 #pragma once
 

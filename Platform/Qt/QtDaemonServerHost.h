@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The daemon's server, for whoever plays the daemon; the bytes are those of Docs/log-channel.md.
 #pragma once
 

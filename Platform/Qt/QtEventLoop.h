@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The event loop of a tool's main: everything of the main thread happens inside run().
 #pragma once
 

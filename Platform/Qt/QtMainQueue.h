@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The main queue on Qt's event loop. Used from the main thread only.
 #pragma once
 

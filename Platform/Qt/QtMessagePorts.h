@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Message ports as sockets of the runtime directory; the bytes are those of Docs/log-channel.md.
 #pragma once
 

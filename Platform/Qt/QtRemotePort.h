@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The sending end of somebody's message port.
 #pragma once
 

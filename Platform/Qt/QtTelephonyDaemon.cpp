@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Platform/Qt/QtTelephonyDaemon.h"
 
 #include "Platform/Qt/QtDaemonConnection.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The telephony daemon's server as an application sees it; the bytes are those of Docs/log-channel.md.
 #pragma once
 

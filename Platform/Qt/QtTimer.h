@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A repeating timer of the main queue.
 #pragma once
 

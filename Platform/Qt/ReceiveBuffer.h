@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a socket delivered, cut into frames.
 #pragma once
 

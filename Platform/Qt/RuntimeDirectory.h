@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The private directory in which the sockets of one user meet.
 #pragma once
 

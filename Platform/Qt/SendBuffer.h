@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Frames on their way into a socket.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Connecting to a named socket of the runtime directory.
 #pragma once
 

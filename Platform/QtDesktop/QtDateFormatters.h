@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Dates in the user's locale and time zone.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Preferences as one INI file for each domain, and the notice of a change as a signal on the session bus;
 // both are described in Docs/preferences.md.
 #pragma once

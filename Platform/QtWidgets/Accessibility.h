@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Roles, names and actions of this toolkit's own widgets, for screen readers.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A card with a message and one button, over everything else.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A button that is a text in the colour of what can be pressed: in bars, forms and alerts. The default
 // button's is bold.
 #pragma once

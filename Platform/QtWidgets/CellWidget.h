@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // One row of a table: its content, its accessory and the line below it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A label of one line that ends in an ellipsis where there is no room for all of its text.
 #pragma once
 

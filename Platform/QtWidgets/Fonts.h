@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Fonts of the platform, and the room that texts take in them.
 #pragma once
 

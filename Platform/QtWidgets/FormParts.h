@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What forms are made of: a ground with rounded corners, the ground behind it that can be touched, and texts.
 #pragma once
 

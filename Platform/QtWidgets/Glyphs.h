@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The few shapes that the viewer draws itself. Each is centred in its rectangle, in points.
 #pragma once
 

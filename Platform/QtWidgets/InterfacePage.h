@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A page made from an interface resource. The resources are compiled in: Qt Designer's files in Resources/ go
 // through uic, so that a fault in one stops the build and no reader of such files is needed to run.
 #pragma once

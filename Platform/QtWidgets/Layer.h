@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What lies over the whole window for a while: as large as its parent, and the keyboard stays in it.
 #pragma once
 

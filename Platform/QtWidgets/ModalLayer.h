@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A page over the whole window, which rises from the bottom.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The bar above the panes: where one is, and the way back.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The toolkit's half of a controller: a widget, and what the bars around it show.
 #pragma once
 

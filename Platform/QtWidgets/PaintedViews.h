@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Labels and scrollable views that have no widget of their own: the widget of their row draws them, at
 // exactly the place that they were given.
 #pragma once

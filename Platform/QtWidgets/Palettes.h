@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The viewer's colours, as palettes: every widget takes them from its own palette.
 //   Base             rows                  AlternateBase  a row that is pressed or selected
 //   Window           bars                  Light          the ground behind cards

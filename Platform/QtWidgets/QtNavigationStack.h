@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The stack of panes with the bars above and below it, and the view that may lie over it.
 #pragma once
 

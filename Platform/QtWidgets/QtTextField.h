@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A line edit as a text field.
 #pragma once
 

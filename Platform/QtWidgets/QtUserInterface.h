@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The toolkit on Qt's widgets. Needs a QApplication that outlives it; one at a time.
 #pragma once
 

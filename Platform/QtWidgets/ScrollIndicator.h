@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The thin mark at the edge that tells where in a table one is; it shows while the table scrolls.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Pictures of what was shown and what is shown now, sliding past each other over the real thing.
 #pragma once
 

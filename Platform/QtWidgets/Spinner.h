@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A small turning wheel: something is being waited for.
 #pragma once
 

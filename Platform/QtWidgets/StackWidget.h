@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A navigation bar, a page and a toolbar above each other.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Whether the desktop is light or dark, and when that changes.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A table: only the rows in sight have widgets, however many there are.
 #pragma once
 

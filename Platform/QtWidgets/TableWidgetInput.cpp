@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What fingers, mouse, wheel and keyboard do to a table.
 #include <QAccessible>
 #include <QFocusEvent>

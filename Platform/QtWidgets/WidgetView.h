@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Views that are widgets.
 #pragma once
 

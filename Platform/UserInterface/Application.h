@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The application object, and how a program hands control to the application framework.
 #pragma once
 

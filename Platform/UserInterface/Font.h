@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A font as the application names it.
 #pragma once
 

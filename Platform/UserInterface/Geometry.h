@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Points and rectangles of the screen, in points (logical pixels); y grows downwards.
 #pragma once
 

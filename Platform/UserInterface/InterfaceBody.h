@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A screenful made from an interface resource, its parts found by name.
 #pragma once
 

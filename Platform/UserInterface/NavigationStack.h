@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A stack of screenfuls of which the top one is seen, and the one view that may lie over it. The order of the
 // notices is the same for every toolkit; a toolkit only draws the changes.
 #pragma once

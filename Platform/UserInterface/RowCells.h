@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The cells of a table: one for each row in sight, the others waiting to be used again. Shared by the
 // toolkits.
 #pragma once

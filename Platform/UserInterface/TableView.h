@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A plain table of rows, and what it asks of whoever fills it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // One row of a table on the screen.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A field for one line of text.
 #pragma once
 

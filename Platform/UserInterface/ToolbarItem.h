@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What stands in a toolbar, left to right.
 #pragma once
 

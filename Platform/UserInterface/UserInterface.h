@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The toolkit: makes what the application shows. Everything it makes is gone before the toolkit is.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What can be placed on the screen, and what can hold it.
 #pragma once
 

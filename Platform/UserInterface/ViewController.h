@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The base of the application's screens: a toolkit's half, and notices that a subclass may take.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The one window, and the screen it fills.
 #pragma once
 

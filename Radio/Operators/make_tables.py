@@ -1,4 +1,5 @@
 #!/usr/bin/env python3
+# SPDX-License-Identifier: Apache-2.0
 """Writes the tables of operators and countries as C++.
 
 Operators by MCC and MNC come from mobile-broadband-provider-info, networks.csv over them; the countries of a mobile

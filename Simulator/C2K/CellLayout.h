@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The base stations of a simulated town: every site sends one 1x and one EV-DO carrier with the same pilot.
 #pragma once
 

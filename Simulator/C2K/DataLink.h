@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What EV-DO carries: packets counted by their transmission format (3GPP2 C.S0024-A), as the records of both
 // rates tell them once a second.
 #pragma once

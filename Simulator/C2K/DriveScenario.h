@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Scenario "drive" of CDMA2000: a handset with 1x and EV-DO on its way through a town, told by every record
 // of the technology.
 #pragma once

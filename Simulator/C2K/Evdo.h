@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The EV-DO side of the handset: its air-interface states and its session (3GPP2 C.S0024), simplified. It
 // shares one radio with 1x, and is off while 1x registers or is in a call.
 #pragma once

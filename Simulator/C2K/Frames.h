@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How the forward traffic channel of 1x is received: its frames of 20 ms, each whole or in error.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Simulator/C2K/OneX.h"
 
 #include <algorithm>

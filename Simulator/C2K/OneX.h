@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The 1x side of the handset: from the search for a system over idle and access to a call, and back
 // (3GPP2 C.S0005: Initialization, Idle, System Access and Control on the Traffic Channel), simplified.
 #pragma once

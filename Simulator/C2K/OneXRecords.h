@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records of the 1x side, encoded from the world.
 #pragma once
 

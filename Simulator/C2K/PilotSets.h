@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The pilot sets that a handset keeps (3GPP2 C.S0005 for 1x, C.S0024 for EV-DO): active, candidate and
 // neighbour pilots, moved between them by their strength, simplified.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Strengths of pilots as the records of fingers and of EV-DO hold them.
 #pragma once
 

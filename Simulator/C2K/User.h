@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What the handset's user wants of it: calls and data sessions, with pauses between them.
 #pragma once
 

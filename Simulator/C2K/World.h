@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The world of the CDMA drive: a town's base stations, what the radio does to them, and one handset with both
 // air interfaces. All records are encoded from it, so that what they tell of one moment agrees.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The telephony daemon's cell list: the serving cell and its neighbours as the handset measured them last.
 #pragma once
 

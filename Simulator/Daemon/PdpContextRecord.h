@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The PDP contexts as the telephony daemon lists them.
 #pragma once
 

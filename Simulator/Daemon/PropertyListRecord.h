@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Extra records of the telephony daemon itself: a header and a property list.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The SIM files that the telephony daemon read when the handset was switched on.
 #pragma once
 

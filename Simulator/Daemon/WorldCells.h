@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The cells of the drive's world for the telephony daemon's list.
 #pragma once
 

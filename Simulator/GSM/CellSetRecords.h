@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records of cell sets: what the searcher follows, and what is ranked for reselection.
 #pragma once
 

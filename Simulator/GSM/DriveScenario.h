@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Scenario "drive": a handset on its way through a town of GSM and UMTS cells, told by every record of the
 // technology.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Simulator/GSM/GprsRecords.h"
 
 #include "LogGenerator/GSM/GPRSCellOptions.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a GSM cell broadcasts of its packet service. Each is nothing while GSM does not serve.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records of GSM radio resources. Each is nothing while there is nothing to tell.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Scenario "mobility": a handset that registers, moves between areas, calls, transfers data and loses
 // service, told by the mobility-management records alone.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The mobility-management records, from the registration that they report.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records of UMTS radio resource control and of its transport channels.
 #pragma once
 

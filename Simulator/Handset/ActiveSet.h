@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The UMTS cells that a connection uses at once (3GPP TS 25.331, 14.1.2: events 1A, 1B and 1C), simplified.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Which cell serves the handset: selection, reselection and handover (3GPP TS 25.304, 45.008), simplified.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Mobility management of the circuit-switched domain (3GPP TS 24.008, 4.1.2.1), with calls.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Mobility management of the packet-switched domain (3GPP TS 24.008, 4.1.3.1), with data sessions.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A phase of a mobility-management procedure: what the record of the state says meanwhile, how long it lasts
 // and what it asks of the radio.
 #pragma once

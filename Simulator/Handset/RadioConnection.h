@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The handset's radio connection: RRC state in UMTS, RR state in GSM, as registration and user need it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The handset's registration with its network: both domains, and the user who switches it on and off.
 #pragma once
 

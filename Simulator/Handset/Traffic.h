@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What the UMTS transport channels carried in the last reporting period: HSDPA and block errors.
 #pragma once
 

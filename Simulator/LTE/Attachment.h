@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The handset's attachment to the LTE core and its RRC connection (3GPP TS 24.301, 5.1.3.2;
 // TS 36.331, 4.2.1), with a user who switches it on and off and sends data now and then.
 #pragma once

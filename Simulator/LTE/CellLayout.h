@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The LTE cells of the simulated town, with the GSM and UMTS cells of the same sites.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Scenario "drive" of LTE: a handset on its way through a town of three LTE carriers above UMTS and GSM, told
 // by every record of the technology.
 #pragma once

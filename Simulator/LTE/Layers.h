@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The layers of the town's networks: what cells broadcast for reselection between carriers and technologies
 // (3GPP TS 36.331, system information blocks 3 and 5 to 7).
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records of the LTE baseband. What a record has no room for is told as the nearest value that it can.
 #pragma once
 

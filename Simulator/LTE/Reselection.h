@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Which cell serves the handset: reselection by the priorities of layers, by rank within one (3GPP TS 36.304,
 // 5.2.4), and handover, simplified.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The world of the LTE drive: a town with three LTE carriers above UMTS and GSM, and one handset that drives
 // through. All records are encoded from it, so that what they tell of one moment agrees.
 #pragma once

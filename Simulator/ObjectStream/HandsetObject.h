@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a baseband that sends whole displays says of its handset: one object with everything in it.
 #pragma once
 

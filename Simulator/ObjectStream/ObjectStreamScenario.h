@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Scenario "drive" of the object-stream baseband: a handset's way through a town, told once a second by one
 // property list that holds everything.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A cell of the simulated networks.
 #pragma once
 

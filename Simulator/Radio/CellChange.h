@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A change of the serving cell, for which a reason has to last.
 #pragma once
 

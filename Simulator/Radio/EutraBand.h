@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The operating bands of E-UTRA, their carrier numbers and channel bandwidths (3GPP TS 36.101, tables 5.5-1,
 // 5.6.1-1 and 5.7.3-1), as far as a carrier number of 16 bits reaches.
 #pragma once

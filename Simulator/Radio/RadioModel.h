@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a handset receives of every cell where it is: path loss, shadowing, interference, and places into
 // which the radio hardly reaches.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a handset reports of what it receives: the ends of the scales of 3GPP TS 25.133 (9.1.1 and 9.1.2),
 // TS 45.008 (8.1.4) and TS 36.133 (9.1.4 and 9.1.7), and what lies beyond them as their end. dBm and dB.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The way of a handset through the town: a closed route, driven with stops.
 #pragma once
 

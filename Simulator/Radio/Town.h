@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The town that every drive goes through: its extent, its sites, and the networks that have them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The cells of the simulated town where UTRA is in TDD mode (3GPP TS 25.102), with the GSM cells of the same
 // sites.
 #pragma once

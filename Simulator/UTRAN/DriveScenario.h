@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Scenario "drive" of UTRAN: a handset on its way through a town of UTRA TDD and GSM cells, told by every
 // record of the technology.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What is worth an alarm, in one line:
 //
 //   rsrp < -115 for 10s             a value of the serving cell beyond a threshold: <, <=, >, >=

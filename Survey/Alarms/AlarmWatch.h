@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Watches values and events for what its rules call an alarm. Time is pushed: with every value and event, and
 // by pass() where nothing may come.
 //

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The words of a rule, one after the other.
 #pragma once
 

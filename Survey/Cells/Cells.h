@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The cells of a drive, over all kinds of records and technologies.
 //
 // A value belongs to the cell that its reading names. A reading that names a part of an identity only (an

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a drive has told of one cell.
 #pragma once
 

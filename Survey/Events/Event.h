@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Something that happened in a drive.
 #pragma once
 

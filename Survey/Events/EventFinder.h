@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Finds what happens in a stream of readings. Time is pushed: with every message, and by pass() where none
 // may come.
 #pragma once

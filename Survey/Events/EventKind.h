@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What can happen in a drive.
 #pragma once
 

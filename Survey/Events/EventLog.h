@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The newest events of a drive. Those that made way for newer ones are counted.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A run of buckets of one series, at one resolution. A bucket that saw no value takes no place.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // All series at one resolution: a ring of blocks that they share. Allocates nothing once it is built; memory
 // is touched only as it fills.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What was measured over time, for each cell and quantity: minimum, maximum, mean and count for each second.
 //
 // All series share blocks of a fixed number, so memory is bounded however many cells a drive meets; nothing

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What the values of one stretch of time come to.
 #pragma once
 

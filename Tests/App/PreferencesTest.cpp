@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The signal-strength switch of the home screen, and the clean-up that nothing calls.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

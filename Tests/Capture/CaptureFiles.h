@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Captures written by hand and what reading them gives.
 #pragma once
 

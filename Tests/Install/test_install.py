@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """What is installed, where it is found again, and how a packager configures and compiles."""
 
 import json

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The bit reader against a slow one that picks bit after bit.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Feeds records of every length to all decoders of a class index, each with a section of its own.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Texts that are made when somebody looks.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Every number of a technology against the limits of its bands, which are typed from the standards' tables of
 // operating bands and not from those of channel numbers.
 #pragma once

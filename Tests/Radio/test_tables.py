@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """The tables of operators and countries against the packages that they come from, and what the build makes of others."""
 
 import json

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The display templates as they are installed, through the same reader and tree as the viewer's.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Decodes messages as a viewer does, with the generator of a technology, and lets a test read the display.
 #pragma once
 

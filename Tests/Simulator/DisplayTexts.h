@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Every text of a display, with the way to it.
 #pragma once
 

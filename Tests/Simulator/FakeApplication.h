@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // An application at the other end of a log channel: what it asks is the test's to say, and what it received
 // can be looked at.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Plays a scenario step by step, and what every scenario is asked.
 #pragma once
 

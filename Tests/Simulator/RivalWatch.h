@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Watches for how long one and the same cell is better than the serving one before it takes over.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Counts what a test allocates. AllocationCounter.cpp replaces the global operator new of the program that it
 // is compiled into, so it belongs into the sources of that one test program.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The application on a toolkit in memory and fake surroundings.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The names by which the CDMA records address the display.
 #pragma once
 

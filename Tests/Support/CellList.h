@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Cells of the telephony daemon's cell list.
 #pragma once
 

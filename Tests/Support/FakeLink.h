@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Message ports and a telephony daemon in memory, for tests of the session: what each step yields is the
 // test's to set, and what was asked of it can be looked at.
 #pragma once

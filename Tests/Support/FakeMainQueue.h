@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A main queue whose time the test pushes.
 #pragma once
 

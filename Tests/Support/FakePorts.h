@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Message ports and a daemon's server in memory: both sides of a log channel in one process, deterministic.
 // Messages sent without waiting arrive when the main queue runs; requests are handed over at once.
 #pragma once

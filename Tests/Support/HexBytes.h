@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Records typed by hand.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A model on fake surroundings, with a template and a daemon that answers "Orvane_GSM" unless told otherwise.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a pane needs around it: nodes to show, and a shell.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A system log and a trace output that remember what was written.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A decoder with a section of its own, for tests that feed it records and look at its rows.
 #pragma once
 

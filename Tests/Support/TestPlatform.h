@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The surroundings of generators and decoders, in the test's hands.
 #pragma once
 

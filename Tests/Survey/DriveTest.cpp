@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What the survey says of the simulated drives, beside their worlds.
 #include <gtest/gtest.h>
 

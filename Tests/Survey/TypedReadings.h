@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Readings of a message, typed in a test.
 #pragma once
 

@@ -1,4 +1,5 @@
 #!/usr/bin/env python3
+# SPDX-License-Identifier: Apache-2.0
 """Decodes every capture of one technology and compares the display and the error lines with what is expected.
 
 A capture TECH/NAME.pcap comes with NAME.expected.json, the display after its last message or {"crash": reason}, where

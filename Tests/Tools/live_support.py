@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """telvon-sim and live verbs of kelvasictl as processes of a test."""
 
 import os

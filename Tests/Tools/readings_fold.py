@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """From the lines of kelvasictl readings back to the display, as Docs/readings.md says."""
 
 import json

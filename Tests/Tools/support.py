@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """Runs kelvasictl, and writes captures by hand."""
 
 import os

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """kelvasictl: captures that are none, wrong usage, and places that cannot be read or written."""
 
 import json

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """kelvasictl decode: what it prints."""
 
 import gzip

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """./demo, in a checkout of which everything but its own work has been done."""
 
 import os

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """The usual scenario of a technology, from the simulated daemon to the display of its own template."""
 
 import json

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """The daemon and the viewer's model as two processes that find, lose and find each other again."""
 
 import os

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """kelvasictl monitor beside a simulated daemon, both as processes."""
 
 import json

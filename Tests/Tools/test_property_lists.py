@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """What the daemon says in property lists, as it may come: padded, and with numbers that are no cell's."""
 
 import json

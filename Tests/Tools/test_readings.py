@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """kelvasictl readings: the lines make the display, and their numbers are those of the texts."""
 
 import csv

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """The commands that README gives for a first look, as they stand there."""
 
 import os

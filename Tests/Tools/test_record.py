@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """kelvasictl record beside a simulated daemon, both as processes."""
 
 import os

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """What a hang-up does to programs that run until a signal."""
 
 import os

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """kelvasictl decode --dlf and --snapshot: what Save would write."""
 
 import datetime

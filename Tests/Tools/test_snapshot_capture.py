@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """Snapshots as captures: decoded, piped and replayed, and those in which there is nothing to decode."""
 
 import json

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """kelvasictl cells, events, coverage and alarms, over captures and over a live link."""
 
 import csv

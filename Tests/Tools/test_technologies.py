@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """Every technology end to end, as processes: what the daemon simulates is shown, moves, is recorded and saved."""
 
 import json

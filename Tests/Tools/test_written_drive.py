@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """telvon-sim --write: a drive in a file, made at once."""
 
 import json

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """A telephony daemon in the hands of a test, which may do with its sockets what no honest daemon does."""
 
 import pathlib

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A pane's rows as they are drawn: the geometry of the application in the toolkit's window.
 #include <QFontMetricsF>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A script's hands on a window that is not the active one.
 #include "Tools/Kelvasi/ShownWindow.h"
 

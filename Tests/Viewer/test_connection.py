@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """The viewer with a daemon that comes, goes and comes back."""
 
 import plistlib

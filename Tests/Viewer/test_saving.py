@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """Snapshots: saved, not saved and not to be saved."""
 
 import calendar

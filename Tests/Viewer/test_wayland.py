@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """The viewer on a Wayland compositor that draws to nowhere and has neither keyboard nor pointer."""
 
 import os

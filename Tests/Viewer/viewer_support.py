@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """The viewer as a process of a test, without a display, led by a script (Docs/viewer-script.md)."""
 
 import json

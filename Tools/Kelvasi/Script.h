@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Leads the viewer through a script, a command a line: for pictures and tests of the program as it is. The
 // commands are described in Docs/viewer-script.md.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Eyes and hands on the viewer's window: what it shows, and keys and clicks as a user would give them.
 #pragma once
 

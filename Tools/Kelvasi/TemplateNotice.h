@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What the window says of an installation that is not whole.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // kelvasi: wires the viewer to its surroundings.
 #include <cstdio>
 #include <cstdlib>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The program that is run for an alarm.
 #pragma once
 

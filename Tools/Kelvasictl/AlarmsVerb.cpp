@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // kelvasictl alarms: watches captures or a live link by rules, and runs a program for each alarm.
 #include <CLI/CLI.hpp>
 #include <variant>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The survey of one capture. It shares nothing that changes with others, so that it may have a thread of its
 // own.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What became of the messages, as records.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // kelvasictl coverage: what became of the messages of captures or of a live link.
 #include <CLI/CLI.hpp>
 

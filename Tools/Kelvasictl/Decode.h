@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Captures through a generator, with the display ticks that the viewer would have had.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // kelvasictl decode: captures in, the display out.
 #include <CLI/CLI.hpp>
 #include <array>

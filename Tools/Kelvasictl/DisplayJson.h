@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A display as JSON: dictionaries as objects in stored order, arrays, strings, integers, reals (always with a
 // point or an exponent) and booleans; the absent value as null. Besides,
 //   a data blob   {"$data": "<base64>"}

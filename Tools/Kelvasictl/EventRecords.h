@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Events and alarms as records.
 #pragma once
 

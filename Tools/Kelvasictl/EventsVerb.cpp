@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // kelvasictl events: what happened in captures or on a live link.
 #include <CLI/CLI.hpp>
 

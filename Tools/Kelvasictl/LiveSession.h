@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The model on a live link, inside the event loop of a verb.
 #pragma once
 

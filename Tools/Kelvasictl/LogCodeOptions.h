@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The options that ask the daemon for more log codes than the display shows.
 #pragma once
 

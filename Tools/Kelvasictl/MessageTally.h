@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How many messages a verb took in, and how many of them it could not show.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // kelvasictl monitor: the display of a live link, at every update.
 #include <unistd.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The standard output of `monitor`: on a terminal each text takes the place of the one before, elsewhere
 // texts follow one another.
 #pragma once

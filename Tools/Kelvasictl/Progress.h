@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How far a verb has come with its captures, shown on the standard error while that is a terminal.
 #pragma once
 

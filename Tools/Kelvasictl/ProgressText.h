@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // How far the reading of captures has come, in one line for people.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Of readings only those that change what is shown.
 //
 // A list is written anew by every message that has it. As long as its entries have the same rows, only rows

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Which readings of a run are wanted.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Readings as lines of NDJSON or CSV (Docs/readings.md).
 #pragma once
 

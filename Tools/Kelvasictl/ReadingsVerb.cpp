@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // kelvasictl readings: every row that a message wrote or removed, a line each (Docs/readings.md).
 #include <CLI/CLI.hpp>
 #include <vector>

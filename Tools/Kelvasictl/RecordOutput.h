@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Records for the standard output: a table for people, NDJSON or CSV for programs. Each record is printed as
 // it comes and none is kept.
 #pragma once

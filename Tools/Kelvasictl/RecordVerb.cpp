@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // kelvasictl record: a live link to a capture.
 #include <CLI/CLI.hpp>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Text that has to wait for its turn. What is more than a megabyte waits in a file without a name.
 #pragma once
 

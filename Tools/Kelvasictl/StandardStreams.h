@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The standard streams of a tool whose standard output carries its result.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a verb's generator stands on, and the options that choose it.
 #pragma once
 

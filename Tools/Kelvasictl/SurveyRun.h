@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Surveys captures or a live link for the verbs that tell what was in them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The option --technology of the verbs that read captures.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // When the display ticks of a capture fall: every 2.0 s of its time, counted from its first message, where
 // messages have arrived since the tick before.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The verbs of kelvasictl. Each declares its options and says what to do once they are read.
 #pragma once
 

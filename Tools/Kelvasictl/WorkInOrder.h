@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Pieces of work side by side, their results one after the other.
 #pragma once
 

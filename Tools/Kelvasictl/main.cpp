@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // kelvasictl: wires the verbs to the command line.
 #include <CLI/CLI.hpp>
 #include <array>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What telvon-sim plays, as its command line says.
 #pragma once
 

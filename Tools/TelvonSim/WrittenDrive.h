@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A drive that goes into a capture instead of to an application.
 #pragma once
 

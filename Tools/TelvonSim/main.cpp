@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // telvon-sim: wires the simulated telephony daemon to sockets, the event loop and the command line.
 #include <csignal>
 #include <cstdio>

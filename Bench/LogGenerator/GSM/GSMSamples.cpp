@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Bench/LogGenerator/GSM/GSMSamples.h"
 
 #include "LogGenerator/Daemon/SimFiles.h"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Bench/LogGenerator/UTRAN/UTRANSamples.h"
 
 #include "LogGenerator/UTRAN/ChannelMeasurement.h"

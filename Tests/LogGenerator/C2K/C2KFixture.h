@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A CDMA generator with a template of one leaf per lookup name, each called after it.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The records of the 1x air interface.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Once the rows of a section exist, a record costs no allocation.
 #include <gtest/gtest.h>
 

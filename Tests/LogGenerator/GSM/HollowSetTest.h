@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What holds for the three sets that are emptied and never filled.
 #pragma once
 

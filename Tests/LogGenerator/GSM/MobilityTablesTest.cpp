@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The text tables of the mobility-management records, typed a second time.
 #include <gtest/gtest.h>
 

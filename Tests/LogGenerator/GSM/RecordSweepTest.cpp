@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Records of every length and with every count field at its most, for the sanitizers to watch.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Record 0x7132 through the class index: one record, four sections.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/GSM/ServingPLMN.h"
 
 #include <gmock/gmock.h>

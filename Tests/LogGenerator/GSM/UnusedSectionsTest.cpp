@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The sections that ask for no records.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

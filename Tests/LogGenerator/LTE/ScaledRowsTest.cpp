@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Every raw value of every measurement, against printf.
 #include <gtest/gtest.h>
 

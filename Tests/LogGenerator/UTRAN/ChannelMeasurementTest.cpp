@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The record of transport channels and coded composite channels, and its two sections.
 #include "LogGenerator/UTRAN/ChannelMeasurement.h"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Property lists as another implementation reads them, to hold ours against.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What our readers accept, the library that writes for us reads as the same.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // For exchange_with_plistlib.py. `xml SEED FILE` and `binary SEED FILE` write a sample, `read FILE` parses a
 // file; all print the value's canonical text.
 #include <cstdio>

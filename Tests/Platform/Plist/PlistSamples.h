@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Property-list values made up from a seed, and texts of values that tell every difference.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Platform/Plist/Utf8.h"
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """Python's plistlib reads what PlistExchange writes, and PlistExchange what plistlib writes."""
 
 import datetime

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The file system as the application sees it.
 #include "Platform/Posix/PosixFiles.h"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Pieces of the process's surroundings that a test changes and gives back.
 #pragma once
 

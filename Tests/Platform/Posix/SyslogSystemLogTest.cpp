@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // syslog(3) itself is stood in for: the definitions here come before those of the C library.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The daemon's server and an application's connection to it.
 #include <cerrno>
 #include <csignal>

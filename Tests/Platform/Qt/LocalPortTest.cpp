@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The receiving end of a message port.
 #include <csignal>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A runtime directory, an event loop and a log of the test's own.
 #pragma once
 

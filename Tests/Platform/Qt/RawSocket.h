@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The plain socket side of a test: a peer whose bytes the test types itself.
 #pragma once
 

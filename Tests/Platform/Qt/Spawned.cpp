@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Tests/Platform/Qt/Spawned.h"
 
 #include <fcntl.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Another process of a test: the program wire_peer in one of its roles.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The other process of the tests: plays one end of a log channel and prints what happens to it, a line each.
 #include <algorithm>
 #include <cstdarg>

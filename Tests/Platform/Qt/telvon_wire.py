@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """The log channel in Python, written from Docs/log-channel.md and nothing else."""
 
 import fcntl

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: Apache-2.0
 """A stranger's daemon and viewer against this project's: `wire_test.py WIRE_PEER DOCUMENT`.
 
 The C++ side is the program WIRE_PEER in one of its roles; it prints what happens to it.

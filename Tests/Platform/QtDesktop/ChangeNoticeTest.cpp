@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The notice of a change, on a session bus of the test's own.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Preferences as files, a domain each.
 #include "Platform/QtDesktop/QtPreferences.h"
 

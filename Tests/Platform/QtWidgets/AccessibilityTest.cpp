@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a screen reader is told.
 #include <QAccessible>
 #include <QLabel>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Light and dark, the window and the screen.
 #include <QLabel>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The start of the application framework. Qt's application is the framework's own here, so once a process.
 #include "Platform/QtWidgets/QtApplicationFramework.h"
 

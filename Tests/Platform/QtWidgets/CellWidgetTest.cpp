@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a row draws, and where.
 #include "Tests/Platform/QtWidgets/QtFixture.h"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Fonts and the room that texts take.
 #include "Platform/QtWidgets/Fonts.h"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Panes coming and going, the bars around them, and the keys that work everywhere.
 #include <QLabel>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The toolkit without a display, and controllers with rows of text to show in it.
 #pragma once
 

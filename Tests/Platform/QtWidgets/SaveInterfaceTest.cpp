@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The interface resource of the save view, the view over the panes, and alerts over both.
 #include <QLineEdit>
 #include <QPointer>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The desktop's portal on a session bus of the test's own, and what the scheme makes of its answer.
 #include "Platform/QtWidgets/SystemScheme.h"
 

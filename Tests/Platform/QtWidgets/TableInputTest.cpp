@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Keyboard, mouse and wheel on a table.
 #include <QScrollBar>
 #include <QScroller>

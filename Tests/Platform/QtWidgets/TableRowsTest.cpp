@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Which rows of a table have widgets, and what a reload does to them.
 #include <QScrollBar>
 #include <map>

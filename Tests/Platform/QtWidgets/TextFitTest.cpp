@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Texts have the room that they need, at whichever scale of the screen the tests are run.
 #include <QLabel>
 

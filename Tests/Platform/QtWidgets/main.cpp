@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Tests of the toolkit need an application of Qt's, without a display.
 #include <gmock/gmock.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // What a radio engineer looks at first in an LTE drive, over half an hour of several towns.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // The toolkit's halves of controllers, the navigation stack and the window, in memory.
 #pragma once
 

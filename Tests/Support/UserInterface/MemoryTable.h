@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A table that is never drawn: rows come into sight when the test says so.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // A toolkit without a display, for tests of the application: it records what it was told.
 #pragma once
 

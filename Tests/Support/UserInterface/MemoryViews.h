@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Views that are never drawn but remember what they were told.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 // Preferences, files and date formatters in the test's hands.
 #pragma once
 

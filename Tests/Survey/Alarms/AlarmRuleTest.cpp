@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: Apache-2.0
 #include "Survey/Alarms/AlarmRule.h"
 
 #include <gtest/gtest.h>
