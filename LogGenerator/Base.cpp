@@ -35,6 +35,10 @@ std::string_view Base::getSectionName() const {
   throw UnimplementedMethodError("Base::getSectionName");
 }
 
+SectionKind Base::sectionKind() const {
+  throw UnimplementedMethodError("Base::sectionKind");
+}
+
 std::span<const LogCode> Base::getLogCodeArray() const {
   throw UnimplementedMethodError("Base::getLogCodeArray");
 }

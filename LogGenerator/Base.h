@@ -25,6 +25,9 @@ namespace kelvasi {
 class ClassDictionary;
 class CodeDictionary;
 
+// What a section is in the display: rows by name, or a list.
+enum class SectionKind { dictionary, list };
+
 class Base {
  public:
   explicit Base(const Platform& platform) : platform_(platform) {}
@@ -50,6 +53,7 @@ class Base {
   // Abstract: on Base itself each throws UnimplementedMethodError.
   virtual Outcome updateWithData(RecordView record, LogCode logCode);
   virtual std::string_view getSectionName() const;
+  virtual SectionKind sectionKind() const;
   virtual std::span<const LogCode> getLogCodeArray() const;
 
   // The byte that says which version of this record it is; nothing where the record has none.

@@ -16,7 +16,7 @@ void ListDecoder::addEntry(RecordView record, std::size_t place) {
 }
 
 Outcome ListDecoder::decodeOther(RecordView, LogCode logCode) {
-  logUnknownMessage(logCode);
+  if (!section_.isSilent) logUnknownMessage(logCode);
   return Outcome::notAskedFor;
 }
 

@@ -27,7 +27,8 @@ struct ListSection {
   bool staysEmpty = false;           // the entries are read and not shown
   const CellTable* cells = nullptr;  // for the cell-information record
   CellRole role = CellRole::none;
-  CellFields cell = {};  // of an entry
+  CellFields cell = {};   // of an entry
+  bool isSilent = false;  // no line in the system log for a record that neither table describes
 };
 
 class ListDecoder : public Base {
@@ -37,13 +38,14 @@ class ListDecoder : public Base {
 
   Outcome updateWithData(RecordView record, LogCode logCode) override;
   std::string_view getSectionName() const override { return section_.name; }
+  SectionKind sectionKind() const override { return SectionKind::list; }
   std::span<const LogCode> getLogCodeArray() const override { return section_.logCodes; }
   CellRole role() const override { return section_.role; }
 
  protected:
   // Adds what the section shows of one entry, if anything; unless overridden, the rows of the table.
   virtual void addEntry(RecordView record, std::size_t place);
-  // A record that neither table describes; unless overridden, the unknown-message line.
+  // A record that neither table describes; unless overridden, the unknown-message line, or none.
   virtual Outcome decodeOther(RecordView record, LogCode logCode);
 
   // Which cell an entry is; unless overridden, what its fields say.
@@ -63,6 +65,13 @@ class ListDecoder : public Base {
 
   const ListSection& section_;
   RowList list_;
+};
+
+// A decoder that is a table and nothing else.
+template <const ListSection& section>
+class ListTable : public ListDecoder {
+ public:
+  explicit ListTable(const Platform& platform) : ListDecoder(platform, section) {}
 };
 
 }  // namespace kelvasi

@@ -18,32 +18,35 @@ void gatherRemoval(const PlistValue* standing, std::string_view key, const Readi
 
 }  // namespace
 
-void ListRow::show(RecordView record, const EntryList& list, std::span<const Row> rows, std::string_view key,
-                   PlistDictionary& section, const ReadingPlace& place) {
-  PlistArray& shown = emptied(key, section, place);
+void ListRow::show(RecordView record, const ListColumn& column, PlistDictionary& section,
+                   const ReadingPlace& place) {
+  if (column.staysWithoutEntries && countOf(record, column.list) == 0) return;
+  PlistArray& shown = emptied(column.key, section, place);
   ReadingPlace own = place;
-  own.list = key;
-  list_.startAgain(own);
-  for (std::size_t at = 0; at < countOf(record, list); ++at) {
-    RowWriter row = list_.add();
-    kelvasi::show(entryOf(record, list, at), list.layout, rows, row);
-  }
-  Base::replaceArrayWith(shown, list_.entries());
+  own.list = column.key;
+  const PlistArray& entries =
+      column.element ? elementsOf(record, column, own) : entriesOf(record, column, own);
+  Base::replaceArrayWith(shown, entries);
 }
 
-void ListRow::show(RecordView record, const EntryList& list, const Row& row, PlistDictionary& section,
-                   const ReadingPlace& place) {
-  PlistArray& shown = emptied(row.key, section, place);
-  ReadingPlace own = place;
-  own.list = row.key;
-  elements_.removeAll();
-  for (std::size_t at = 0; at < countOf(record, list); ++at) {
-    const std::int64_t raw = rawOf(entryOf(record, list, at), list.layout, row);
-    own.element = static_cast<std::int32_t>(at);
-    elements_.append(deferredText(row, raw));
-    if (own.readings) own.readings->add(own.written(row, raw, {}));
+const PlistArray& ListRow::entriesOf(RecordView record, const ListColumn& column, const ReadingPlace& list) {
+  list_.startAgain(list);
+  for (std::size_t at = 0; at < countOf(record, column.list); ++at) {
+    RowWriter row = list_.add();
+    kelvasi::show(entryOf(record, column.list, at), column.list.layout, column.rows, row);
   }
-  Base::replaceArrayWith(shown, elements_);
+  return list_.entries();
+}
+
+const PlistArray& ListRow::elementsOf(RecordView record, const ListColumn& column, ReadingPlace list) {
+  elements_.removeAll();
+  for (std::size_t at = 0; at < countOf(record, column.list); ++at) {
+    const std::int64_t raw = rawOf(entryOf(record, column.list, at), column.list.layout, *column.element);
+    list.element = static_cast<std::int32_t>(at);
+    elements_.append(deferredText(*column.element, raw));
+    if (list.readings) list.readings->add(list.written(*column.element, raw, {}));
+  }
+  return elements_;
 }
 
 // The row's array, empty, so that the dictionaries in it are free to be used again.

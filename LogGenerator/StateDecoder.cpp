@@ -9,7 +9,16 @@ namespace {
 
 constexpr std::array<std::string_view, 2> versionNames{"version", "layout version"};
 
+std::size_t columnsIn(std::span<const RecordRows> records) {
+  std::size_t count = 0;
+  for (const RecordRows& record : records) count += record.lists.size();
+  return count;
+}
+
 }  // namespace
+
+StateDecoder::StateDecoder(const Platform& platform, const StateSection& section)
+    : Base(platform), section_(section), lists_(columnsIn(section.records)) {}
 
 Outcome StateDecoder::updateWithData(RecordView record, LogCode logCode) {
   trace(section_.trace);
@@ -24,9 +33,17 @@ Outcome StateDecoder::showRows(RecordView record, const RecordRows& rows) {
   RowWriter writer(*sectionRows(), place());
   const std::size_t before = readings() ? readings()->count() : 0;
   show(record, rows.layout, rows.rows, writer);
+  showLists(record, rows);
   if (readings() && rows.cell.family != RadioFamily::none)
     readings()->identify(before, servingCellOf(rows.cell, record, rows.logCode, readings()->servingCells()));
   return Outcome::shown;
+}
+
+void StateDecoder::showLists(RecordView record, const RecordRows& rows) {
+  const auto before = static_cast<std::size_t>(&rows - section_.records.data());
+  std::size_t place = columnsIn(section_.records.first(before));
+  for (const ListColumn& column : rows.lists)
+    lists_[place++].show(record, column, *sectionRows(), this->place());
 }
 
 // An unbound section gets the same lines into the system log.
@@ -38,7 +55,7 @@ Outcome StateDecoder::showCell(RecordView record) {
 }
 
 Outcome StateDecoder::decodeOther(RecordView, LogCode logCode) {
-  logUnknownMessage(logCode);
+  if (!section_.isSilent) logUnknownMessage(logCode);
   return Outcome::notAskedFor;
 }
 

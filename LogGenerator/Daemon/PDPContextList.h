@@ -12,6 +12,7 @@ class PDPContextList : public Base {
 
   Outcome updateWithData(RecordView record, LogCode logCode) override;
   std::string_view getSectionName() const override { return "PDP Context Info"; }
+  SectionKind sectionKind() const override { return SectionKind::list; }
   std::span<const LogCode> getLogCodeArray() const override;
 
  private:

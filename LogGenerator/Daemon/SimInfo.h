@@ -14,6 +14,7 @@ class SimInfo : public Base {
   // Throws LogCode_0xFF000020::UnknownDataException when the record carries no property list.
   Outcome updateWithData(RecordView record, LogCode logCode) override;
   std::string_view getSectionName() const override { return "SIM Info"; }
+  SectionKind sectionKind() const override { return SectionKind::dictionary; }
   std::span<const LogCode> getLogCodeArray() const override;
 
  private:

@@ -71,4 +71,6 @@ inline constexpr std::array rows{
         .texts = updateStatuses},
 };
 
+inline constexpr RecordRows record{logCode, minimumLength, layout, rows};
+
 }  // namespace kelvasi::gmmState

@@ -5,9 +5,7 @@
 #include <array>
 #include <string_view>
 
-#include "LogGenerator/EntryList.h"
-#include "LogGenerator/LogCode.h"
-#include "LogGenerator/Row.h"
+#include "LogGenerator/StateDecoder.h"
 
 namespace kelvasi::harqStatistics {
 
@@ -65,5 +63,16 @@ inline constexpr std::array processRows{
         .quantity = quantity::blockErrors,
         .field = indexIn(processLayout, "block errors")},
 };
+
+// A count of 0 leaves the list of before.
+inline constexpr std::array columns{
+    ListColumn{
+        .key = "Primary HARQ Process", .list = primary, .rows = processRows, .staysWithoutEntries = true},
+    ListColumn{.key = "Secondary HARQ Process",
+               .list = secondary,
+               .rows = processRows,
+               .staysWithoutEntries = true}};
+inline constexpr RecordRows record{
+    .logCode = logCode, .minimumLength = minimumLength, .layout = layout, .rows = rows, .lists = columns};
 
 }  // namespace kelvasi::harqStatistics

@@ -5,9 +5,7 @@
 
 #include <array>
 
-#include "LogGenerator/EntryList.h"
-#include "LogGenerator/LogCode.h"
-#include "LogGenerator/Row.h"
+#include "LogGenerator/StateDecoder.h"
 
 namespace kelvasi::hoppingList {
 
@@ -32,5 +30,10 @@ inline constexpr std::array rows{
 
 inline constexpr Row frequencyRow{
     .key = "ARFCNs", .quantity = quantity::arfcn, .field = indexIn(frequencyLayout, "ARFCN")};
+
+inline constexpr std::array columns{
+    ListColumn{.key = frequencyRow.key, .list = frequencies, .element = &frequencyRow}};
+inline constexpr RecordRows record{
+    .logCode = logCode, .minimumLength = minimumLength, .layout = layout, .rows = rows, .lists = columns};
 
 }  // namespace kelvasi::hoppingList

@@ -65,4 +65,19 @@ inline constexpr std::array updateStatuses{
     "LOCATION_AREA_NOT_ALLOWED"sv,
 };
 
+inline constexpr std::array rows{
+    Row{.key = "MM State", .quantity = quantity::mmState, .field = indexIn(layout, "state"), .texts = states},
+    Row{.key = "MM Sub State",
+        .quantity = quantity::mmSubState,
+        .field = indexIn(layout, "sub-state"),
+        .texts = subStates},
+    Row{.key = "LU Reject Cause",
+        .quantity = quantity::mmUpdateStatus,
+        .field = indexIn(layout, "update status"),
+        .texts = updateStatuses},
+};
+inline constexpr RecordRows record{logCode, minimumLength, layout, rows};
+// The state alone.
+inline constexpr RecordRows stateRecord{logCode, minimumLength, layout, std::span(rows).first<1>()};
+
 }  // namespace kelvasi::mmState

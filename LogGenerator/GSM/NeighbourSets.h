@@ -7,6 +7,7 @@
 #include "LogGenerator/CellFields.h"
 #include "LogGenerator/EntryList.h"
 #include "LogGenerator/LogCode.h"
+#include "LogGenerator/Row.h"
 
 namespace kelvasi::neighbourSets {
 
@@ -49,5 +50,35 @@ inline constexpr EntryList umtsCells{
     .count = fieldIn(layout, "UMTS cells"), .start = firstEntry, .stride = 10, .layout = umtsLayout};
 inline constexpr EntryList gsmCells{
     .count = fieldIn(layout, "GSM cells"), .start = firstEntry, .stride = 7, .layout = gsmLayout};
+
+inline constexpr std::array umtsRows{
+    Row{.key = "Scrambling Code",
+        .quantity = quantity::scramblingCode,
+        .field = indexIn(umtsLayout, "scrambling code")},
+    Row{.key = "RSCP",
+        .quantity = quantity::rscp,
+        .field = indexIn(umtsLayout, "RSCP"),
+        .unit = " dB",
+        .offset = -21},
+    Row{.key = "Energy Per Chip",
+        .quantity = quantity::ecno,
+        .field = indexIn(umtsLayout, "Ec/No in half dB"),
+        .unit = " dB",
+        .scale = Scale{.factor = 0.5, .format = "%f"}},
+    Row{.key = "Downlink Frequency",
+        .quantity = quantity::uarfcn,
+        .field = indexIn(umtsLayout, "downlink UARFCN")},
+    Row{.key = "Ranking Value", .quantity = quantity::ranking, .field = indexIn(umtsLayout, "ranking value")},
+    Row{.key = "Rank Cell RSCP",
+        .quantity = quantity::rscp,
+        .field = indexIn(umtsLayout, "rank-cell RSCP"),
+        .unit = " dB"},
+};
+inline constexpr std::array gsmRows{
+    Row{.key = "ARFCN", .quantity = quantity::arfcn, .field = indexIn(gsmLayout, "ARFCN")},
+    Row{.key = "BSIC", .quantity = quantity::bsic, .field = indexIn(gsmLayout, "BSIC")},
+    Row{.key = "RSSI", .quantity = quantity::rssi, .field = indexIn(gsmLayout, "RSSI"), .unit = " dBm"},
+    Row{.key = "Ranking Value", .quantity = quantity::ranking, .field = indexIn(gsmLayout, "ranking value")},
+};
 
 }  // namespace kelvasi::neighbourSets

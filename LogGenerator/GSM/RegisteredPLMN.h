@@ -3,11 +3,9 @@
 #pragma once
 
 #include <array>
-#include <string>
 #include <string_view>
 
-#include "LogGenerator/LogCode.h"
-#include "LogGenerator/Row.h"
+#include "LogGenerator/StateDecoder.h"
 
 namespace kelvasi::registeredPlmn {
 
@@ -49,5 +47,15 @@ inline constexpr std::array rows{
         .field = indexIn(layout, "service type"),
         .texts = serviceTypes},
 };
+
+inline constexpr std::array operatingModes{"Class 1"sv, "Class 2"sv, "Class 3"sv};
+inline constexpr std::array operatingModeRows{
+    Row{.key = "Network Operating Mode",
+        .quantity = quantity::operatingMode,
+        .field = indexIn(layout, "network operating mode"),
+        .texts = operatingModes},
+};
+
+inline constexpr RecordRows operatingMode{logCode, minimumLength, layout, operatingModeRows};
 
 }  // namespace kelvasi::registeredPlmn

@@ -4,9 +4,7 @@
 
 #include <array>
 
-#include "LogGenerator/EntryList.h"
-#include "LogGenerator/LogCode.h"
-#include "LogGenerator/Row.h"
+#include "LogGenerator/StateDecoder.h"
 
 namespace kelvasi::transportChannelCrc {
 
@@ -41,5 +39,10 @@ inline constexpr std::array channelRows{
         .quantity = quantity::crcErrors,
         .field = indexIn(channelLayout, "CRCs in error")},
 };
+
+inline constexpr std::array columns{
+    ListColumn{.key = "Transport Channels", .list = channels, .rows = channelRows}};
+inline constexpr RecordRows record{
+    .logCode = logCode, .minimumLength = minimumLength, .layout = layout, .rows = rows, .lists = columns};
 
 }  // namespace kelvasi::transportChannelCrc

@@ -12,6 +12,7 @@ class RRC_State : public Base {
 
   Outcome updateWithData(RecordView record, LogCode logCode) override;
   std::string_view getSectionName() const override { return "RRC Info"; }
+  SectionKind sectionKind() const override { return SectionKind::dictionary; }
   std::span<const LogCode> getLogCodeArray() const override;
   std::optional<std::size_t> versionAt(LogCode) const override;
 

@@ -111,6 +111,7 @@ TEST(Base, ItsAbstractOperationsThrow) {
   test::TestPlatform surroundings;
   Base base(surroundings.platform());
   EXPECT_THROW(base.getSectionName(), UnimplementedMethodError);
+  EXPECT_THROW(base.sectionKind(), UnimplementedMethodError);
   EXPECT_THROW(base.getLogCodeArray(), UnimplementedMethodError);
   EXPECT_THROW(base.updateWithData(RecordView({}), 1), UnimplementedMethodError);
 }

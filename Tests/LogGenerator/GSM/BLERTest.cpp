@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "LogGenerator/GSM/BLER.h"
+#include "LogGenerator/GSM/GSMTables.h"
 
 #include <gtest/gtest.h>
 

@@ -4,8 +4,7 @@
 
 #include <array>
 
-#include "LogGenerator/GSM/ProcessCS.h"
-#include "LogGenerator/GSM/ProcessPS.h"
+#include "LogGenerator/GSM/GSMTables.h"
 #include "Tests/Support/SectionTest.h"
 
 namespace kelvasi {

@@ -1,9 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <gtest/gtest.h>
 
-#include "LogGenerator/GSM/ProcessCO.h"
-#include "LogGenerator/GSM/ProcessCS.h"
-#include "LogGenerator/GSM/ProcessPS.h"
+#include "LogGenerator/GSM/GSMTables.h"
 #include "Tests/Support/SectionTest.h"
 
 namespace kelvasi {

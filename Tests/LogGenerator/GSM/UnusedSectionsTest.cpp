@@ -3,11 +3,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include "LogGenerator/GSM/CellChangeCounters.h"
-#include "LogGenerator/GSM/CodingScheme.h"
-#include "LogGenerator/GSM/NonRankedGSMSet.h"
-#include "LogGenerator/GSM/NonRankedUMTSSet.h"
-#include "LogGenerator/GSM/UMTSRRMeasurement.h"
+#include "LogGenerator/GSM/GSMTables.h"
 #include "Tests/Support/SectionTest.h"
 
 namespace kelvasi {
