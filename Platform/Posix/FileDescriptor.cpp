@@ -6,9 +6,15 @@
 
 #include <cerrno>
 #include <cstddef>
-#include <utility>
 
 namespace kelvasi {
+
+FileDescriptor& FileDescriptor::operator=(FileDescriptor&& other) noexcept {
+  if (this == &other) return *this;
+  close();
+  number_ = std::exchange(other.number_, -1);
+  return *this;
+}
 
 bool FileDescriptor::close() {
   // Not retried after a signal: Linux has closed it by then.

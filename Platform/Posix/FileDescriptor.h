@@ -4,15 +4,17 @@
 
 #include <cstdint>
 #include <span>
+#include <utility>
 
 namespace kelvasi {
 
 class FileDescriptor {
  public:
+  FileDescriptor() = default;
   explicit FileDescriptor(int number) : number_(number) {}  // negative: there is none
   ~FileDescriptor() { close(); }
-  FileDescriptor(const FileDescriptor&) = delete;
-  FileDescriptor& operator=(const FileDescriptor&) = delete;
+  FileDescriptor(FileDescriptor&& other) noexcept : number_(std::exchange(other.number_, -1)) {}
+  FileDescriptor& operator=(FileDescriptor&& other) noexcept;
 
   explicit operator bool() const { return number_ >= 0; }
   int number() const { return number_; }
@@ -20,7 +22,7 @@ class FileDescriptor {
   bool close();
 
  private:
-  int number_;
+  int number_ = -1;
 };
 
 // Goes on after signals and short writes until all is written. False, with errno set, on failure.

@@ -53,11 +53,11 @@ FrameChannel::~FrameChannel() {
 void FrameChannel::start(FrameHandler onFrame, EndHandler onEnd) {
   onFrame_ = std::move(onFrame);
   onEnd_ = std::move(onEnd);
-  readNotifier_ = std::make_unique<QSocketNotifier>(socket_.get(), QSocketNotifier::Read);
+  readNotifier_ = std::make_unique<QSocketNotifier>(socket_.number(), QSocketNotifier::Read);
   // What a handler throws ends the program here, ahead of Qt, which must not be unwound.
   // NOLINTNEXTLINE(bugprone-exception-escape)
   QObject::connect(readNotifier_.get(), &QSocketNotifier::activated, [this]() noexcept { readable(); });
-  writeNotifier_ = std::make_unique<QSocketNotifier>(socket_.get(), QSocketNotifier::Write);
+  writeNotifier_ = std::make_unique<QSocketNotifier>(socket_.number(), QSocketNotifier::Write);
   writeNotifier_->setEnabled(false);
   QObject::connect(writeNotifier_.get(), &QSocketNotifier::activated, [this] { flush(); });
   flushTimer_ = std::make_unique<QTimer>();
@@ -67,7 +67,7 @@ void FrameChannel::start(FrameHandler onFrame, EndHandler onEnd) {
 
 void FrameChannel::close() {
   if (!isOpen()) return;
-  if (canSend()) toSend_.flushTo(socket_.get());
+  if (canSend()) toSend_.flushTo(socket_.number());
   readNotifier_.reset();
   writeNotifier_.reset();
   flushTimer_.reset();
@@ -76,7 +76,7 @@ void FrameChannel::close() {
 
 bool FrameChannel::isPeerThere() const {
   if (!canSend()) return false;
-  pollfd asked{socket_.get(), POLLRDHUP, 0};
+  pollfd asked{socket_.number(), POLLRDHUP, 0};
   return ::poll(&asked, 1, 0) == 0;
 }
 
@@ -102,7 +102,7 @@ FrameChannel::Outcome FrameChannel::sendBy(Deadline deadline, const FrameHeader&
   SendBuffer::Flushed flushed{};
   do {
     flushed = flush();
-  } while (flushed == SendBuffer::Flushed::some && wait.waitFor(socket_.get(), POLLOUT));
+  } while (flushed == SendBuffer::Flushed::some && wait.waitFor(socket_.number(), POLLOUT));
   if (flushed == SendBuffer::Flushed::all) return Outcome::done;
   if (flushed == SendBuffer::Flushed::ended) return Outcome::ended;
   toSend_.withdrawLast();
@@ -113,7 +113,7 @@ FrameChannel::Outcome FrameChannel::receiveBy(Deadline deadline, const std::func
   BoundedWait wait(deadline);
   while (!isDone()) {
     if (!isOpen() || hasEnded_) return Outcome::ended;
-    if (!wait.waitFor(socket_.get(), POLLIN)) return Outcome::timedOut;
+    if (!wait.waitFor(socket_.number(), POLLIN)) return Outcome::timedOut;
     fill();
     takeFrames();
   }
@@ -125,7 +125,7 @@ void FrameChannel::fail(const char* reason) {
   log_.print(LogPriority::error, "%s: %s; connection closed", name_.c_str(), reason);
   hasEnded_ = true;
   hadFault_ = true;
-  ::shutdown(socket_.get(), SHUT_RDWR);  // which the loop notices
+  ::shutdown(socket_.number(), SHUT_RDWR);  // which the loop notices
 }
 
 void FrameChannel::readable() {
@@ -136,7 +136,7 @@ void FrameChannel::readable() {
 }
 
 void FrameChannel::fill() {
-  if (hasEnded_ || received_.fillFrom(socket_.get()) != ReceiveBuffer::Filled::ended) return;
+  if (hasEnded_ || received_.fillFrom(socket_.number()) != ReceiveBuffer::Filled::ended) return;
   if (!received_.isEmpty()) return fail("ended inside a frame");
   hasEnded_ = true;
 }
@@ -158,7 +158,7 @@ void FrameChannel::tellEnd() {
 
 SendBuffer::Flushed FrameChannel::flush() {
   sinceFlush_ = 0;
-  const SendBuffer::Flushed flushed = toSend_.flushTo(socket_.get());
+  const SendBuffer::Flushed flushed = toSend_.flushTo(socket_.number());
   if (flushed == SendBuffer::Flushed::ended) isSendingOver_ = true;  // what came in before is still read
   writeNotifier_->setEnabled(flushed == SendBuffer::Flushed::some);
   return flushed;

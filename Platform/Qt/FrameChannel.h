@@ -7,7 +7,7 @@
 #include <memory>
 #include <string>
 
-#include "Platform/Qt/FileDescriptor.h"
+#include "Platform/Posix/FileDescriptor.h"
 #include "Platform/Qt/Frame.h"
 #include "Platform/Qt/ReceiveBuffer.h"
 #include "Platform/Qt/SendBuffer.h"

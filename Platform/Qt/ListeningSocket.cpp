@@ -58,7 +58,7 @@ bool ListeningSocket::listen() {
   if (!lock) return false;
   int error = socket_ ? bindToName() : errno;
   if (error == EADDRINUSE && removeIfDead(address_)) error = bindToName();
-  if (error == 0 && ::listen(socket_.get(), connectionsInQueue) != 0) error = errno;
+  if (error == 0 && ::listen(socket_.number(), connectionsInQueue) != 0) error = errno;
   if (error != 0) {
     log_.print(LogPriority::error, "%s: cannot listen: %s", address_.sun_path, std::strerror(error));
     return false;
@@ -70,7 +70,7 @@ bool ListeningSocket::listen() {
 // Returns 0 or errno.
 int ListeningSocket::bindToName() {
   struct stat made {};
-  if (::bind(socket_.get(), generic(address_), sizeof address_) != 0) return errno;
+  if (::bind(socket_.number(), generic(address_), sizeof address_) != 0) return errno;
   if (::lstat(address_.sun_path, &made) != 0) return errno;
   device_ = made.st_dev;
   inode_ = made.st_ino;
@@ -78,7 +78,7 @@ int ListeningSocket::bindToName() {
 }
 
 void ListeningSocket::watch() {
-  notifier_ = std::make_unique<QSocketNotifier>(socket_.get(), QSocketNotifier::Read);
+  notifier_ = std::make_unique<QSocketNotifier>(socket_.number(), QSocketNotifier::Read);
   QObject::connect(notifier_.get(), &QSocketNotifier::activated, [this]() noexcept { acceptOne(); });
   pause_ = std::make_unique<QTimer>();
   pause_->setSingleShot(true);
@@ -86,7 +86,7 @@ void ListeningSocket::watch() {
 }
 
 void ListeningSocket::acceptOne() {
-  FileDescriptor socket(::accept4(socket_.get(), nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
+  FileDescriptor socket(::accept4(socket_.number(), nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
   if (!socket) {
     if (errno == EAGAIN || errno == EINTR || errno == ECONNABORTED) return;
     log_.print(LogPriority::error, "%s: cannot accept: %s", address_.sun_path, std::strerror(errno));
@@ -94,7 +94,7 @@ void ListeningSocket::acceptOne() {
     pause_->start(pauseAfterFailure);
     return;
   }
-  if (!isPeerOfThisUser(socket.get(), name_, log_)) return;
+  if (!isPeerOfThisUser(socket.number(), name_, log_)) return;
   const auto handler = handler_;  // outlives this object, which the handler may destroy
   (*handler)(std::move(socket));
 }

@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-#include "Platform/Qt/FileDescriptor.h"
+#include "Platform/Posix/FileDescriptor.h"
 #include "Platform/Qt/RuntimeDirectory.h"
 
 class QSocketNotifier;

@@ -10,8 +10,8 @@
 #include <QSocketNotifier>
 #include <QTimer>
 
+#include "Platform/Posix/FileDescriptor.h"
 #include "Platform/Qt/EndingSignals.h"
-#include "Platform/Qt/FileDescriptor.h"
 
 namespace kelvasi {
 
@@ -25,7 +25,7 @@ class QtEventLoop::Signals {
       handBack();  // the signals then end the process as usual
       return;
     }
-    notifier_ = std::make_unique<QSocketNotifier>(source_.get(), QSocketNotifier::Read);
+    notifier_ = std::make_unique<QSocketNotifier>(source_.number(), QSocketNotifier::Read);
     QObject::connect(notifier_.get(), &QSocketNotifier::activated, [this] { arrived(); });
   }
   ~Signals() { handBack(); }
@@ -37,7 +37,7 @@ class QtEventLoop::Signals {
  private:
   void arrived() {
     signalfd_siginfo info;
-    if (::read(source_.get(), &info, sizeof info) != sizeof info) return;
+    if (::read(source_.number(), &info, sizeof info) != sizeof info) return;
     last_ = static_cast<int>(info.ssi_signo);
     handBack();
     QCoreApplication::quit();

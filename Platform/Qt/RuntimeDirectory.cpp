@@ -42,7 +42,7 @@ std::string pathFromEnvironment() {
 // One that is made where directories hand their group on has a bit more than was asked for.
 void dropInheritedBits(const std::string& path) {
   const FileDescriptor made(::open(path.c_str(), O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC));
-  if (made) ::fchmod(made.get(), privateMode);
+  if (made) ::fchmod(made.number(), privateMode);
 }
 
 // Why the directory cannot be trusted; empty when it can.
@@ -118,7 +118,7 @@ FileDescriptor RuntimeDirectory::lock(SystemLog& log) const {
   const std::string path = path_ + "/.lock";
   FileDescriptor file(::open(path.c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW, 0600));
   const auto deadline = std::chrono::steady_clock::now() + lockPatience;
-  while (file && ::flock(file.get(), LOCK_EX | LOCK_NB) != 0) {
+  while (file && ::flock(file.number(), LOCK_EX | LOCK_NB) != 0) {
     if (errno == EINTR) continue;
     if (errno != EWOULDBLOCK || std::chrono::steady_clock::now() >= deadline) {
       file.close();

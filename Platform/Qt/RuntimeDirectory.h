@@ -8,7 +8,7 @@
 #include <string>
 #include <string_view>
 
-#include "Platform/Qt/FileDescriptor.h"
+#include "Platform/Posix/FileDescriptor.h"
 
 namespace kelvasi {
 

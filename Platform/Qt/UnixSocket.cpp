@@ -49,8 +49,8 @@ int connectWithin(const FileDescriptor& socket, const sockaddr_un& address,
   while (true) {
     const auto left = deadline - Clock::now();
     if (left < std::chrono::microseconds(1)) return ETIMEDOUT;
-    if (!limitWaits(socket.get(), left)) return errno;
-    if (::connect(socket.get(), generic, sizeof address) == 0) return 0;
+    if (!limitWaits(socket.number(), left)) return errno;
+    if (::connect(socket.number(), generic, sizeof address) == 0) return 0;
     if (errno == EAGAIN) return ETIMEDOUT;
     if (errno != EINTR) return errno;
   }
@@ -62,13 +62,13 @@ FileDescriptor connectToName(std::string_view name, SystemLog& log) {
   if (!address) return {};
   FileDescriptor socket = makeUnixSocket();
   int error = socket ? connectWithin(socket, *address, connectTimeout) : errno;
-  if (error == 0 && !makeNonBlocking(socket.get())) error = errno;
+  if (error == 0 && !makeNonBlocking(socket.number())) error = errno;
   if (error != 0) {
     if (!meansNobodyListens(error))
       log.print(LogPriority::error, "%s: cannot connect: %s", address->sun_path, std::strerror(error));
     return {};
   }
-  return isPeerOfThisUser(socket.get(), name, log) ? std::move(socket) : FileDescriptor();
+  return isPeerOfThisUser(socket.number(), name, log) ? std::move(socket) : FileDescriptor();
 }
 
 }  // namespace kelvasi

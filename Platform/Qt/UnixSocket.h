@@ -5,7 +5,7 @@
 #include <chrono>
 #include <string_view>
 
-#include "Platform/Qt/FileDescriptor.h"
+#include "Platform/Posix/FileDescriptor.h"
 #include "Platform/Qt/RuntimeDirectory.h"
 
 namespace kelvasi {

@@ -6,21 +6,20 @@
 #include <filesystem>
 #include <stdexcept>
 
-#include "Platform/Posix/PackageResources.h"
 #include "Platform/Posix/PrivateFiles.h"
 
 namespace kelvasi {
 
 namespace {
 
-constexpr int wrongUsage = 2;
-
 std::string environment(const char* name) {
   const char* const value = std::getenv(name);
   return value ? value : "";
 }
 
-void addOptions(CLI::App& app, Options& options) {
+}  // namespace
+
+void declareOptions(CLI::App& app, ViewerOptions& options) {
   app.add_flag("--fullscreen", options.fullScreen,
                "fill the screen; a window of 390 by 844 points otherwise");
   app.add_flag("--log-stderr", options.logsToStderr,
@@ -37,24 +36,6 @@ void addOptions(CLI::App& app, Options& options) {
          "--script", options.script,
          "lead the window through the commands of a file (Docs/viewer-script.md); - is the standard input")
       ->type_name("FILE");
-}
-
-}  // namespace
-
-CommandLine parseCommandLine(int argumentCount, const char* const* arguments) {
-  Options options;
-  CLI::App app("Shows what the cellular modem is doing right now.", "kelvasi");
-  app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
-  addOptions(app, options);
-  try {
-    app.parse(argumentCount, arguments);
-  } catch (const CLI::Success& success) {
-    return {.options = std::nullopt, .exitStatus = app.exit(success)};
-  } catch (const CLI::ParseError& error) {
-    std::cerr << "kelvasi: " << error.what() << " (try --help)\n";
-    return {.options = std::nullopt, .exitStatus = wrongUsage};
-  }
-  return {.options = std::move(options)};
 }
 
 bool hasDisplay() {

@@ -7,22 +7,20 @@
 
 #include "Platform/QtWidgets/Palettes.h"
 
+namespace CLI {
+class App;
+}
+
 namespace kelvasi {
 
-struct Options {
+struct ViewerOptions {
   bool fullScreen = false;
   bool logsToStderr = false;
   std::optional<ColourScheme> colourScheme;
   std::string script;  // the name of a file; "-" for the standard input, empty for none
 };
 
-struct CommandLine {
-  std::optional<Options> options;  // none: end with `exitStatus`
-  int exitStatus = 0;
-};
-
-// Explains itself on the standard streams where it is asked to or cannot make sense of the arguments.
-CommandLine parseCommandLine(int argumentCount, const char* const* arguments);
+void declareOptions(CLI::App& app, ViewerOptions& options);
 
 // Whether a display is named, or Qt is told to do without one (QT_QPA_PLATFORM).
 bool hasDisplay();

@@ -20,6 +20,7 @@
 #include "Platform/QtDesktop/QtPreferences.h"
 #include "Platform/QtWidgets/QtApplicationFramework.h"
 #include "Platform/QtWidgets/QtUserInterface.h"
+#include "Tools/CommandLine.h"
 #include "Tools/Kelvasi/Options.h"
 #include "Tools/Kelvasi/Script.h"
 #include "Tools/Kelvasi/TemplateNotice.h"
@@ -29,7 +30,7 @@ namespace kelvasi {
 namespace {
 
 // False when the script that led the window failed.
-bool run(QtApplicationFramework& framework, const Options& options) {
+bool run(QtApplicationFramework& framework, const ViewerOptions& options) {
   const auto log = makeSystemLog(options.logsToStderr, "kelvasi");
   installTerminateHandler(*log, options.logsToStderr ? "" : "kelvasi");
   StandardOutputTrace trace;
@@ -67,17 +68,19 @@ void keepInputMethodsOut() {
 
 int main(int argumentCount, char** arguments) {
   kelvasi::keepLargeBlocksApart();
-  const kelvasi::CommandLine commandLine = kelvasi::parseCommandLine(argumentCount, arguments);
-  if (!commandLine.options) return commandLine.exitStatus;
+  kelvasi::CommandLine commandLine("kelvasi", "Shows what the cellular modem is doing right now.");
+  kelvasi::ViewerOptions options;
+  kelvasi::declareOptions(commandLine.app(), options);
+  if (const auto status = commandLine.parse(argumentCount, arguments)) return *status;
   if (!kelvasi::hasDisplay()) {
     std::fprintf(stderr, "kelvasi: there is no display (neither WAYLAND_DISPLAY nor DISPLAY is set)\n");
     return 1;
   }
-  if (!commandLine.options->script.empty()) kelvasi::keepInputMethodsOut();
+  if (!options.script.empty()) kelvasi::keepInputMethodsOut();
   int own = 1;  // the options are all this program's; Qt's has its variables
   kelvasi::QtApplicationFramework framework(own, arguments);
   try {
-    return kelvasi::run(framework, *commandLine.options) ? 0 : 1;
+    return kelvasi::run(framework, options) ? 0 : 1;
   } catch (const std::runtime_error& fault) {
     std::fprintf(stderr, "kelvasi: %s\n", fault.what());
     return 1;

@@ -4,11 +4,9 @@
 
 #include <stdexcept>
 
-namespace kelvasi {
+#include "Tools/ExitStatus.h"
 
-inline constexpr int exitSuccess = 0;
-inline constexpr int exitFault = 1;
-inline constexpr int exitWrongUsage = 2;
+namespace kelvasi {
 
 // One line for the standard error; the exit status is exitFault.
 class ToolError : public std::runtime_error {

@@ -1,10 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl: wires the verbs to the command line.
-#include <CLI/CLI.hpp>
 #include <array>
 #include <vector>
 
-#include "Platform/Posix/PackageResources.h"
+#include "Tools/CommandLine.h"
 #include "Tools/Kelvasictl/MessageTally.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
@@ -35,19 +34,13 @@ std::string verbNames() {
 }
 
 int run(int argumentCount, char** arguments, MessageTally& tally) {
-  CLI::App app("Decodes, watches and records the diagnostic stream of a cellular modem.", "kelvasictl");
-  app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
+  CommandLine commandLine("kelvasictl",
+                          "Decodes, watches and records the diagnostic stream of a cellular modem.");
+  CLI::App& app = commandLine.app();
   std::vector<Action> actions;
   actions.reserve(verbs.size());
   for (const Verb& verb : verbs) actions.push_back(verb.declare(*app.add_subcommand(verb.name, verb.help)));
-  try {
-    app.parse(argumentCount, arguments);
-  } catch (const CLI::Success& help) {
-    return app.exit(help);
-  } catch (const CLI::ParseError& error) {
-    complain(std::string(error.what()) + " (try --help)");
-    return exitWrongUsage;
-  }
+  if (const auto status = commandLine.parse(argumentCount, arguments)) return *status;
   for (std::size_t place = 0; place < verbs.size(); ++place) {
     if (app.got_subcommand(verbs[place].name)) return actions[place](tally);
   }

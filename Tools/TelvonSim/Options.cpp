@@ -4,7 +4,6 @@
 #include <CLI/CLI.hpp>
 #include <cmath>
 
-#include "Platform/Posix/PackageResources.h"
 #include "Simulator/Commands.h"
 #include "Simulator/ScenarioList.h"
 #include "Telvon/TechnologyName.h"
@@ -13,8 +12,6 @@
 namespace kelvasi {
 
 namespace {
-
-constexpr int wrongUsage = 2;
 
 std::string listOfFaults() {
   std::string text = "Faults (several at once, each with its own --fault):\n";
@@ -51,7 +48,10 @@ std::string readSpeed(std::string& text) {
   return {};
 }
 
-void addOptions(CLI::App& app, Options& options) {
+}  // namespace
+
+void declareOptions(CLI::App& app, SimulatorOptions& options) {
+  app.footer(listOfFaults());
   app.add_option("--technology", options.technology,
                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
       ->type_name("TECH")
@@ -116,26 +116,6 @@ void addOptions(CLI::App& app, Options& options) {
         throw CLI::Success();
       },
       "list the scenarios and end");
-}
-
-}  // namespace
-
-CommandLine parseCommandLine(int argumentCount, const char* const* arguments) {
-  Options options;
-  CLI::App app("Plays the telephony daemon: serves log channels and streams what a simulated handset gives.",
-               "telvon-sim");
-  app.footer(listOfFaults());
-  app.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
-  addOptions(app, options);
-  try {
-    app.parse(argumentCount, arguments);
-  } catch (const CLI::Success& success) {
-    return {.options = std::nullopt, .exitStatus = app.exit(success)};
-  } catch (const CLI::ParseError& error) {
-    std::cerr << "telvon-sim: " << error.what() << " (try --help)\n";
-    return {.options = std::nullopt, .exitStatus = wrongUsage};
-  }
-  return {.options = std::move(options)};
 }
 
 }  // namespace kelvasi

@@ -11,9 +11,13 @@
 #include "Simulator/Faults.h"
 #include "Simulator/Player.h"
 
+namespace CLI {
+class App;
+}
+
 namespace kelvasi {
 
-struct Options {
+struct SimulatorOptions {
   std::string technology;      // full id
   std::string scenario;        // empty for the technology's usual one
   std::string replay;          // a capture's path; empty for a scenario
@@ -30,12 +34,6 @@ struct Options {
   sim::Faults faults;
 };
 
-struct CommandLine {
-  std::optional<Options> options;
-  int exitStatus = 0;  // when there is nothing to run: help was asked for, or the usage is wrong
-};
-
-// Prints what it has to say itself.
-CommandLine parseCommandLine(int argumentCount, const char* const* arguments);
+void declareOptions(CLI::App& app, SimulatorOptions& options);
 
 }  // namespace kelvasi

@@ -14,14 +14,14 @@ namespace {
 
 constexpr int wrongUsage = 2;
 
-std::unique_ptr<sim::Scenario> begun(const sim::ScenarioKind& kind, const Options& options,
+std::unique_ptr<sim::Scenario> begun(const sim::ScenarioKind& kind, const SimulatorOptions& options,
                                      const PlistSerialiser& plists) {
   auto scenario = kind.make(options.seed, plists);
   sim::skip(*scenario, options.startAt);
   return scenario;
 }
 
-SourceResult scenarioSource(const Options& options, const PlistSerialiser& plists) {
+SourceResult scenarioSource(const SimulatorOptions& options, const PlistSerialiser& plists) {
   const sim::ScenarioKind* kind = sim::findScenario(options.technology, options.scenario);
   if (!kind) {
     const std::string wanted =
@@ -41,7 +41,7 @@ void tellFaults(const CaptureReader& capture) {
   for (const std::string& line : capture.complaints()) std::fprintf(stderr, "telvon-sim: %s\n", line.c_str());
 }
 
-SourceResult replaySource(const Options& options, const PlistSerialiser& plists) {
+SourceResult replaySource(const SimulatorOptions& options, const PlistSerialiser& plists) {
   SourceResult result;
   result.source = std::make_unique<sim::ReplaySource>(
       [path = options.replay, &plists] { return openCapture(path, plists); }, options.isLooping, tellFaults);
@@ -52,7 +52,7 @@ SourceResult replaySource(const Options& options, const PlistSerialiser& plists)
 
 }  // namespace
 
-SourceResult makeSource(const Options& options, const PlistSerialiser& plists) {
+SourceResult makeSource(const SimulatorOptions& options, const PlistSerialiser& plists) {
   if (!options.replay.empty()) return replaySource(options, plists);
   return scenarioSource(options, plists);
 }

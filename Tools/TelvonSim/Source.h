@@ -18,6 +18,6 @@ struct SourceResult {
 };
 
 // `plists` outlives the source.
-SourceResult makeSource(const Options& options, const PlistSerialiser& plists);
+SourceResult makeSource(const SimulatorOptions& options, const PlistSerialiser& plists);
 
 }  // namespace kelvasi

@@ -8,7 +8,7 @@
 
 namespace kelvasi {
 
-std::string writeCapture(sim::MessageSource& source, const Options& options) {
+std::string writeCapture(sim::MessageSource& source, const SimulatorOptions& options) {
   if (std::string refusal = refusalOf(options.write, options.isForced); !refusal.empty()) return refusal;
   PcapWriter capture(options.write, existing(options.isForced));
   if (capture.error()) return *capture.error();

@@ -11,6 +11,6 @@ namespace kelvasi {
 
 // Writes the source's first messages, arriving when the simulated world has them. What went wrong, in one
 // line; empty when nothing did.
-std::string writeCapture(sim::MessageSource& source, const Options& options);
+std::string writeCapture(sim::MessageSource& source, const SimulatorOptions& options);
 
 }  // namespace kelvasi

@@ -14,6 +14,7 @@
 #include "Platform/Qt/RuntimeDirectory.h"
 #include "Simulator/Simulation.h"
 #include "Telvon/TechnologyName.h"
+#include "Tools/CommandLine.h"
 #include "Tools/TelvonSim/Options.h"
 #include "Tools/TelvonSim/Source.h"
 #include "Tools/TelvonSim/WrittenDrive.h"
@@ -31,7 +32,7 @@ int runLoop(QtEventLoop& loop, const std::optional<double>& seconds) {
   return loop.runFor(std::chrono::milliseconds(static_cast<std::int64_t>(*seconds * 1000)));
 }
 
-sim::SimulationHandlers handlersFor(QtEventLoop& loop, const Options& options) {
+sim::SimulationHandlers handlersFor(QtEventLoop& loop, const SimulatorOptions& options) {
   return {.die = [] { std::raise(SIGKILL); },
           .stall = [] { std::raise(SIGSTOP); },
           .sourceEnded =
@@ -41,7 +42,7 @@ sim::SimulationHandlers handlersFor(QtEventLoop& loop, const Options& options) {
               }};
 }
 
-int serve(const Options& options) {
+int serve(const SimulatorOptions& options) {
   QtEventLoop loop;
   StderrSystemLog log;
   installTerminateHandler(log);
@@ -70,7 +71,7 @@ int serve(const Options& options) {
   return 0;
 }
 
-int writeDrive(const Options& options) {
+int writeDrive(const SimulatorOptions& options) {
   const LibplistSerialiser plists;
   const SourceResult made = makeSource(options, plists);
   const std::string failure = made.source ? writeCapture(*made.source, options) : made.failure;
@@ -84,8 +85,11 @@ int writeDrive(const Options& options) {
 }  // namespace kelvasi
 
 int main(int argumentCount, char** arguments) {
-  const kelvasi::CommandLine commandLine = kelvasi::parseCommandLine(argumentCount, arguments);
-  if (!commandLine.options) return commandLine.exitStatus;
-  const kelvasi::Options& options = *commandLine.options;
+  kelvasi::CommandLine commandLine(
+      "telvon-sim",
+      "Plays the telephony daemon: serves log channels and streams what a simulated handset gives.");
+  kelvasi::SimulatorOptions options;
+  kelvasi::declareOptions(commandLine.app(), options);
+  if (const auto status = commandLine.parse(argumentCount, arguments)) return *status;
   return options.write.empty() ? kelvasi::serve(options) : kelvasi::writeDrive(options);
 }

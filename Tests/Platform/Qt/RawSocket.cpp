@@ -32,14 +32,15 @@ void check(bool isGood, const char* what) {
 RawSocket RawSocket::connectTo(const std::string& path) {
   FileDescriptor socket = makeSocket();
   const sockaddr_un address = addressOf(path);
-  check(::connect(socket.get(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0, "connect");
+  check(::connect(socket.number(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0,
+        "connect");
   return RawSocket(std::move(socket));
 }
 
 bool RawSocket::write(const Bytes& bytes) {
   std::size_t sent = 0;
   while (sent < bytes.size()) {
-    const ssize_t count = ::send(socket_.get(), bytes.data() + sent, bytes.size() - sent, MSG_NOSIGNAL);
+    const ssize_t count = ::send(socket_.number(), bytes.data() + sent, bytes.size() - sent, MSG_NOSIGNAL);
     if (count <= 0) return false;
     sent += static_cast<std::size_t>(count);
   }
@@ -50,7 +51,7 @@ Bytes RawSocket::read(std::size_t count) {
   Bytes bytes(count);
   std::size_t held = 0;
   while (held < count) {
-    const ssize_t got = ::recv(socket_.get(), bytes.data() + held, count - held, 0);
+    const ssize_t got = ::recv(socket_.number(), bytes.data() + held, count - held, 0);
     if (got <= 0) break;
     held += static_cast<std::size_t>(got);
   }
@@ -69,12 +70,12 @@ Bytes RawSocket::readToEnd() {
 
 RawListener::RawListener(const std::string& path, int queue) : socket_(makeSocket()) {
   const sockaddr_un address = addressOf(path);
-  check(::bind(socket_.get(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0, "bind");
-  check(::listen(socket_.get(), queue) == 0, "listen");
+  check(::bind(socket_.number(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0, "bind");
+  check(::listen(socket_.number(), queue) == 0, "listen");
 }
 
 RawSocket RawListener::accept() {
-  return RawSocket(FileDescriptor(::accept4(socket_.get(), nullptr, nullptr, SOCK_CLOEXEC)));
+  return RawSocket(FileDescriptor(::accept4(socket_.number(), nullptr, nullptr, SOCK_CLOEXEC)));
 }
 
 Bytes header(std::uint32_t length, int kind, std::uint32_t id, std::uint32_t token) {

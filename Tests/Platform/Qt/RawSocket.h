@@ -5,7 +5,7 @@
 #include <cstddef>
 #include <string>
 
-#include "Platform/Qt/FileDescriptor.h"
+#include "Platform/Posix/FileDescriptor.h"
 #include "Plist/PlistValue.h"
 
 namespace kelvasi::test {
