@@ -43,6 +43,7 @@ class Survey {
   const SeriesStore* series() const { return series_.get(); }
   const EventLog& events() const { return events_; }
   const AlarmWatch& alarms() const { return alarms_; }
+  void changeRules(std::vector<AlarmRule> rules) { alarms_.change(std::move(rules)); }
 
   // Adds another drive's cells and series; its events stay its own.
   void merge(const Survey& other);

@@ -23,6 +23,17 @@ AlarmWatch::AlarmWatch(std::vector<AlarmRule> rules, Give give) : give_(std::mov
   for (std::size_t place = 0; place < rules.size(); ++place) watched_[place].rule = std::move(rules[place]);
 }
 
+void AlarmWatch::change(std::vector<AlarmRule> rules) {
+  std::vector<Watched> watched(rules.size());
+  for (std::size_t place = 0; place < rules.size(); ++place) {
+    const auto same =
+        std::ranges::find(watched_, rules[place].text, [](const Watched& each) { return each.rule.text; });
+    if (same != watched_.end()) watched[place] = *same;
+    watched[place].rule = std::move(rules[place]);
+  }
+  watched_ = std::move(watched);
+}
+
 void AlarmWatch::value(const Quantity& quantity, Time time, double value, const CellIdentity& cell) {
   for (Watched& watched : watched_) {
     if (watched.rule.kind == Kind::event || watched.rule.quantity != &quantity) continue;

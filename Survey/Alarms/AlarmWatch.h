@@ -48,6 +48,14 @@ class AlarmWatch {
 
   std::uint64_t given() const { return given_; }
 
+  // From now on these rules. What has begun under a rule of the same text goes on. Not to
+  // be called while an alarm is given.
+  void change(std::vector<AlarmRule> rules);
+  std::size_t rules() const { return watched_.size(); }
+  const AlarmRule& rule(std::size_t place) const { return watched_[place].rule; }
+  // Whether it has given an alarm that is not over. Events are over at once.
+  bool isRaised(std::size_t place) const { return watched_[place].isRaised; }
+
  private:
   struct Watched {
     AlarmRule rule;
