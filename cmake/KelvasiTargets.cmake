@@ -3,6 +3,10 @@
 add_library(kelvasi_options INTERFACE)
 target_compile_options(kelvasi_options INTERFACE -Wall -Wextra -Wconversion -Wshadow)
 target_include_directories(kelvasi_options INTERFACE ${PROJECT_SOURCE_DIR})
+if(KELVASI_MAP_PATHS)
+  target_compile_options(kelvasi_options INTERFACE -ffile-prefix-map=${PROJECT_SOURCE_DIR}=.
+                                                   -ffile-prefix-map=${PROJECT_BINARY_DIR}=build)
+endif()
 if(KELVASI_SANITIZE)
   target_compile_options(kelvasi_options INTERFACE -fsanitize=${KELVASI_SANITIZE} -fno-omit-frame-pointer
                                                    -fno-sanitize-recover=all)

@@ -21,6 +21,9 @@ PROGRAMS = {"bin/kelvasi", "bin/kelvasictl", "bin/telvon-sim"}
 TEMPLATES = {f"share/kelvasi/{name}" for name in ("C2KTemplate.plist", "LTE.plist", "Orvane_GSM.plist", "UTRAN.plist")}
 DESKTOP = {"share/applications/org.kelvasi.Kelvasi.desktop",
            "share/icons/hicolor/scalable/apps/org.kelvasi.Kelvasi.svg"}
+DOCUMENTS = {f"share/doc/kelvasi/{name}" for name in (
+    "LICENSE", "CHANGELOG.md", "Notices/README.md", "Notices/LICENSE.CLI11", "Notices/LICENSE.LGPL-2.1",
+    "Notices/LICENSE.nlohmann-json")}
 
 
 def cmake(*arguments, **variables):
@@ -64,7 +67,17 @@ class Installed(LiveTest):
 
     def test_the_programs_and_what_they_need_are_there(self):
         files = {str(path.relative_to(self.prefix)) for path in self.prefix.rglob("*") if path.is_file()}
-        self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | {"share/doc/kelvasi/LICENSE"})
+        self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | DOCUMENTS)
+
+    def test_all_of_it_is_taken_away_again_and_nothing_else(self):
+        with tempfile.TemporaryDirectory() as root:
+            prefix = pathlib.Path(root, "usr")
+            cmake("--install", BUILD, "--prefix", "/usr", DESTDIR=root)
+            others = prefix / "share/applications/other.desktop"
+            others.touch()
+            cmake("--build", BUILD, "--target", "uninstall", DESTDIR=root)
+            left = [path for path in prefix.rglob("*") if path.is_file() or path.name == "kelvasi"]
+        self.assertEqual(left, [others])
 
     def test_captures_are_decoded(self):
         capture = self.write("a.pcap", pcap(MM_IDLE))
@@ -130,6 +143,10 @@ class Configured(unittest.TestCase):
         compiled = subprocess.run([*command[:command.index("-o")], "-fsyntax-only", command[-1]], capture_output=True,
                                   text=True, check=False)
         self.assertEqual((compiled.returncode, compiled.stderr), (0, ""))
+
+    def test_no_path_of_the_build_comes_into_the_programs(self):
+        for source, command in self.commands().items():
+            self.assertIn(f"-ffile-prefix-map={SOURCES}=.", command, source)
 
     def test_a_package_that_is_missing_is_named(self):
         with tempfile.TemporaryDirectory() as build, self.assertRaises(subprocess.CalledProcessError) as caught:
