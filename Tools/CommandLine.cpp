@@ -10,6 +10,12 @@ namespace kelvasi {
 
 CommandLine::CommandLine(const std::string& name, const std::string& description) : app_(description, name) {
   app_.set_version_flag("--version", PackageResources().bundleVersion().value_or("none"));
+  // For the build, which makes manuals and completions of it; hidden, as it belongs to no group.
+  const auto describe = [this] {
+    std::cout << optionTable(app_, words_);
+    throw CLI::Success();
+  };
+  app_.add_flag_callback("--describe", describe)->group("");
 }
 
 std::optional<int> CommandLine::parse(int argumentCount, const char* const* arguments) {

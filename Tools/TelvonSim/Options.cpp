@@ -48,9 +48,26 @@ std::string readSpeed(std::string& text) {
   return {};
 }
 
+void offerWords(CommandLine& commandLine) {
+  std::vector<std::string> technologies;
+  std::vector<std::string> scenarios;
+  std::vector<std::string> faults;
+  for (const std::string_view id : technologyIds()) technologies.emplace_back(shortTechnologyName(id));
+  for (const sim::ScenarioKind& kind : sim::scenarioKinds()) {
+    if (std::ranges::find(scenarios, kind.name) == scenarios.end()) scenarios.emplace_back(kind.name);
+  }
+  for (const sim::FaultKind& kind : sim::faultKinds())
+    faults.push_back(std::string(kind.name) + (kind.value == sim::FaultKind::Value::required ? "=" : ""));
+  commandLine.offerWords("TECH", std::move(technologies));
+  commandLine.offerWords("NAME", std::move(scenarios));
+  commandLine.offerWords("FAULT", std::move(faults));
+}
+
 }  // namespace
 
-void declareOptions(CLI::App& app, SimulatorOptions& options) {
+void declareOptions(CommandLine& commandLine, SimulatorOptions& options) {
+  offerWords(commandLine);
+  CLI::App& app = commandLine.app();
   app.footer(listOfFaults());
   app.add_option("--technology", options.technology,
                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")

@@ -10,10 +10,7 @@
 
 #include "Simulator/Faults.h"
 #include "Simulator/Player.h"
-
-namespace CLI {
-class App;
-}
+#include "Tools/CommandLine.h"
 
 namespace kelvasi {
 
@@ -34,6 +31,6 @@ struct SimulatorOptions {
   sim::Faults faults;
 };
 
-void declareOptions(CLI::App& app, SimulatorOptions& options);
+void declareOptions(CommandLine& commandLine, SimulatorOptions& options);
 
 }  // namespace kelvasi

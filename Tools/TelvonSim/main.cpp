@@ -89,7 +89,7 @@ int main(int argumentCount, char** arguments) {
       "telvon-sim",
       "Plays the telephony daemon: serves log channels and streams what a simulated handset gives.");
   kelvasi::SimulatorOptions options;
-  kelvasi::declareOptions(commandLine.app(), options);
+  kelvasi::declareOptions(commandLine, options);
   if (const auto status = commandLine.parse(argumentCount, arguments)) return *status;
   return options.write.empty() ? kelvasi::serve(options) : kelvasi::writeDrive(options);
 }
