@@ -11,7 +11,7 @@
 #include <utility>
 #include <vector>
 
-#include "Plist/PlistValue.h"
+#include "Plist/PlistHandle.h"
 
 namespace kelvasi {
 

@@ -2,8 +2,9 @@
 # SPDX-License-Identifier: Apache-2.0
 """Checks the one rule of direction: a folder includes only what stands below it.
 
-Also that one technology includes nothing of another, that headers other than the C++ standard library's are included
-only where the platform, captures or tools are, that every test is built, and that every source names its licence.
+Also that no headers include each other in a circle, that one technology includes nothing of another, that headers
+other than the C++ standard library's are included only where the platform, captures or tools are, that every test is
+built, and that every source names its licence.
 """
 
 import pathlib
@@ -64,6 +65,23 @@ def faults_of_technology(path: pathlib.Path):
             yield f'{place}: "{name}" is of one technology, and the daemon serves all of them'
 
 
+# Each circle once, named by the header at which a walk from the top of the house met it again.
+def faults_of_circle(paths):
+    graph = {str(path): [name for _, kind, name in includes(path) if kind == '"'] for path in paths}
+    done = set()
+
+    def walk(name, above):
+        if name in above:
+            yield " includes ".join([*above[above.index(name):], name])
+        elif name not in done:
+            for included in graph.get(name, []):
+                yield from walk(included, [*above, name])
+            done.add(name)
+
+    for name in graph:
+        yield from walk(name, [])
+
+
 def tests_not_built():
     for path in sorted((ROOT / "Tests").rglob("*Test.cpp")):
         lists = [folder / "CMakeLists.txt" for folder in path.parents if (folder / "CMakeLists.txt").exists()]
@@ -94,6 +112,7 @@ def main() -> int:
     found = [fault for path in house for fault in faults_of_direction(path)]
     for path in [*house, *sources(MIRRORS)]:
         found += [*faults_of_technology(path), *faults_of_licence(path)]
+    found += faults_of_circle([*house, *sources(MIRRORS)])
     found += tests_not_built()
     for fault in found:
         print(fault, file=sys.stderr)

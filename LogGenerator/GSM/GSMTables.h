@@ -142,11 +142,15 @@ constexpr StateSection recordless(std::string_view name, std::string_view trace)
   return {.name = name, .trace = trace, .logCodes = {}, .isSilent = true};
 }
 inline constexpr StateSection umtsRRMeasurement = recordless("UMTS RR Measurement", "UMTSRRMeasurement");
-inline constexpr StateSection nonRankedGSMSet = recordless("Non-Ranked GSM Set", "NonRankedGSMSet");
-inline constexpr StateSection nonRankedUMTSSet = recordless("Non-Ranked UMTS Set", "NonRankedUMTSSet");
 inline constexpr StateSection cellChangeCounters = recordless("Cell Change Counters", "CellChangeCounters");
 // The trace names its sibling; tools that filter the system log know it so.
 inline constexpr StateSection codingScheme = recordless("Coding Scheme", "CellChangeCounters");
+
+constexpr ListSection recordlessList(std::string_view name, std::string_view trace) {
+  return {.name = name, .trace = trace, .logCodes = {}, .list = {}, .isSilent = true};
+}
+inline constexpr ListSection nonRankedGSMSet = recordlessList("Non-Ranked GSM Set", "NonRankedGSMSet");
+inline constexpr ListSection nonRankedUMTSSet = recordlessList("Non-Ranked UMTS Set", "NonRankedUMTSSet");
 
 }  // namespace gsmTables
 
@@ -161,8 +165,8 @@ using GSMSet = ListTable<gsmTables::gsmSet>;
 using HSDPAInformation = StateTable<gsmTables::hsdpaInformation>;
 using MobileAllocation = StateTable<gsmTables::mobileAllocation>;
 using MonitoredSet = ListTable<gsmTables::monitoredSet>;
-using NonRankedGSMSet = StateTable<gsmTables::nonRankedGSMSet>;
-using NonRankedUMTSSet = StateTable<gsmTables::nonRankedUMTSSet>;
+using NonRankedGSMSet = ListTable<gsmTables::nonRankedGSMSet>;
+using NonRankedUMTSSet = ListTable<gsmTables::nonRankedUMTSSet>;
 using ProcessCO = StateTable<gsmTables::processCO>;
 using ProcessCS = StateTable<gsmTables::processCS>;
 using ProcessPS = StateTable<gsmTables::processPS>;

@@ -4,9 +4,8 @@
 
 #include <array>
 
-#include "LogGenerator/CellFields.h"
-#include "LogGenerator/EntryList.h"
-#include "LogGenerator/LogCode.h"
+#include "LogGenerator/LTE/MeasurementScales.h"
+#include "LogGenerator/StateDecoder.h"
 
 namespace kelvasi::lte::connectedModeMeasurement {
 
@@ -53,5 +52,47 @@ inline constexpr EntryList detected{.count = fieldIn(layout, "detected cells"),
                                     .layout = detectedLayout,
                                     .countBefore = measured.count,
                                     .bytesPerEntryBefore = measured.stride};
+
+inline constexpr std::array rows{
+    Row{.key = "E-ARFCN", .quantity = quantity::earfcn, .field = indexIn(layout, "E-ARFCN")},
+    Row{.key = "Serving Physical Cell ID",
+        .quantity = quantity::pci,
+        .field = indexIn(layout, "serving physical cell identity")},
+    Row{.key = "Subframe Number",
+        .quantity = quantity::frameNumber,
+        .field = indexIn(layout, "subframe number")},
+    Row{.key = "Serving Filtered RSRP",
+        .quantity = quantity::rsrp,
+        .field = indexIn(layout, "filtered RSRP"),
+        .unit = " dBm",
+        .scale = quarterRsrp},
+    Row{.key = "Serving Filtered RSRQ",
+        .quantity = quantity::rsrq,
+        .field = indexIn(layout, "filtered RSRQ"),
+        .unit = " dB",
+        .scale = eighthRsrq},
+};
+inline constexpr std::array measuredRows{
+    Row{.key = "Physical Cell ID",
+        .quantity = quantity::pci,
+        .field = indexIn(measuredLayout, "physical cell identity")},
+    Row{.key = "Filtered RSRP",
+        .quantity = quantity::rsrp,
+        .field = indexIn(measuredLayout, "filtered RSRP"),
+        .unit = " dBm",
+        .scale = quarterRsrp},
+    Row{.key = "Filtered RSRQ",
+        .quantity = quantity::rsrq,
+        .field = indexIn(measuredLayout, "filtered RSRQ"),
+        .unit = " dB",
+        .scale = eighthRsrq},
+};
+inline constexpr std::array detectedRows{
+    Row{.key = "Physical Cell ID",
+        .quantity = quantity::pci,
+        .field = indexIn(detectedLayout, "physical cell identity")},
+};
+
+inline constexpr RecordRows record{logCode, minimumLength, layout, rows, serving};
 
 }  // namespace kelvasi::lte::connectedModeMeasurement

@@ -8,15 +8,10 @@
 #include "LogGenerator/ClassIndex.h"
 #include "LogGenerator/Daemon/PDPContextList.h"
 #include "LogGenerator/Daemon/SimInfo.h"
-#include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
-#include "LogGenerator/LTE/DetectedCells.h"
 #include "LogGenerator/LTE/LTEServingCellInfo.h"
-#include "LogGenerator/LTE/MeasuredNeighborCells.h"
+#include "LogGenerator/LTE/LTETables.h"
 #include "LogGenerator/LTE/NeighborCellsList.h"
-#include "LogGenerator/LTE/NeighborMeasurementMisc.h"
 #include "LogGenerator/LTE/ReselectionCandidatesList.h"
-#include "LogGenerator/LTE/ReselectionCandidatesMisc.h"
-#include "LogGenerator/LTE/ServingCellMeasurement.h"
 
 namespace kelvasi {
 

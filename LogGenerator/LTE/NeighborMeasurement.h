@@ -4,9 +4,7 @@
 
 #include <array>
 
-#include "LogGenerator/CellFields.h"
-#include "LogGenerator/EntryList.h"
-#include "LogGenerator/LogCode.h"
+#include "LogGenerator/StateDecoder.h"
 
 namespace kelvasi::lte::neighborMeasurement {
 
@@ -45,5 +43,18 @@ inline constexpr EntryList neighbors{.count = fieldIn(layout, "neighbours minus 
                                      .start = 21,
                                      .stride = 20,
                                      .layout = neighborLayout};
+
+// What the neighbours have in common.
+inline constexpr std::array rows{
+    Row{.key = "Version", .quantity = quantity::version, .field = indexIn(layout, "version")},
+    Row{.key = "E-ARFCN", .quantity = quantity::earfcn, .field = indexIn(layout, "E-ARFCN")},
+    Row{.key = "Qrxlevmin",
+        .quantity = quantity::qrxlevmin,
+        .field = indexIn(layout, "Qrxlevmin"),
+        .unit = " dBm",
+        .factor = 2,
+        .offset = -140},
+};
+inline constexpr RecordRows record{logCode, minimumLength, layout, rows};
 
 }  // namespace kelvasi::lte::neighborMeasurement

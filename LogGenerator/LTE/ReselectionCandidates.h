@@ -4,9 +4,7 @@
 
 #include <array>
 
-#include "LogGenerator/CellFields.h"
-#include "LogGenerator/EntryList.h"
-#include "LogGenerator/LogCode.h"
+#include "LogGenerator/StateDecoder.h"
 
 namespace kelvasi::lte::reselectionCandidates {
 
@@ -61,5 +59,15 @@ inline constexpr std::array cdmaLayout{
 };
 static_assert(inWireOrder(lteLayout) && inWireOrder(utranLayout));
 static_assert(inWireOrder(geranLayout) && inWireOrder(cdmaLayout));
+
+// The cell from which reselection looks for candidates.
+inline constexpr std::array rows{
+    Row{.key = "Version", .quantity = quantity::version, .field = indexIn(layout, "version")},
+    Row{.key = "Serving EARFCN", .quantity = quantity::earfcn, .field = indexIn(layout, "serving E-ARFCN")},
+    Row{.key = "Serving Cell ID",
+        .quantity = quantity::pci,
+        .field = indexIn(layout, "serving cell identity")},
+};
+inline constexpr RecordRows record{logCode, minimumLength, layout, rows, serving};
 
 }  // namespace kelvasi::lte::reselectionCandidates

@@ -27,7 +27,8 @@ constexpr ListSection section{.name = "CCTRCH SIR",
                               .logCode = channelMeasurement::logCode,
                               .minimumLength = channelMeasurement::minimumLength,
                               .list = channelMeasurement::compositeChannels,
-                              .rows = rows};
+                              .rows = rows,
+                              .isSilent = true};
 
 }  // namespace
 

@@ -12,8 +12,6 @@ class CCTRCHSIRMeasurement : public ListDecoder {
 
  protected:
   void addEntry(RecordView record, std::size_t place) override;
-  // A code that it did not ask for is not worth a line.
-  Outcome decodeOther(RecordView, LogCode) override { return Outcome::notAskedFor; }
 };
 
 }  // namespace kelvasi

@@ -5,8 +5,7 @@
 
 #include <array>
 
-#include "LogGenerator/EntryList.h"
-#include "LogGenerator/LogCode.h"
+#include "LogGenerator/ListDecoder.h"
 
 namespace kelvasi::utran::channelMeasurement {
 
@@ -50,5 +49,14 @@ static_assert(ratioLayout.size() == timeslots);
 
 // Throws ArrayOutOfBoundsException for a timeslot that there is not.
 std::int64_t ratioOf(RecordView compositeChannel, std::size_t timeslot);
+
+inline constexpr std::array transportRows{
+    Row{.key = "TRCH ID",
+        .quantity = quantity::channelId,
+        .field = indexIn(transportLayout, "TRCH identity")},
+    Row{.key = "TRCH BLER Measurement",
+        .quantity = quantity::bler,
+        .field = indexIn(transportLayout, "BLER measurement")},
+};
 
 }  // namespace kelvasi::utran::channelMeasurement

@@ -4,8 +4,7 @@
 
 #include <array>
 
-#include "LogGenerator/EntryList.h"
-#include "LogGenerator/LogCode.h"
+#include "LogGenerator/ListDecoder.h"
 
 namespace kelvasi::utran::gsmNeighborCells {
 
@@ -27,5 +26,15 @@ static_assert(inWireOrder(cellLayout));
 
 inline constexpr EntryList cells{
     .count = fieldIn(layout, "cells"), .start = 17, .stride = 8, .layout = cellLayout};
+
+inline constexpr std::array rows{
+    Row{.key = "Cell ID", .quantity = quantity::cellId, .field = indexIn(cellLayout, "cell identity")},
+    Row{.key = "Band Indicator", .quantity = quantity::band, .field = indexIn(cellLayout, "band indicator")},
+    Row{.key = "BSIC Valid", .quantity = quantity::flag, .field = indexIn(cellLayout, "BSIC valid")},
+    Row{.key = "NCC", .quantity = quantity::ncc, .field = indexIn(cellLayout, "NCC")},
+    Row{.key = "BCC", .quantity = quantity::bcc, .field = indexIn(cellLayout, "BCC")},
+    Row{.key = "ARFCN", .quantity = quantity::arfcn, .field = indexIn(cellLayout, "ARFCN")},
+    Row{.key = "RSSI", .quantity = quantity::rssi, .field = indexIn(cellLayout, "RSSI")},
+};
 
 }  // namespace kelvasi::utran::gsmNeighborCells

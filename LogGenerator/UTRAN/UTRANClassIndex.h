@@ -9,11 +9,10 @@
 #include "LogGenerator/Daemon/PDPContextList.h"
 #include "LogGenerator/Daemon/SimInfo.h"
 #include "LogGenerator/UTRAN/CCTRCHSIRMeasurement.h"
-#include "LogGenerator/UTRAN/GSMNeighbhorMeasurements.h"
 #include "LogGenerator/UTRAN/RRC_State.h"
-#include "LogGenerator/UTRAN/TRCHBLERMeasurement.h"
 #include "LogGenerator/UTRAN/UTRANNeighbhorMeasurements.h"
 #include "LogGenerator/UTRAN/UTRANServingCellInfo.h"
+#include "LogGenerator/UTRAN/UTRANTables.h"
 
 namespace kelvasi {
 

@@ -41,7 +41,8 @@ constexpr ListSection section{.name = "Neighbor Cell List",
                               .list = utran::neighborCells::cells,
                               .rows = rows,
                               .role = CellRole::neighbour,
-                              .cell = utran::neighborCells::cell};
+                              .cell = utran::neighborCells::cell,
+                              .isSilent = true};
 
 }  // namespace
 

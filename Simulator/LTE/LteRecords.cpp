@@ -10,7 +10,7 @@
 #include "LogGenerator/LTE/NeighborMeasurement.h"
 #include "LogGenerator/LTE/ReselectionCandidates.h"
 #include "LogGenerator/LTE/ServingCell.h"
-#include "LogGenerator/LTE/ServingCellMeasurementRecord.h"
+#include "LogGenerator/LTE/ServingCellMeasurement.h"
 #include "LogGenerator/LTE/TransmitAntennas.h"
 #include "Simulator/EntryWriter.h"
 #include "Simulator/Radio/EutraBand.h"

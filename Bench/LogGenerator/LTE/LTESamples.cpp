@@ -5,7 +5,7 @@
 #include "LogGenerator/LTE/NeighborMeasurement.h"
 #include "LogGenerator/LTE/ReselectionCandidates.h"
 #include "LogGenerator/LTE/ServingCell.h"
-#include "LogGenerator/LTE/ServingCellMeasurementRecord.h"
+#include "LogGenerator/LTE/ServingCellMeasurement.h"
 #include "LogGenerator/LTE/TransmitAntennas.h"
 
 namespace kelvasi::bench {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "LogGenerator/LTE/ConnectedModeMeasurementMisc.h"
+#include "LogGenerator/LTE/LTETables.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

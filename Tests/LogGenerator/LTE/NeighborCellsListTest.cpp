@@ -6,7 +6,7 @@
 
 #include <algorithm>
 
-#include "LogGenerator/LTE/MeasuredNeighborCells.h"
+#include "LogGenerator/LTE/LTETables.h"
 #include "Tests/Support/SectionTest.h"
 
 namespace kelvasi {

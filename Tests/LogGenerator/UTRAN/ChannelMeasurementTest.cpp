@@ -7,7 +7,7 @@
 
 #include "LogGenerator/Exceptions.h"
 #include "LogGenerator/UTRAN/CCTRCHSIRMeasurement.h"
-#include "LogGenerator/UTRAN/TRCHBLERMeasurement.h"
+#include "LogGenerator/UTRAN/UTRANTables.h"
 #include "Tests/Support/SectionTest.h"
 
 namespace kelvasi {

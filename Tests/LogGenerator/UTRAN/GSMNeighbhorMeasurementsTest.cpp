@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "LogGenerator/UTRAN/GSMNeighbhorMeasurements.h"
+#include "LogGenerator/UTRAN/UTRANTables.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
