@@ -2,6 +2,7 @@
 #include "Platform/Qt/DeadSockets.h"
 
 #include <sys/stat.h>
+#include <unistd.h>
 
 #include <cerrno>
 #include <filesystem>
