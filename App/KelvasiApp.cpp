@@ -80,6 +80,7 @@ void KelvasiApp::showSaveView() {
   if (saveViewController_ || !model_) return;
   saveViewController_ =
       std::make_unique<KelvasiSaveViewController>(platform_, *this, model_->getSaveContents());
+  if (!keptDescription_.empty()) saveViewController_->saveDescription().setText(keptDescription_);
   navController_->presentModalViewController(*saveViewController_, true);
 }
 
@@ -112,8 +113,25 @@ void KelvasiApp::navigationControllerWillShowViewControllerAnimated(NavigationSt
 void KelvasiApp::updateViewControllerFromModel() {
   if (!model_) return;
   reloadPanes();
+  openKeptBranches();
   if (model_->isConnected()) updateMessage_ = dateFormatter_->stringFromDate(platform_.core.clock.now());
   updateStatusForViewController(asPane(navController_->topViewController()));
+}
+
+std::vector<std::string> KelvasiApp::openBranches() const {
+  std::vector<std::string> names;
+  for (const auto& pane : navController_->viewControllers()) names.push_back(pane->title());
+  names.erase(names.begin());
+  return names;
+}
+
+void KelvasiApp::openKeptBranches() {
+  if (!model_->topLevelNodes()) return;
+  const auto names = std::exchange(branchesToOpen_, {});
+  if (navController_->viewControllers().size() > 1) return;
+  for (const std::string& name : names) {
+    if (!asPane(navController_->topViewController()).openBranchNamed(name)) return;
+  }
 }
 
 // Root first; a pane whose branch is gone goes, with those above it, which are not reloaded.

@@ -6,6 +6,8 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <utility>
+#include <vector>
 
 #include "App/AppPlatform.h"
 #include "App/KelvasiPaneController.h"
@@ -39,6 +41,7 @@ class KelvasiApp : public Application,
 
   void showSaveView() override;
   void closeSaveView() override;
+  void keepDescription(std::string description) override { keptDescription_ = std::move(description); }
   void updateStatusForViewController(KelvasiPaneController& pane);
   // After a display tick that saw new data.
   void updateViewControllerFromModel();
@@ -55,11 +58,17 @@ class KelvasiApp : public Application,
   const std::optional<std::string>& updateMessage() const { return updateMessage_; }
   void setUpdateMessage(std::optional<std::string> message) { updateMessage_ = std::move(message); }
 
+  // The names of the branches that are open, from the root's child on.
+  std::vector<std::string> openBranches() const;
+  // Opens these with the first rows, as far as they are there and unless the user was quicker.
+  void reopenBranches(std::vector<std::string> names) { branchesToOpen_ = std::move(names); }
+
   NavigationStack* navController() const { return navController_.get(); }
   bool unsetRSSI() const { return unsetRSSI_; }
 
  private:
   void reloadPanes();
+  void openKeptBranches();
 
   AppPlatform platform_;
   std::unique_ptr<Window> window_;
@@ -70,6 +79,8 @@ class KelvasiApp : public Application,
   bool allowSaveButton_ = false;
   std::unique_ptr<DateFormatter> dateFormatter_;
   std::optional<std::string> updateMessage_;  // the status while connected
+  std::string keptDescription_;               // of a save that failed
+  std::vector<std::string> branchesToOpen_;   // until there are rows
 };
 
 }  // namespace kelvasi

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "App/KelvasiPaneController.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "App/KelvasiCell.h"
@@ -106,15 +107,23 @@ void KelvasiPaneController::tableViewDidSelectRowAtIndexPath(TableView& tableVie
                                                              const std::optional<IndexPath>& indexPath) {
   if (!indexPath) return;
   if (!childAt(*indexPath).childNodes()) return tableView.deselectRowAtIndexPath(*indexPath, false);
-  openBranch(*indexPath);
+  openBranch(nodes_->childNodes()->at(indexPath->row), true);
 }
 
-void KelvasiPaneController::openBranch(const IndexPath& indexPath) {
-  const NodeRef& child = nodes_->childNodes()->at(indexPath.row);
+bool KelvasiPaneController::openBranchNamed(std::string_view name) {
+  if (!nodes_ || !nodes_->childNodes()) return false;
+  const NodeList& children = *nodes_->childNodes();
+  const auto child = std::ranges::find_if(
+      children, [name](const NodeRef& node) { return node->childNodes() && node->displayName() == name; });
+  if (child != children.end()) openBranch(*child, false);
+  return child != children.end();
+}
+
+void KelvasiPaneController::openBranch(const NodeRef& child, bool animated) {
   auto pane = std::make_unique<KelvasiPaneController>(ui_, shell_, child,
                                                       pathByAppending(keyPath_, child->displayName()));
   pane->setStatus(status_, isLoading_);
-  navigationController()->pushViewController(std::move(pane), true);
+  navigationController()->pushViewController(std::move(pane), animated);
 }
 
 }  // namespace kelvasi

@@ -24,6 +24,8 @@ class KelvasiPaneController : public TableViewController {
   void setStatus(std::optional<std::string_view> status, bool isLoading);
   // Shows another state of the branch; null when there is none.
   void reloadWithNode(NodeRef node);
+  // As a tap on its row does, without animation. False when there is no such branch.
+  bool openBranchNamed(std::string_view name);
   const std::string& path() const { return keyPath_; }
   void viewWillDisappear(bool animated) override;
 
@@ -37,7 +39,7 @@ class KelvasiPaneController : public TableViewController {
  private:
   void showTitle();
   const KelvasiModelNode& childAt(const IndexPath& indexPath) const;
-  void openBranch(const IndexPath& indexPath);
+  void openBranch(const NodeRef& child, bool animated);
 
   UserInterface& ui_;
   SaveShell& shell_;

@@ -89,7 +89,13 @@ void KelvasiSaveViewController::setSaveDescription(TextField& field) {
 
 void KelvasiSaveViewController::savePressed() {
   const std::string path = snapshotPath(platform_.paths.logDirectory, platform_.core.clock.now());
-  if (!writeSnapshot(path)) reportFailure(path);
+  if (writeSnapshot(path)) {
+    shell_.keepDescription("");
+    platform_.shell.ui.showFileNotice("Snapshot saved", path);
+  } else {
+    shell_.keepDescription(saveDescription_->text().value_or(""));
+    reportFailure(path);
+  }
   postClose();
 }
 

@@ -23,7 +23,7 @@ class KelvasiSaveViewController : public ViewController,
   void didReceiveMemoryWarning() override;
   void viewDidUnload() override;
 
-  // Writes the snapshot, says so where that fails, and has the view closed.
+  // Writes the snapshot, says where it is or that it failed, and has the view closed.
   void savePressed();
   void cancelPressed();
   void backgroundTouched();

@@ -6,9 +6,13 @@
 
 #include "Platform/QtWidgets/AlertLayer.h"
 #include "Platform/QtWidgets/CellWidget.h"
+#include "Platform/QtWidgets/FileNotice.h"
+#include "Platform/QtWidgets/ModalLayer.h"
 #include "Platform/QtWidgets/NavigationBar.h"
 #include "Platform/QtWidgets/Spinner.h"
 #include "Platform/QtWidgets/TableWidget.h"
+#include "Platform/QtWidgets/Toolbar.h"
+#include "Platform/QtWidgets/TopWidget.h"
 
 namespace kelvasi {
 
@@ -18,14 +22,17 @@ TableWidget& tableOf(const CellWidget& cell) {
   return dynamic_cast<TableWidget&>(*cell.parentWidget()->parentWidget());
 }
 
-// A row: its texts as its name, and whether it opens as its description; pressing it is a tap on it.
+// A row: its name and value, the value as its description too for readers that know no values of texts.
+// Pressing it is a tap on it.
 class RowInterface : public QAccessibleWidget {
  public:
   explicit RowInterface(CellWidget& cell) : QAccessibleWidget(&cell, QAccessible::ListItem), cell_(cell) {}
 
   QString text(QAccessible::Text text) const override {
-    if (text == QAccessible::Name) return cell_.spokenText();
-    if (text == QAccessible::Description && cell_.opens()) return TableWidget::tr("Opens");
+    if (text == QAccessible::Name) return cell_.spokenName();
+    if (text == QAccessible::Value) return cell_.spokenValue();
+    if (text == QAccessible::Description)
+      return cell_.opens() ? TableWidget::tr("Opens") : cell_.spokenValue();
     return QAccessibleWidget::text(text);
   }
   QAccessible::State state() const override {
@@ -33,6 +40,7 @@ class RowInterface : public QAccessibleWidget {
     state.focusable = true;
     state.focused = cell_.hasFocusMark();
     state.selectable = true;
+    state.selected = tableOf(cell_).indexPathForSelectedRow() == IndexPath{0, cell_.row()};
     state.checkable = state.checked = cell_.isChecked();
     return state;
   }
@@ -53,6 +61,10 @@ class TableInterface : public QAccessibleWidget {
  public:
   explicit TableInterface(TableWidget& table) : QAccessibleWidget(&table, QAccessible::List), table_(table) {}
 
+  QString text(QAccessible::Text text) const override {
+    if (text == QAccessible::Description && !table_.emptyText().isEmpty()) return table_.emptyText();
+    return QAccessibleWidget::text(text);
+  }
   int childCount() const override { return static_cast<int>(table_.cellsInSight().size()); }
   QAccessibleInterface* child(int index) const override {
     const auto cells = table_.cellsInSight();
@@ -71,15 +83,35 @@ class TableInterface : public QAccessibleWidget {
   TableWidget& table_;
 };
 
+// What keeps the rest of the window from being used while it is there.
+class ModalInterface : public QAccessibleWidget {
+ public:
+  ModalInterface(QWidget& layer, QAccessible::Role role) : QAccessibleWidget(&layer, role) {}
+
+  QAccessible::State state() const override {
+    QAccessible::State state = QAccessibleWidget::state();
+    state.modal = true;
+    return state;
+  }
+};
+
 QAccessibleInterface* interfaceOf(const QString&, QObject* object) {
   if (auto* const cell = dynamic_cast<CellWidget*>(object)) return new RowInterface(*cell);
   if (auto* const table = dynamic_cast<TableWidget*>(object)) return new TableInterface(*table);
+  if (auto* const top = dynamic_cast<TopWidget*>(object))
+    return new QAccessibleWidget(top, QAccessible::Window);
   if (auto* const bar = dynamic_cast<NavigationBar*>(object))
-    return new QAccessibleWidget(bar, QAccessible::TitleBar);
+    return new QAccessibleWidget(bar, QAccessible::ToolBar);
+  if (auto* const bar = dynamic_cast<Toolbar*>(object))
+    return new QAccessibleWidget(bar, QAccessible::ToolBar);
   if (auto* const spinner = dynamic_cast<Spinner*>(object))
     return new QAccessibleWidget(spinner, QAccessible::Animation);
   if (auto* const alert = dynamic_cast<AlertLayer*>(object))
-    return new QAccessibleWidget(alert, QAccessible::AlertMessage);
+    return new ModalInterface(*alert, QAccessible::AlertMessage);
+  if (auto* const layer = dynamic_cast<ModalLayer*>(object))
+    return new ModalInterface(*layer, QAccessible::Dialog);
+  if (auto* const notice = dynamic_cast<FileNotice*>(object))
+    return new QAccessibleWidget(notice, QAccessible::Notification);
   return nullptr;
 }
 

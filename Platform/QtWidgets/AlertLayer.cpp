@@ -5,6 +5,7 @@
 #include <QKeyEvent>
 #include <QLabel>
 #include <QPainter>
+#include <algorithm>
 
 #include "Platform/QtWidgets/BarButton.h"
 #include "Platform/QtWidgets/Fonts.h"
@@ -14,11 +15,12 @@ namespace kelvasi {
 
 namespace {
 
-constexpr int cardWidth = 280;
+constexpr int widestCard = 280;
+constexpr int margin = 12;
 constexpr double dimming = 0.4;
 
 QLabel* makeText(const QString& text, const Font& font, QWidget& parent) {
-  auto* const label = new QLabel(text, &parent);
+  auto* const label = new QLabel(breakable(text), &parent);
   label->setFont(qtFont(font));
   label->setAlignment(Qt::AlignCenter);
   label->setWordWrap(true);
@@ -42,7 +44,7 @@ AlertLayer::AlertLayer(QWidget& parent, const AlertText& text) : Layer(parent) {
   setAccessibleDescription(text.message);
   auto* const card = new Card(this);
   card->setBackgroundRole(QPalette::ToolTipBase);  // lighter than rows in the dark, to stand out
-  card->setFixedWidth(cardWidth);
+  card->setFixedWidth(std::min(widestCard, parent.width() - 2 * margin));
   fill(*card, text);
   auto* const layout = new QGridLayout(this);
   layout->addWidget(card, 0, 0, Qt::AlignCenter);
@@ -59,8 +61,11 @@ void AlertLayer::fill(Card& card, const AlertText& text) {
   auto* const layout = new QVBoxLayout(&card);
   layout->setContentsMargins(0, 20, 0, 0);
   layout->setSpacing(6);
-  layout->addWidget(makeText(text.title, Font::boldSystem(17), card));
-  layout->addWidget(makeText(text.message, Font::system(14), card));
+  auto* const texts = new QVBoxLayout;
+  texts->setContentsMargins(margin, 0, margin, 0);
+  texts->addWidget(makeText(text.title, Font::boldSystem(17), card));
+  texts->addWidget(makeText(text.message, Font::system(14), card));
+  layout->addLayout(texts);
   layout->addSpacing(8);
   layout->addWidget(makeLine(card));
   layout->addWidget(button_);

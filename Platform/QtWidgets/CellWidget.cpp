@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Platform/QtWidgets/CellWidget.h"
 
+#include <QAccessible>
 #include <QPainter>
+#include <algorithm>
 #include <utility>
 
 #include "Platform/QtWidgets/Glyphs.h"
@@ -13,6 +15,7 @@ namespace {
 constexpr double lineIndent = 10;   // where the names of panes begin
 constexpr double labelIndent = 16;  // of the one-label style
 constexpr double glyphWidth = 34;
+constexpr int widestColumn = 600;
 
 // Applications put texts flush with the content area's right edge: it keeps off the screen's edge.
 double rightInset(CellAccessory accessory) {
@@ -33,8 +36,16 @@ CellWidget::CellWidget(QWidget& table, CellStyle style) : QWidget(&table), style
   content_.addSubview(textLabel_);
 }
 
+// On a card all of the row, which is no wider than the card.
+QRect CellWidget::column() const {
+  const int wide = style_ == CellStyle::oneLabel ? width() : std::min(width(), widestColumn);
+  return {(width() - wide) / 2, 0, wide, height()};
+}
+
 void CellWidget::layOutStandard() {
-  content_.setFrame({0, 0, width() - rightInset(accessory_), static_cast<double>(height())});
+  const QRect used = column();
+  content_.setFrame({static_cast<double>(used.left()), 0, used.width() - rightInset(accessory_),
+                     static_cast<double>(height())});
   const double indent = style_ == CellStyle::oneLabel ? labelIndent : lineIndent;
   textLabel_.setFrame({indent, 0, content_.area.width - indent, content_.area.height});
 }
@@ -63,6 +74,21 @@ QStringList CellWidget::texts() const {
   return all;
 }
 
+void CellWidget::tellChanges() {
+  const QStringList now = texts();
+  const QStringList before = std::exchange(told_, now);
+  if (before.isEmpty() || before == now) return;
+  const auto tell = [this](QAccessible::Event kind) {
+    QAccessibleEvent event(this, kind);
+    QAccessible::updateAccessibility(&event);
+  };
+  if (before.value(0) != now.value(0)) tell(QAccessible::NameChanged);
+  if (before.mid(1) == now.mid(1)) return;
+  tell(QAccessible::DescriptionChanged);
+  QAccessibleValueChangeEvent changed(this, spokenValue());
+  QAccessible::updateAccessibility(&changed);
+}
+
 QColor CellWidget::ground() const {
   return mixed(palette().color(QPalette::Base), palette().color(QPalette::AlternateBase), mark_);
 }
@@ -72,14 +98,17 @@ void CellWidget::paintEvent(QPaintEvent*) {
   painter.fillRect(rect(), ground());
   painter.setBrush(ground());
   painter.setPen(palette().color(QPalette::Text));
+  painter.translate(content_.area.x, 0);
   content_.group.paint(painter);
+  painter.translate(-content_.area.x, 0);
   paintAccessory(painter);
   paintLine(painter);
   if (hasFocusMark_) paintFocus(painter);
 }
 
 void CellWidget::paintAccessory(QPainter& painter) const {
-  const QRectF area(width() - glyphWidth, 0, glyphWidth, height());
+  const QRect used = column();
+  const QRectF area(used.left() + used.width() - glyphWidth, 0, glyphWidth, height());
   if (opens()) drawGlyph(painter, Glyph::disclosure, area, palette().color(QPalette::Dark));
   if (isChecked()) drawGlyph(painter, Glyph::checkmark, area, palette().color(QPalette::Highlight));
 }
@@ -90,7 +119,10 @@ void CellWidget::paintLine(QPainter& painter) const {
   const bool isOnCard = style_ == CellStyle::oneLabel;
   if (isOnCard && row_ == 0) return;
   const double indent = isOnCard ? labelIndent : lineIndent;
-  painter.fillRect(QRectF(indent, isOnCard ? 0 : height() - thickness, width() - indent, thickness),
+  const QRect used = column();
+  const double right = used.width() == width() ? 0 : lineIndent;
+  painter.fillRect(QRectF(used.left() + indent, isOnCard ? 0 : height() - thickness,
+                          used.width() - indent - right, thickness),
                    palette().color(QPalette::Mid));
 }
 
@@ -98,7 +130,7 @@ void CellWidget::paintFocus(QPainter& painter) const {
   painter.setRenderHint(QPainter::Antialiasing);
   painter.setPen(QPen(palette().color(QPalette::Highlight), 2));
   painter.setBrush(Qt::NoBrush);
-  painter.drawRoundedRect(QRectF(rect()).adjusted(2, 2, -2, -3), 6, 6);
+  painter.drawRoundedRect(QRectF(column()).adjusted(2, 2, -2, -3), 6, 6);
 }
 
 }  // namespace kelvasi

@@ -31,8 +31,11 @@ class CellWidget : public QWidget, public CellBody {
 
   // What the row says, its name first.
   QStringList texts() const;
-  // The same as one, for those who do not see it.
-  QString spokenText() const { return texts().join(QStringLiteral(", ")); }
+  // The same for those who do not see it.
+  QString spokenName() const { return texts().value(0); }
+  QString spokenValue() const { return texts().mid(1).join(QStringLiteral(", ")); }
+  // Has a screen reader hear what is new since the last time.
+  void tellChanges();
   bool opens() const { return accessory_ == CellAccessory::disclosureIndicator; }
   bool isChecked() const { return accessory_ == CellAccessory::checkmark; }
   bool hasFocusMark() const { return hasFocusMark_; }
@@ -52,6 +55,8 @@ class CellWidget : public QWidget, public CellBody {
   };
 
   QColor ground() const;
+  // The part of the row that is used: in a wide window values stay near their names.
+  QRect column() const;
   void paintAccessory(QPainter& painter) const;
   void paintLine(QPainter& painter) const;
   void paintFocus(QPainter& painter) const;
@@ -63,6 +68,7 @@ class CellWidget : public QWidget, public CellBody {
   bool hasFocusMark_ = false;
   Content content_{*this};
   QtLabel textLabel_;
+  QStringList told_;
 };
 
 }  // namespace kelvasi

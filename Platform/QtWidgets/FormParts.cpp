@@ -35,6 +35,11 @@ class CardCorners : public QWidget {
 
 }  // namespace
 
+QString breakable(QString text) {
+  constexpr char16_t zeroWidthSpace = 0x200B;
+  return text.replace(QLatin1Char('/'), QLatin1Char('/') + QString(QChar(zeroWidthSpace)));
+}
+
 Card::Card(QWidget* parent) : QFrame(parent) {
   setFrameShape(QFrame::NoFrame);
   setBackgroundRole(QPalette::Base);

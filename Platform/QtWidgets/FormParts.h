@@ -10,6 +10,9 @@
 
 namespace kelvasi {
 
+// A text whose paths may be broken after each of their parts.
+QString breakable(QString text);
+
 // In the colour of its background role.
 class Card : public QFrame {
  public:

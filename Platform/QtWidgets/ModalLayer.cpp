@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Platform/QtWidgets/ModalLayer.h"
 
+#include "Platform/QtWidgets/FormParts.h"
 #include "Platform/QtWidgets/Page.h"
 
 namespace kelvasi {
@@ -11,6 +12,7 @@ constexpr int duration = 320;  // milliseconds
 
 ModalLayer::ModalLayer(QWidget& window, Page& page, bool animated) : Layer(window), page_(page) {
   page.widget().setParent(this);
+  if (const auto* const title = page.widget().findChild<FormTitle*>()) setAccessibleName(title->text());
   rise_.setDuration(duration);
   rise_.setEasingCurve(QEasingCurve::OutCubic);
   rise_.setStartValue(1.0);

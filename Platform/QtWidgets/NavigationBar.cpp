@@ -20,11 +20,24 @@ constexpr double titleSize = 17;
 NavigationBar::NavigationBar(QWidget* parent, std::function<void()> goBack)
     : QWidget(parent), back_(new BarButton(this)) {
   setFixedHeight(barHeight);
-  setFont(qtFont(Font::boldSystem(titleSize)));
+  takeFont();
   back_->setBack(true);
   back_->setObjectName(QStringLiteral("back"));
   back_->hide();
   connect(back_, &QAbstractButton::clicked, this, [goBack = std::move(goBack)] { goBack(); });
+}
+
+void NavigationBar::takeFont() {
+  setFont(qtFont(Font::boldSystem(titleSize)));
+}
+
+bool NavigationBar::event(QEvent* event) {
+  const bool isHandled = QWidget::event(event);
+  if (event->type() != QEvent::ApplicationFontChange) return isHandled;
+  takeFont();
+  placeBackButton();
+  update();
+  return isHandled;
 }
 
 void NavigationBar::show(const QString& title, const std::optional<QString>& back) {

@@ -21,10 +21,12 @@ class NavigationBar : public QWidget {
   const BarButton& backButton() const { return *back_; }
 
  protected:
+  bool event(QEvent* event) override;
   void paintEvent(QPaintEvent* event) override;
   void resizeEvent(QResizeEvent* event) override;
 
  private:
+  void takeFont();
   void placeBackButton();
 
   QString title_;

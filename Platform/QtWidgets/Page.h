@@ -31,6 +31,7 @@ class Page {
   ~Page() = default;
   void takeTitle(std::string_view title) {
     title_ = qtText(title);
+    widget().setAccessibleName(title_);
     if (changed_) changed_();
   }
   void takeItems(ToolbarItems items) {

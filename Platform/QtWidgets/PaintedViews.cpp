@@ -4,36 +4,50 @@
 #include <QFontMetricsF>
 #include <QLinearGradient>
 #include <algorithm>
+#include <cmath>
 #include <utility>
 
 #include "Platform/QtWidgets/Fonts.h"
+#include "Platform/QtWidgets/TextLine.h"
 
 namespace kelvasi {
 
 namespace {
 
-constexpr double fadeWidth = 28;
+constexpr double fadeWidth = 40;
+constexpr double dotsWidth = 16;  // of the part of a fade that has faded away
 
-Qt::Alignment qtAlignment(TextAlignment alignment) {
+// The share of the room beside a text that is at its left.
+double shareAtLeft(TextAlignment alignment) {
   switch (alignment) {
     case TextAlignment::centre:
-      return Qt::AlignHCenter;
+      return 0.5;
     case TextAlignment::right:
-      return Qt::AlignRight;
+      return 1;
     case TextAlignment::left:
       break;
   }
-  return Qt::AlignLeft | Qt::AlignAbsolute;
+  return 0;
 }
 
-// From the ground's colour at `from` to nothing at `to`.
+// The ground's colour, from `from`, solid beneath the dots, to nothing at `to`.
 void paintFade(QPainter& painter, const QRectF& area, double from, double to) {
   QColor ground = painter.brush().color();
   QLinearGradient fade(from, 0, to, 0);
   fade.setColorAt(0, ground);
+  fade.setColorAt((dotsWidth + 2) / fadeWidth, ground);
   ground.setAlpha(0);
   fade.setColorAt(1, ground);
   painter.fillRect(area, fade);
+}
+
+void paintDots(QPainter& painter, const QPointF& middle) {
+  painter.save();
+  painter.setRenderHint(QPainter::Antialiasing);
+  painter.setBrush(painter.pen().color());
+  painter.setPen(Qt::NoPen);
+  for (const double step : {-5.0, 0.0, 5.0}) painter.drawEllipse(middle + QPointF(step, 0), 1.5, 1.5);
+  painter.restore();
 }
 
 }  // namespace
@@ -72,6 +86,12 @@ void PaintedGroup::collectTexts(QStringList& texts) const {
   for (const PaintedPart* part : parts_) part->collectTexts(texts);
 }
 
+double PaintedGroup::right() const {
+  double furthest = 0;
+  for (const PaintedPart* part : parts_) furthest = std::max(furthest, part->frame_.x + part->frame_.width);
+  return furthest;
+}
+
 QtScrollView* PaintedGroup::scrollView() const {
   for (PaintedPart* part : parts_) {
     if (QtScrollView* view = part->asScrollView()) return view;
@@ -87,10 +107,8 @@ void QtLabel::setText(std::string_view text) {
 }
 
 void QtLabel::setFont(const Font& font) {
-  if (isFontMade_ && font_ == font) return;
+  if (font_ == font) return;
   font_ = font;
-  qtFont_ = qtFont(font);
-  isFontMade_ = true;
   changed();
 }
 
@@ -102,13 +120,22 @@ void QtLabel::setAlignment(TextAlignment alignment) {
 void QtLabel::paint(QPainter& painter) const {
   if (shown_.isEmpty()) return;
   const QRectF area = qtRect(frame());
-  painter.setFont(isFontMade_ ? qtFont_ : qtFont(font_));
-  const QString text =
-      isElided_ ? QFontMetricsF(painter.font()).elidedText(shown_, Qt::ElideRight, area.width()) : shown_;
-  painter.drawText(
-      area,
-      static_cast<int>(qtAlignment(alignment_) | Qt::AlignVCenter) | Qt::TextSingleLine | Qt::TextDontClip,
-      text);
+  const QFont font = qtFont(font_);
+  const QFontMetricsF metrics(font);
+  const QString text = isElided_ ? metrics.elidedText(shown_, Qt::ElideRight, area.width()) : shown_;
+  const TextLine line(text, font);
+  const double room = spreadTo(text);
+  const double left = shareAtLeft(alignment_) * (area.width() - std::max(room, line.width()));
+  const double baseline = area.center().y() + (metrics.ascent() - metrics.descent()) / 2;
+  line.draw(painter, {area.left() + left, baseline}, room);
+}
+
+double QtLabel::spreadTo(const QString& text) const {
+  if (font_.isBold || isElided_) return 0;
+  QFont bold = qtFont(font_);
+  bold.setBold(true);
+  const double width = frame().width;
+  return std::ceil(TextLine(text, bold).width()) == width ? width : 0;
 }
 
 void QtLabel::collectTexts(QStringList& texts) const {
@@ -140,19 +167,19 @@ void QtScrollView::paint(QPainter& painter) const {
   painter.translate(frame().x - offset_, frame().y);
   group_.paint(painter);
   painter.restore();
-  paintFades(painter);
+  if (offset_ > 0) paintHidden(painter, Qt::LeftEdge);
+  if (furthestOffset() > 0 && group_.right() > offset_ + frame().width) paintHidden(painter, Qt::RightEdge);
 }
 
-// A fade at an edge says that there is more behind it.
-void QtScrollView::paintFades(QPainter& painter) const {
-  if (furthestOffset() <= 0) return;
+// Dots at an edge say that there is more behind it.
+void QtScrollView::paintHidden(QPainter& painter, Qt::Edge edge) const {
   const QRectF area = qtRect(frame());
-  if (offset_ > 0)
-    paintFade(painter, {area.left(), area.top(), fadeWidth, area.height()}, area.left(),
-              area.left() + fadeWidth);
-  if (offset_ < furthestOffset())
-    paintFade(painter, {area.right() - fadeWidth, area.top(), fadeWidth, area.height()}, area.right(),
-              area.right() - fadeWidth);
+  const bool isLeft = edge == Qt::LeftEdge;
+  const double from = isLeft ? area.left() : area.right();
+  const double inwards = isLeft ? 1 : -1;
+  const QRectF strip(std::min(from, from + inwards * fadeWidth), area.top(), fadeWidth, area.height());
+  paintFade(painter, strip, from, from + inwards * fadeWidth);
+  paintDots(painter, {from + inwards * dotsWidth / 2, area.center().y()});
 }
 
 }  // namespace kelvasi

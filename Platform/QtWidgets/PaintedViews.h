@@ -58,6 +58,8 @@ class PaintedGroup {
   void add(View& view);
   void paint(QPainter& painter) const;
   void collectTexts(QStringList& texts) const;
+  // How far to the right its views reach.
+  double right() const;
   // The first one among them; null when there is none.
   QtScrollView* scrollView() const;
 
@@ -83,11 +85,12 @@ class QtLabel : public Label, public PaintedPart {
   void collectTexts(QStringList& texts) const override;
 
  private:
+  // Regular text in a frame that was measured in the bold font fills the frame.
+  double spreadTo(const QString& text) const;
+
   std::string text_;
   QString shown_;
   Font font_ = Font::system(17);
-  QFont qtFont_;
-  bool isFontMade_ = false;
   TextAlignment alignment_ = TextAlignment::left;
   bool isElided_ = false;
 };
@@ -109,7 +112,7 @@ class QtScrollView : public ScrollView, public PaintedPart {
   QtScrollView* asScrollView() override { return this; }
 
  private:
-  void paintFades(QPainter& painter) const;
+  void paintHidden(QPainter& painter, Qt::Edge edge) const;
 
   Size contentSize_;
   double offset_ = 0;

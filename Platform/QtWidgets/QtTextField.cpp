@@ -25,6 +25,10 @@ Rect QtTextField::bounds() const {
   return {0, 0, static_cast<double>(edit_.width()), static_cast<double>(edit_.height())};
 }
 
+void QtTextField::setText(std::string_view text) {
+  edit_.setText(QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size())));
+}
+
 void QtTextField::resignFirstResponder() {
   if (!edit_.hasFocus()) return;
   edit_.clearFocus();

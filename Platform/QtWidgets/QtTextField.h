@@ -17,6 +17,7 @@ class QtTextField : public QObject, public TextField, public HasWidget {
   Rect bounds() const override;
   void setDelegate(TextFieldDelegate* delegate) override { delegate_ = delegate; }
   std::optional<std::string> text() const override { return edit_.text().toStdString(); }
+  void setText(std::string_view text) override;
   // The keyboard then works the form around the field.
   void resignFirstResponder() override;
   QWidget& widget() override { return edit_; }

@@ -7,16 +7,20 @@
 #include <optional>
 
 #include "Platform/QtWidgets/Palettes.h"
+#include "Platform/QtWidgets/TopWidget.h"
 #include "Platform/UserInterface/UserInterface.h"
 
 namespace kelvasi {
 
+class PortalSetting;
 class SystemScheme;
 
 class QtUserInterface : public UserInterface {
  public:
   struct Options {
-    bool fullScreen = false;  // always on a screen that is no larger than a phone's
+    bool fullScreen = false;                         // always on a screen that is no larger than a phone's
+    std::optional<QSize> windowSize = std::nullopt;  // a phone's unless stated
+    std::optional<double> textScale = std::nullopt;  // the desktop's unless stated
     std::optional<ColourScheme> colourScheme = std::nullopt;  // the system's unless stated
     bool animates = true;
   };
@@ -34,6 +38,10 @@ class QtUserInterface : public UserInterface {
   std::unique_ptr<ScrollView> makeScrollView() override;
   // Over the newest window.
   void showAlert(std::string_view title, std::string_view message, std::string_view button) override;
+  void showFileNotice(std::string_view message, std::string_view path) override;
+
+  // The newest; null before there is one.
+  TopWidget* window() const { return window_; }
 
  private:
   struct WindowScreen : Screen {
@@ -43,11 +51,13 @@ class QtUserInterface : public UserInterface {
   };
 
   void paint(ColourScheme scheme);
+  void followTextScale();
 
   Options options_;
   WindowScreen screen_;
   std::unique_ptr<SystemScheme> systemScheme_;
-  QPointer<QWidget> window_;
+  std::unique_ptr<PortalSetting> systemTextScale_;
+  QPointer<TopWidget> window_;
 };
 
 }  // namespace kelvasi

@@ -7,14 +7,13 @@
 
 namespace kelvasi {
 
-namespace {
-constexpr QSize smallest(240, 320);
-}
-
 QtWindow::QtWindow(const Rect& frame, bool fullScreen)
-    : widget_(std::make_unique<QWidget>()), isFullScreen_(fullScreen) {
-  widget_->setMinimumSize(smallest);
-  widget_->resize(wholePoints(frame).size());
+    : widget_(std::make_unique<TopWidget>()), isFullScreen_(fullScreen) {
+  if (fullScreen) {
+    widget_->resize(wholePoints(frame).size());
+  } else {
+    widget_->setWindowedSize(wholePoints(frame).size());
+  }
   auto* const layout = new QVBoxLayout(widget_.get());
   layout->setContentsMargins(0, 0, 0, 0);
 }
@@ -41,7 +40,7 @@ void QtWindow::makeKeyAndVisible() {
   widget_->layout()->activate();
   if (root_) root_->willAppear();
   if (isFullScreen_) {
-    widget_->showFullScreen();
+    widget_->showFilling();
   } else {
     widget_->show();
   }

@@ -5,7 +5,7 @@
 #include <memory>
 #include <vector>
 
-#include "Platform/QtWidgets/Palettes.h"
+#include "Platform/QtWidgets/TopWidget.h"
 #include "Platform/QtWidgets/WidgetView.h"
 #include "Platform/UserInterface/Window.h"
 
@@ -23,10 +23,10 @@ class QtWindow : public Window, public HasWidget {
   void setRootViewController(NavigationStack& stack) override { root_ = &stack; }
   void makeKeyAndVisible() override;
   void orderOut() override { widget_->hide(); }
-  QWidget& widget() override { return *widget_; }
+  TopWidget& widget() override { return *widget_; }
 
  private:
-  std::unique_ptr<QWidget> widget_;
+  std::unique_ptr<TopWidget> widget_;
   NavigationStack* root_ = nullptr;
   bool isFullScreen_;
 };

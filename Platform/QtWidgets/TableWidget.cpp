@@ -1,12 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Platform/QtWidgets/TableWidget.h"
 
+#include <QPainter>
 #include <QResizeEvent>
 #include <QScrollBar>
 #include <QScroller>
 #include <algorithm>
 
 #include "Platform/QtWidgets/CellWidget.h"
+#include "Platform/QtWidgets/Fonts.h"
 #include "Platform/QtWidgets/ScrollIndicator.h"
 #include "Platform/QtWidgets/TableMetrics.h"
 
@@ -67,6 +69,7 @@ void TableWidget::reloadData() {
 // Rows that stay keep their widgets where they are, so that only texts that changed are drawn anew.
 void TableWidget::reloadNow() {
   needsReload_ = false;
+  if (rows_ == 0) viewport()->update();
   rows_ = source_ ? source_->tableViewNumberOfRowsInSection(*this, 0) : 0;
   if (selected_ && *selected_ >= rows_) selected_.reset();
   if (keyboard_ && *keyboard_ >= rows_) keyboard_ = rows_ > 0 ? std::optional(rows_ - 1) : std::nullopt;
@@ -121,6 +124,7 @@ void TableWidget::placeCells() {
     widget.showRow(row);
     widget.move(0, static_cast<int>(row) * rowHeight - verticalScrollBar()->value());
     widget.show();
+    widget.tellChanges();
   }
   markCells();
 }
@@ -177,6 +181,25 @@ std::vector<CellWidget*> TableWidget::cellsInSight() const {
   std::vector<CellWidget*> cells;
   for (const auto& [row, cell] : cells_.shown()) cells.push_back(&widgetOf(*cell));
   return cells;
+}
+
+QString TableWidget::emptyText() const {
+  return rows_ == 0 && !fitsRows_ ? tr("Nothing received yet") : QString();
+}
+
+void TableWidget::paintEvent(QPaintEvent*) {
+  const QString text = emptyText();
+  if (text.isEmpty()) return;
+  QPainter painter(viewport());
+  painter.setFont(qtFont(Font::system(17)));
+  painter.setPen(palette().color(QPalette::PlaceholderText));
+  painter.drawText(viewport()->rect(), Qt::AlignCenter | Qt::TextWordWrap, text);
+}
+
+// Texts of another size lay out every row anew.
+bool TableWidget::event(QEvent* event) {
+  if (event->type() == QEvent::ApplicationFontChange) reloadData();
+  return QAbstractScrollArea::event(event);
 }
 
 void TableWidget::scrollContentsBy(int, int) {

@@ -47,6 +47,8 @@ class TableWidget : public QAbstractScrollArea, public TableView, public HasWidg
   // Whether a key was pressed since the last tap.
   bool isKeyboardInUse() const { return isKeyboardInUse_; }
   std::size_t rows() const { return rows_; }
+  // What stands in the place of rows where there is none; empty while there are some.
+  QString emptyText() const;
   QSize sizeHint() const override;
 
  protected:
@@ -62,6 +64,10 @@ class TableWidget : public QAbstractScrollArea, public TableView, public HasWidg
   void resizeEvent(QResizeEvent* event) override;
   void showEvent(QShowEvent* event) override;
   void scrollContentsBy(int dx, int dy) override;
+  void paintEvent(QPaintEvent* event) override;
+  bool event(QEvent* event) override;
+  // The first Tab marks a row before the next one leaves the table.
+  bool focusNextPrevChild(bool next) override;
 
  private:
   // Rows.

@@ -154,6 +154,12 @@ void TableWidget::moveKeyboardTo(std::size_t row) {
   }
 }
 
+bool TableWidget::focusNextPrevChild(bool next) {
+  if (!next || rows_ == 0 || isKeyboardInUse_) return QAbstractScrollArea::focusNextPrevChild(next);
+  moveKeyboardTo(keyboard_.value_or(rowsInSight().first));
+  return true;
+}
+
 bool TableWidget::scrollSideways(int key) {
   if (key != Qt::Key_Left && key != Qt::Key_Right) return false;
   QtScrollView* const view = keyboard_ ? scrollViewAt(*keyboard_) : nullptr;

@@ -22,6 +22,7 @@ constexpr int spacing = 8;
 
 Toolbar::Toolbar(QWidget* parent) : QWidget(parent), layout_(new QHBoxLayout(this)) {
   setFixedHeight(barHeight);
+  setAccessibleName(tr("Status"));
   layout_->setContentsMargins(margin, 0, 2, 0);
   layout_->setSpacing(spacing);
 }

@@ -4,6 +4,7 @@
 
 #include <optional>
 #include <string>
+#include <string_view>
 
 #include "Platform/UserInterface/View.h"
 
@@ -25,6 +26,7 @@ class TextField : public View {
   // Null for none; the delegate outlives the field or takes itself off.
   virtual void setDelegate(TextFieldDelegate* delegate) = 0;
   virtual std::optional<std::string> text() const = 0;
+  virtual void setText(std::string_view text) = 0;
   // Gives up the keyboard.
   virtual void resignFirstResponder() = 0;
 };

@@ -31,6 +31,8 @@ class UserInterface {
 
   // Over whatever is shown, until its one button is pressed.
   virtual void showAlert(std::string_view title, std::string_view message, std::string_view button) = 0;
+  // Beside whatever is shown, for a while: what became of a file, and its path, which can be copied.
+  virtual void showFileNotice(std::string_view message, std::string_view path) = 0;
 };
 
 }  // namespace kelvasi

@@ -134,6 +134,26 @@ TEST_F(KelvasiAppTest, PanesAboveTheOneThatIsGoneGoTooAndAreNotReloaded) {
   EXPECT_THAT(reloaded, ElementsAre(0, 1));
 }
 
+TEST_F(KelvasiAppTest, BranchesThatWereOpenAreOpenedWithTheFirstRows) {
+  application.reopenBranches({"PDP Context Info", "1", "not there"});
+  launch();
+  EXPECT_EQ(ui.stack->viewControllers().size(), 1U);
+  showList(
+      PlistArray::make({PlistDictionary::make({{"Name", "a"}}), PlistDictionary::make({{"Name", "b"}})}));
+  EXPECT_EQ(application.openBranches(), (std::vector<std::string>{"PDP Context Info", "1"}));
+  EXPECT_EQ(ui.topPane().title, "1");
+}
+
+TEST_F(KelvasiAppTest, BranchesAreOpenedOnlyOnceAndNotOverTheUsersOwn) {
+  application.reopenBranches({"Process CO"});
+  launch();
+  showList(PlistArray::make({}));
+  application.navController()->popViewController(false);
+  tick();
+  showList(PlistArray::make({}));
+  EXPECT_THAT(application.openBranches(), IsEmpty());
+}
+
 TEST_F(KelvasiAppTest, ABranchThatBecameALeafStaysOpenWithoutRows) {
   launch();
   openContext();

@@ -12,11 +12,14 @@ namespace {
 using test::MemoryCellBody;
 using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::Pair;
 
 struct ClosingShell : SaveShell {
   bool allowSaveButton() const override { return true; }
   void showSaveView() override {}
   void closeSaveView() override { ++closings; }
+  void keepDescription(std::string description) override { kept.push_back(std::move(description)); }
+  std::vector<std::string> kept;
   int closings = 0;
 };
 
@@ -96,6 +99,23 @@ TEST_F(KelvasiSaveViewControllerTest, SaveWritesTheSnapshotAndClosesTheViewLater
   EXPECT_EQ(shell.closings, 1);
   EXPECT_THAT(ui.alerts, IsEmpty());
   EXPECT_THAT(errors(), IsEmpty());
+}
+
+TEST_F(KelvasiSaveViewControllerTest, ASaveSaysWhereTheFileIsAndKeepsNoDescription) {
+  open(PlistArray::make({}));
+  field().typed = "at the bench";
+  interface().use("savePressed");
+  EXPECT_THAT(ui.notices, ElementsAre(Pair("Snapshot saved", "/logs/KelvasiSnapshot-1709647629.kelvasi")));
+  EXPECT_THAT(shell.kept, ElementsAre(""));
+}
+
+TEST_F(KelvasiSaveViewControllerTest, AFailedSaveKeepsTheDescriptionAndGivesNoNotice) {
+  open(PlistArray::make({}));
+  field().typed = "at the bench";
+  files.isFull = true;
+  interface().use("savePressed");
+  EXPECT_THAT(ui.notices, IsEmpty());
+  EXPECT_THAT(shell.kept, ElementsAre("at the bench"));
 }
 
 TEST_F(KelvasiSaveViewControllerTest, TheTimestampIsOfTheViewTheNameOfThePress) {

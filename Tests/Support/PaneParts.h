@@ -14,6 +14,7 @@ struct FakeShell : SaveShell {
   bool allowSaveButton() const override { return allows; }
   void showSaveView() override { ++shown; }
   void closeSaveView() override {}
+  void keepDescription(std::string) override {}
   bool allows = false;
   int shown = 0;
 };

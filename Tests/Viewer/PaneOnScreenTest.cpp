@@ -38,14 +38,23 @@ class PaneOnScreenTest : public test::QtFixture {
   KelvasiPaneController* pane = nullptr;
 };
 
-// Of the room that the bold text would take the regular one leaves some at the right.
-TEST_F(PaneOnScreenTest, AShortValueHasItsPlaceAtTheContentsRightEdge) {
-  const QRect value = drawnValue("Cell", "HHHH");
-  const double left = contentWidth - widthOf("HHHH");
-  const QRectF ink = QFontMetricsF(qtFont(Font::system(15))).tightBoundingRect(QStringLiteral("HHHH"));
-  EXPECT_NEAR(value.left(), left + ink.left(), 1);
-  EXPECT_NEAR(value.width(), ink.width(), 2);
+// The regular text fills the room that was measured for the bold one.
+TEST_F(PaneOnScreenTest, AShortValueTakesItsPlaceUpToTheContentsRightEdge) {
+  for (const char* const text : {"HHHH", "MM_IDLE", "-111 dBm", "H"}) {
+    const QRect value = drawnValue("Cell", text);
+    EXPECT_NEAR(value.left(), contentWidth - widthOf(text) + 1, 1.5) << text;
+    EXPECT_NEAR(value.right(), contentWidth - 2, 1.5) << text;
+  }
   EXPECT_EQ(cell().scrollView()->furthestOffset(), 0);
+}
+
+TEST_F(PaneOnScreenTest, ValuesOfAsManyDigitsEndAtOneEdgeAndBeginAtOne) {
+  for (const char* const text : {"111 H", "888 H", "417 H", "290 H"}) {
+    const QRect ones = drawnValue("Cell", "000 H");
+    const QRect value = drawnValue("Cell", text);
+    EXPECT_EQ(value.right(), ones.right()) << text;
+    EXPECT_NEAR(value.left(), ones.left(), 2) << text;  // a digit is narrower than its room
+  }
 }
 
 TEST_F(PaneOnScreenTest, AKeyBeginsTenPointsFromTheLeft) {

@@ -39,9 +39,9 @@ class Program(ViewerTest):
             self.assertIn(option, result.stdout)
 
     def test_help_and_faults_name_the_looks_as_a_user_gives_them(self):
-        self.assertIn("SCHEME:{dark,light}", self.run_viewer("--help").stdout)
+        self.assertIn("SCHEME:{dark,light,desktop}", self.run_viewer("--help").stdout)
         self.assertEqual(self.run_viewer("--appearance", "blue").stderr,
-                         "kelvasi: --appearance: blue not in {dark,light} (try --help)\n")
+                         "kelvasi: --appearance: blue not in {dark,light,desktop} (try --help)\n")
 
     def test_looks_are_named_in_either_case(self):
         for look in ("dark", "Light", "DARK"):
@@ -109,6 +109,59 @@ class Program(ViewerTest):
             with self.subTest(screen=screen, options=options):
                 self.use_screen(*screen)
                 self.assertEqual(self.picture_size(*options), size)
+
+
+class Memory(ViewerTest):
+    def start_remembering(self, *arguments):
+        return self.start_viewer("--memory", self.path("window.ini"), *arguments)
+
+    def test_open_panes_are_opened_again_with_the_first_rows(self):
+        self.start_daemon("--scenario", "drive")
+        viewer = self.start_remembering()
+        viewer.do("open Process CS")
+        self.assertEqual((viewer.state()["title"], viewer.close()), ("Process CS", 0))
+        viewer = self.start_remembering()
+        state = viewer.await_updated()
+        self.assertEqual((state["title"], state["back"]), ("Process CS", "Kelvasi"))
+        viewer.do("root")
+        viewer.state()
+        self.assertEqual(viewer.interrupt(), 0)  # a signal's end is one too
+        self.assertEqual(self.start_remembering().await_updated()["title"], "Kelvasi")
+
+    def test_a_script_remembers_nothing_by_itself(self):
+        self.start_daemon("--scenario", "drive")
+        viewer = self.start_viewer()
+        viewer.do("open Process CS")
+        viewer.close()
+        self.assertEqual(self.start_viewer().await_updated()["title"], "Kelvasi")
+
+    def test_the_appearance_is_remembered_until_the_desktops_is_wanted(self):
+        ground = {}
+        for name, arguments in (("first", []), ("asked", ["--appearance", "dark"]), ("again", []),
+                                ("desktop", ["--appearance", "desktop"]), ("last", [])):
+            viewer = self.start_remembering(*arguments)
+            viewer.do(f"picture {self.path(name + '.png')}")
+            self.assertEqual(viewer.close(), 0)
+            ground[name] = self.read(name + ".png")
+        self.assertEqual(ground["asked"], ground["again"])
+        self.assertNotEqual(ground["first"], ground["asked"])
+        self.assertEqual((ground["desktop"], ground["last"]), (ground["first"], ground["first"]))
+
+    def test_a_file_that_makes_no_sense_is_no_harm(self):
+        for text in (b"[Window]\nSize=@Size(-4 9)\nFillsScreen=perhaps\n", b"\0\xff" * 50,
+                     b"[Window]\nSize=@Size(999999999 2)\n[Panes]\nOpen=@Invalid()\n"):
+            self.write("window.ini", text)
+            viewer = self.start_remembering()
+            self.assertEqual(viewer.state()["title"], "Kelvasi")
+            self.assertEqual((viewer.close(), viewer.said()), (0, ""))
+
+    def test_the_windows_keys_close_it_and_fill_the_screen(self):
+        for keys in ("Ctrl+W", "Ctrl+Q"):
+            viewer = self.start_remembering()
+            viewer.do("press F11", f"press {keys}")
+            self.assertEqual(viewer.process.wait(PATIENCE), 0)
+            self.assertIn(b"FillsScreen=true", self.read("window.ini"))
+            os.remove(self.path("window.ini"))
 
 
 class Preferences(ViewerTest):

@@ -90,6 +90,29 @@ class Saving(ViewerTest):
         self.assertEqual(dlf["Description"], f"DLF binary ({len(dlf['DLF'])} bytes)")
         self.assert_dlf(dlf["DLF"], MM_IDLE[1:] + GMM_REGISTERED + MM_IDLE[1:], before, time.time())
 
+    def test_a_save_says_where_the_file_is_until_its_path_is_copied(self):
+        viewer = self.replay(MM_IDLE)
+        self.save(viewer)
+        [path] = self.snapshots()
+        state = viewer.state()
+        self.assertEqual(state["notice"], {"message": "Snapshot saved", "path": path})
+        self.assertIn("Copy path", state["buttons"])
+        viewer.do("click Copy path")
+        self.assertIsNone(viewer.state()["notice"])
+
+    def test_a_failed_save_keeps_the_description_for_the_next(self):
+        self.environment["KELVASI_LOG_DIRECTORY"] = self.path("later")
+        viewer = self.replay(MM_IDLE)
+        self.save(viewer, "call dropped")
+        self.assertIsNone(viewer.state()["notice"])
+        viewer.do("click Close", "press Ctrl+S")
+        self.assertEqual(viewer.state()["saveView"]["description"], "call dropped")
+        os.mkdir(self.path("later"))
+        viewer.do("click Save")
+        viewer.await_state(lambda state: state["saveView"] is None and state["notice"])
+        viewer.do("press Ctrl+S")
+        self.assertEqual(viewer.state()["saveView"]["description"], "")
+
     def test_no_more_than_the_last_five_updates_are_saved(self):
         viewer = self.start_world("--scenario", "drive")
         viewer.do(*["await-update"] * 5, "click Save")  # the sixth interval

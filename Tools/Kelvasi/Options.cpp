@@ -17,6 +17,14 @@ std::string environment(const char* name) {
   return value ? value : "";
 }
 
+std::optional<std::filesystem::path> stateDirectory() {
+  const std::string state = environment("XDG_STATE_HOME");
+  const std::string home = environment("HOME");
+  if (!state.empty()) return std::filesystem::path(state) / "kelvasi";
+  if (!home.empty()) return std::filesystem::path(home) / ".local/state/kelvasi";
+  return std::nullopt;
+}
+
 }  // namespace
 
 void declareOptions(CLI::App& app, ViewerOptions& options) {
@@ -27,11 +35,20 @@ void declareOptions(CLI::App& app, ViewerOptions& options) {
   app.add_option_function<std::string>(
          "--appearance",
          [&options](const std::string& name) {
-           options.colourScheme = name == "dark" ? ColourScheme::dark : ColourScheme::light;
+           options.followsDesktop = name == "desktop";
+           if (name == "dark") options.colourScheme = ColourScheme::dark;
+           if (name == "light") options.colourScheme = ColourScheme::light;
          },
-         "the desktop's otherwise")
+         "remembered for the next start; the desktop's unless stated")
       ->type_name("SCHEME")
-      ->transform(CLI::IsMember({"dark", "light"}, CLI::ignore_case));
+      ->transform(CLI::IsMember({"dark", "light", "desktop"}, CLI::ignore_case));
+  app.add_option("--text-scale", options.textScale,
+                 "how large texts are, 1 for as usual; the desktop's text size unless stated")
+      ->type_name("FACTOR")
+      ->check(CLI::Range(0.5, 3.0));
+  app.add_option("--memory", options.memory,
+                 "remember window, panes and appearance in this file; a script remembers nothing without it")
+      ->type_name("FILE");
   app.add_option(
          "--script", options.script,
          "lead the window through the commands of a file (Docs/viewer-script.md); - is the standard input")
@@ -43,18 +60,22 @@ bool hasDisplay() {
   return isSet("QT_QPA_PLATFORM") || isSet("WAYLAND_DISPLAY") || isSet("DISPLAY");
 }
 
+std::string memoryFile(const std::string& stated) {
+  const auto directory = stateDirectory();
+  if (!stated.empty() || !directory) return stated;
+  makeFolders(*directory);  // without it nothing is remembered
+  return *directory / "window.ini";
+}
+
 std::string makeLogDirectory() {
   const std::string configured = environment("KELVASI_LOG_DIRECTORY");
   if (!configured.empty()) return configured;
-  const std::string state = environment("XDG_STATE_HOME");
-  const std::string home = environment("HOME");
-  if (state.empty() && home.empty())
+  const auto directory = stateDirectory();
+  if (!directory)
     throw std::runtime_error(
         "nowhere to save snapshots: none of KELVASI_LOG_DIRECTORY, XDG_STATE_HOME and HOME is set");
-  const std::filesystem::path directory = state.empty() ? std::filesystem::path(home) / ".local/state/kelvasi"
-                                                        : std::filesystem::path(state) / "kelvasi";
-  makeFolders(directory);  // a failure is told when a snapshot is saved
-  return directory;
+  makeFolders(*directory);  // a failure is told when a snapshot is saved
+  return *directory;
 }
 
 }  // namespace kelvasi

@@ -17,6 +17,9 @@ struct ViewerOptions {
   bool fullScreen = false;
   bool logsToStderr = false;
   std::optional<ColourScheme> colourScheme;
+  bool followsDesktop = false;  // its colours, whatever was remembered
+  std::optional<double> textScale;
+  std::string memory;  // the name of a file for what is remembered; empty for the usual one
   std::string script;  // the name of a file; "-" for the standard input, empty for none
 };
 
@@ -24,6 +27,10 @@ void declareOptions(CLI::App& app, ViewerOptions& options);
 
 // Whether a display is named, or Qt is told to do without one (QT_QPA_PLATFORM).
 bool hasDisplay();
+
+// Where what is remembered of the window is kept: `stated`, else window.ini where snapshots go by default.
+// Empty for nowhere.
+std::string memoryFile(const std::string& stated);
 
 // Where snapshots go: $KELVASI_LOG_DIRECTORY; else kelvasi in $XDG_STATE_HOME or ~/.local/state, which is
 // made. Throws std::runtime_error when none of the variables says where.

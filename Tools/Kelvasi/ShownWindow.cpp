@@ -13,6 +13,7 @@
 #include "Platform/QtWidgets/AlertLayer.h"
 #include "Platform/QtWidgets/BarButton.h"
 #include "Platform/QtWidgets/CellWidget.h"
+#include "Platform/QtWidgets/FileNotice.h"
 #include "Platform/QtWidgets/ModalLayer.h"
 #include "Platform/QtWidgets/NavigationBar.h"
 #include "Platform/QtWidgets/SlideOverlay.h"
@@ -72,6 +73,12 @@ QJsonValue alertState() {
                      {"button", findShown<BarButton>(*alert)->text()}};
 }
 
+QJsonValue noticeState() {
+  const auto* const notice = findInWindow<FileNotice>();
+  if (!notice) return QJsonValue::Null;
+  return QJsonObject{{"message", notice->accessibleName()}, {"path", notice->accessibleDescription()}};
+}
+
 // Those of the alert or, without one, of the save view or, without that, of the panes.
 std::vector<QAbstractButton*> usableButtons() {
   const QWidget* in = findInWindow<AlertLayer>();
@@ -107,6 +114,7 @@ QWidget& keyboardFocus() {
 
 void sendKey(int key, Qt::KeyboardModifiers modifiers, const QString& text) {
   for (const auto kind : {QEvent::KeyPress, QEvent::KeyRelease}) {
+    if (!window()) return;  // the press closed it
     QKeyEvent event(kind, key, modifiers, text);
     QCoreApplication::sendEvent(&keyboardFocus(), &event);
   }
@@ -138,7 +146,8 @@ QJsonObject shownState() {
           {"rows", rowsOf(*findShown<TableWidget>(*findInWindow<StackWidget>()))},
           {"buttons", buttonTexts()},
           {"saveView", saveViewState()},
-          {"alert", alertState()}};
+          {"alert", alertState()},
+          {"notice", noticeState()}};
 }
 
 bool isAtRoot() {

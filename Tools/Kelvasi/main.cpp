@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasi: wires the viewer to its surroundings.
+#include <QCoreApplication>
 #include <cstdio>
 #include <cstdlib>
 #include <stdexcept>
@@ -24,6 +25,7 @@
 #include "Tools/Kelvasi/Options.h"
 #include "Tools/Kelvasi/Script.h"
 #include "Tools/Kelvasi/TemplateNotice.h"
+#include "Tools/Kelvasi/ViewerMemory.h"
 
 namespace kelvasi {
 
@@ -40,7 +42,14 @@ bool run(QtApplicationFramework& framework, const ViewerOptions& options) {
   QtMainQueue queue;
   QtMessagePorts ports(*log);
   QtTelephonyDaemon daemon(*log);
-  QtUserInterface ui({.fullScreen = options.fullScreen, .colourScheme = options.colourScheme});
+  const std::string memoryPath =
+      options.script.empty() || !options.memory.empty() ? memoryFile(options.memory) : std::string();
+  ViewerMemory memory = readMemory(memoryPath);
+  if (options.colourScheme || options.followsDesktop) memory.colourScheme = options.colourScheme;
+  QtUserInterface ui({.fullScreen = options.fullScreen || memory.fillsScreen,
+                      .windowSize = memory.windowSize,
+                      .textScale = options.textScale,
+                      .colourScheme = memory.colourScheme});
   QtPreferences preferences;
   const QtDateFormatters dateFormatters;
   PosixFiles files;
@@ -49,7 +58,21 @@ bool run(QtApplicationFramework& framework, const ViewerOptions& options) {
                              .shell = {ui, preferences, dateFormatters, files},
                              .paths = {.logDirectory = makeLogDirectory(),
                                        .internalInstallMarker = KELVASI_INTERNAL_INSTALL_MARKER}};
-  const ApplicationClasses classes{{"KelvasiApp", [&] { return std::make_unique<KelvasiApp>(platform); }}};
+  KelvasiApp* application = nullptr;
+  const ApplicationClasses classes{{"KelvasiApp", [&] {
+                                      auto made = std::make_unique<KelvasiApp>(platform);
+                                      made->reopenBranches(memory.branches);
+                                      application = made.get();
+                                      return made;
+                                    }}};
+  QObject::connect(qApp, &QCoreApplication::aboutToQuit, [&] {
+    memory.branches = application->openBranches();
+    if (const TopWidget* const window = ui.window()) {
+      memory.windowSize = window->windowedSize();
+      memory.fillsScreen = window->isFullScreen() && !options.fullScreen;
+    }
+    writeMemory(memoryPath, memory);
+  });
   const Script script(options.script);
   queue.post([&] { noticeMissingTemplates(resources, ui); });  // when the window is there
   framework.run(classes, "KelvasiApp", "KelvasiApp");

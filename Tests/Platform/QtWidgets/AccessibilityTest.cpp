@@ -5,6 +5,7 @@
 
 #include "Platform/QtWidgets/AlertLayer.h"
 #include "Platform/QtWidgets/BarButton.h"
+#include "Platform/QtWidgets/ModalLayer.h"
 #include "Platform/QtWidgets/NavigationBar.h"
 #include "Platform/QtWidgets/Spinner.h"
 #include "Platform/QtWidgets/Toolbar.h"
@@ -71,7 +72,7 @@ TEST_F(AccessibilityTest, BarsNameTheirTitleAndButtons) {
   RowsController& root = showRows(1);
   root.setToolbarItems({ActivitySpinner{.isAnimating = true}, SaveButton{[] {}}}, true);
   push(1, "Next");
-  EXPECT_EQ(of(the<NavigationBar>()).role(), QAccessible::TitleBar);
+  EXPECT_EQ(of(the<NavigationBar>()).role(), QAccessible::ToolBar);
   EXPECT_EQ(nameOf(the<NavigationBar>()), "Next");
   EXPECT_EQ(of(the<BarButton>()).role(), QAccessible::Button);
   EXPECT_EQ(nameOf(the<BarButton>()), "Back to Root");
@@ -79,6 +80,29 @@ TEST_F(AccessibilityTest, BarsNameTheirTitleAndButtons) {
   EXPECT_EQ(nameOf(the<Toolbar>()->saveButton()), "Save");
   EXPECT_EQ(of(the<Spinner>()).role(), QAccessible::Animation);
   EXPECT_EQ(nameOf(the<Spinner>()), "Busy");
+}
+
+TEST_F(AccessibilityTest, TheSelectedRowSaysSo) {
+  const RowsController& pane = showRows(2);
+  tableOf(pane).open(1);
+  EXPECT_FALSE(of(tableOf(pane).cellAt(0)).state().selected);
+  EXPECT_TRUE(of(tableOf(pane).cellAt(1)).state().selected);
+}
+
+TEST_F(AccessibilityTest, TheSaveViewIsAModalDialogWithAName) {
+  showRows(1);
+  ViewController form(ui->loadInterface("KelvasiSaveViewController"));
+  stack->presentModalViewController(form, false);
+  QAccessibleInterface& dialog = of(the<ModalLayer>());
+  EXPECT_EQ(dialog.role(), QAccessible::Dialog);
+  EXPECT_TRUE(dialog.state().modal);
+  EXPECT_EQ(nameOf(the<ModalLayer>()), "Save Snapshot");
+  stack->dismissModalViewController(false);
+}
+
+TEST_F(AccessibilityTest, AnEmptyPaneSaysSoToAReaderToo) {
+  const RowsController& pane = showRows(0);
+  EXPECT_EQ(of(&tableOf(pane)).text(QAccessible::Description), "Nothing received yet");
 }
 
 TEST_F(AccessibilityTest, AnAlertIsOne) {

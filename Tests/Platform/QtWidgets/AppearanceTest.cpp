@@ -8,6 +8,8 @@
 namespace kelvasi {
 namespace {
 
+using test::RowsController;
+
 // Of relative luminances, as WCAG 2.1 defines it: 1 to 21.
 double contrast(const QColor& one, const QColor& other) {
   const auto luminance = [](const QColor& colour) {
@@ -30,6 +32,14 @@ TEST(Palettes, TextsCanBeReadOnEveryGround) {
       EXPECT_GE(contrast(palette.color(QPalette::PlaceholderText), palette.color(ground)), 4.5) << ground;
       EXPECT_GE(contrast(palette.color(QPalette::Highlight), palette.color(ground)), 4.5) << ground;
     }
+  }
+}
+
+TEST(Palettes, AChevronCanBeSeenOnARowThatIsPressedOrNot) {
+  for (const ColourScheme scheme : {ColourScheme::light, ColourScheme::dark}) {
+    const QPalette palette = paletteOf(scheme);
+    for (const auto ground : {QPalette::Base, QPalette::AlternateBase})
+      EXPECT_GE(contrast(palette.color(QPalette::Dark), palette.color(ground)), 3) << ground;
   }
 }
 
@@ -59,6 +69,42 @@ TEST_F(AppearanceTest, AnAlertsTextsCanBeReadOnItsGround) {
     window.reset();
     stack.reset();
   }
+}
+
+TEST_F(AppearanceTest, AnAlertFitsTheSmallestWindow) {
+  showRows(1);
+  windowWidget().resize(240, 320);
+  ui->showAlert("No display templates",
+                "They were looked for in /usr/local/share/kelvasi/resources/templates.", "Close");
+  settle();
+  const auto* const card = the<Card>();
+  EXPECT_TRUE(windowWidget().rect().contains(card->geometry()));
+  for (const QLabel* const text : card->findChildren<QLabel*>()) {
+    EXPECT_TRUE(card->rect().contains(text->geometry())) << text->text().toStdString();
+    EXPECT_GE(text->height(), text->heightForWidth(text->width()));
+  }
+}
+
+TEST_F(AppearanceTest, AnEmptyPaneSaysThatNothingCame) {
+  RowsController& pane = showRows(0);
+  EXPECT_EQ(tableOf(pane).emptyText(), "Nothing received yet");
+  const QImage empty = windowWidget().grab().toImage();
+  pane.rows = 1;
+  pane.tableView().reloadData();
+  settle();
+  EXPECT_EQ(tableOf(pane).emptyText(), "");
+  const QRect middle(60, 200, 270, 500);
+  EXPECT_FALSE(test::differenceOf(empty.copy(middle), windowWidget().grab().toImage().copy(middle)).isNull());
+}
+
+TEST_F(AppearanceTest, InAWideWindowAValueStaysNearItsName) {
+  const RowsController& pane = showRows(1);
+  windowWidget().resize(800, 700);
+  settle();
+  EXPECT_EQ(tableOf(pane).cellAt(0)->contentView().bounds().width, 600 - 10);
+  const QImage with = tableOf(pane).cellAt(0)->grab().toImage();
+  EXPECT_EQ(with.pixelColor(40, 49), paletteOf(ColourScheme::light).color(QPalette::Base));
+  EXPECT_EQ(with.pixelColor(400, 49), paletteOf(ColourScheme::light).color(QPalette::Mid));
 }
 
 TEST_F(AppearanceTest, AStatedSchemeIsPainted) {

@@ -80,6 +80,24 @@ TEST_F(CellWidgetTest, NothingIsDrawnOutsideAScrollableView) {
   EXPECT_LT(differenceOf(pictureOf({}), pictureOf(text)).right(), 380);
 }
 
+TEST_F(CellWidgetTest, WhatIsHiddenBeyondAnEdgeHasASignThere) {
+  const RowsController& pane =
+      showRows(1, [](std::size_t) { return RowContents{.text = std::string(40, 'H'), .wideContent = 800}; });
+  CellWidget& cell = *tableOf(pane).cellAt(0);
+  const QColor ground = paletteOf(ColourScheme::light).color(QPalette::Base);
+  const auto isMarked = [&](int middle) {
+    const QImage picture = cell.grab().toImage();
+    const auto isDark = [&](int x) { return picture.pixelColor(x, 25).lightness() < 100; };
+    return isDark(middle) && isDark(middle - 5) && isDark(middle + 5) &&
+           picture.pixelColor(middle, 12) == ground && picture.pixelColor(middle + 5, 31) == ground;
+  };
+  // The label is 200 points wide and ends at 210, in sight.
+  EXPECT_FALSE(isMarked(380 - 8));
+  EXPECT_FALSE(isMarked(8));
+  cell.scrollView()->scrollTo(60);
+  EXPECT_TRUE(isMarked(8));
+}
+
 TEST_F(CellWidgetTest, ASelectedRowIsMarked) {
   const RowsController& pane = showRows(1);
   const QColor before = tableOf(pane).cellAt(0)->grab().toImage().pixelColor(300, 5);
@@ -95,7 +113,8 @@ TEST_F(CellWidgetTest, TextsOfARowComeInTheOrderInWhichTheyWereAdded) {
   QtLabel second;
   second.setText("second");
   cell.contentView().addSubview(second);
-  EXPECT_EQ(cell.spokenText(), "Snapshot, second");
+  EXPECT_EQ(cell.spokenName(), "Snapshot");
+  EXPECT_EQ(cell.spokenValue(), "second");
 }
 
 TEST_F(CellWidgetTest, AViewThatGoesLeavesItsContainer) {
@@ -105,7 +124,7 @@ TEST_F(CellWidgetTest, AViewThatGoesLeavesItsContainer) {
     gone.setText("gone");
     cell.contentView().addSubview(gone);
   }
-  EXPECT_EQ(cell.spokenText(), "");
+  EXPECT_EQ(cell.texts(), QStringList());
 }
 
 TEST_F(CellWidgetTest, AScrollableViewOffersItsVisiblePartAsBounds) {

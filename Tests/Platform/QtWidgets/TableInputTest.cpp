@@ -4,6 +4,9 @@
 #include <QScroller>
 #include <QWheelEvent>
 
+#include <QAbstractButton>
+
+#include "Platform/QtWidgets/Toolbar.h"
 #include "Tests/Platform/QtWidgets/QtFixture.h"
 
 namespace kelvasi {
@@ -92,6 +95,19 @@ TEST_F(TableInputTest, EnterAndSpaceOpenTheMarkedRow) {
   key(Qt::Key_Down);
   key(Qt::Key_Space);
   EXPECT_THAT(pane.opened, ElementsAre(0, 1, 2));
+}
+
+TEST_F(TableInputTest, TheFirstTabGoesToTheRowsAndTheNextOnLeavesThem) {
+  RowsController& pane = showRows(3);
+  stack->setToolbarHidden(false, false);
+  pane.setToolbarItems({SaveButton{[] {}}}, true);
+  settle();
+  key(Qt::Key_Tab);
+  EXPECT_EQ(QApplication::focusWidget(), &tableOf(pane));
+  ASSERT_NE(tableOf(pane).cellAtKeyboard(), nullptr);
+  EXPECT_TRUE(tableOf(pane).cellAt(0)->hasFocusMark());
+  key(Qt::Key_Tab);
+  EXPECT_EQ(QApplication::focusWidget(), the<Toolbar>()->saveButton());
 }
 
 TEST_F(TableInputTest, EnterWithoutAMarkedRowOpensNone) {

@@ -62,7 +62,7 @@ TEST_F(TableRowsTest, ScrollingUsesTheSameWidgetsAgain) {
   EXPECT_LE(pane.cellsMade, fittingRows(tableOf(pane)) + 1);
   bar.setValue(bar.maximum());
   const CellWidget* const last = tableOf(pane).cellsInSight().back();
-  EXPECT_EQ(last->spokenText(), "Row 9999");
+  EXPECT_EQ(last->spokenName(), "Row 9999");
   EXPECT_EQ(last->geometry().bottom(), tableOf(pane).viewport()->rect().bottom());
 }
 
@@ -140,10 +140,10 @@ TEST_F(TableRowsTest, AReloadOfATableThatIsNotSeenWaitsUntilItIs) {
   push(5, "Next");
   root.contentsOf = [](std::size_t) { return RowContents{.text = "later"}; };
   root.tableView().reloadData();
-  EXPECT_EQ(tableOf(root).cellsInSight().front()->spokenText(), "Row 0");
+  EXPECT_EQ(tableOf(root).cellsInSight().front()->spokenName(), "Row 0");
   stack->popViewController(false);
   settle();
-  EXPECT_EQ(tableOf(root).cellsInSight().front()->spokenText(), "later");
+  EXPECT_EQ(tableOf(root).cellsInSight().front()->spokenName(), "later");
 }
 
 TEST_F(TableRowsTest, ATableThatIsNotSeenAsksForNoRowThatAReloadTookAway) {

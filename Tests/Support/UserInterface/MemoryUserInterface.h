@@ -57,6 +57,9 @@ class MemoryUserInterface : public UserInterface {
   void showAlert(std::string_view title, std::string_view message, std::string_view button) override {
     alerts.push_back({std::string(title), std::string(message), std::string(button)});
   }
+  void showFileNotice(std::string_view message, std::string_view path) override {
+    notices.push_back({std::string(message), std::string(path)});
+  }
 
   // The toolkit's half of the pane at a place of the stack, and of the top one.
   MemoryTableBody& pane(std::size_t place) const {
@@ -68,6 +71,7 @@ class MemoryUserInterface : public UserInterface {
   std::map<std::pair<std::string, bool>, Size> sizes;  // of a text, bold or not
   std::string resource = "KelvasiSaveViewController";
   std::vector<Alert> alerts;
+  std::vector<std::pair<std::string, std::string>> notices;  // message and path
   Journal journal;
 
   // The newest of each.

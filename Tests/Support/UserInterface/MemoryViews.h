@@ -92,6 +92,7 @@ class MemoryTextField : public MemoryView<TextField> {
  public:
   void setDelegate(TextFieldDelegate* itsDelegate) override { delegate = itsDelegate; }
   std::optional<std::string> text() const override { return typed; }
+  void setText(std::string_view text) override { typed = text; }
   void resignFirstResponder() override { hasKeyboard = false; }
 
   bool pressReturn() { return delegate->textFieldShouldReturn(*this); }

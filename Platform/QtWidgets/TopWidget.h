@@ -1,0 +1,29 @@
+// SPDX-License-Identifier: Apache-2.0
+// What the desktop frames as the viewer's window, with the keys that every window has: F11 fills the screen
+// or gives it back, Ctrl+W closes, Ctrl+Q ends the program.
+#pragma once
+
+#include <QWidget>
+
+namespace kelvasi {
+
+class TopWidget : public QWidget {
+ public:
+  TopWidget();
+
+  // The size outside full screen.
+  QSize windowedSize() const { return windowedSize_; }
+  void setWindowedSize(const QSize& size);
+  void showFilling();
+
+ protected:
+  void keyPressEvent(QKeyEvent* event) override;
+  void resizeEvent(QResizeEvent* event) override;
+
+ private:
+  void showWindowed();
+
+  QSize windowedSize_;
+};
+
+}  // namespace kelvasi
