@@ -3,24 +3,21 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <filesystem>
 #include <fstream>
 #include <iterator>
-#include <map>
 
-#include "LogGenerator/LTE/LTEClassIndex.h"
-#include "LogGenerator/UTRAN/UTRANClassIndex.h"
 #include "Model/KelvasiModelNode.h"
 #include "Platform/Plist/LibplistSerialiser.h"
+#include "Tests/LogGenerator/Sections/ClassIndexes.h"
 #include "Tests/Support/C2KLookupNames.h"
-#include "Tests/Support/TestPlatform.h"
 
 namespace kelvasi {
 namespace {
 
 using testing::ElementsAre;
-
-enum class Kind { rows, list };
-using Sections = std::map<std::string, Kind>;
+using testing::UnorderedElementsAreArray;
 
 PlistValue displayTemplate(const std::string& name) {
   std::ifstream file(KELVASI_RESOURCES_DIRECTORY "/" + name + ".plist", std::ios::binary);
@@ -28,25 +25,119 @@ PlistValue displayTemplate(const std::string& name) {
   return LibplistSerialiser().parse(bytes).value_or(PlistValue());
 }
 
-// The sections that the index has a decoder for, wherever they stand.
-void collect(const PlistValue& object, const ClassIndex& index, Sections& sections) {
-  ASSERT_TRUE(object.string() || object.dictionary() || object.array());
-  if (!object.dictionary()) return;
+// All that are installed. The object stream brings its display with it and has none.
+std::vector<std::string> templateNames() {
+  std::vector<std::string> names;
+  for (const auto& file : std::filesystem::directory_iterator(KELVASI_RESOURCES_DIRECTORY)) {
+    if (file.path().extension() == ".plist") names.push_back(file.path().stem().string());
+  }
+  return names;
+}
+
+// What stands in a template: a lookup name, or a section and its kind; groups are looked into.
+void collect(const PlistValue& object, std::vector<std::string>& found) {
   for (const auto& [key, value] : *object.dictionary()) {
-    if (index.getClass(key)) {
-      EXPECT_TRUE(sections.emplace(key, value.array() ? Kind::list : Kind::rows).second) << key;
+    if (key == "_sorted") continue;
+    if (value.string()) {
+      found.push_back(*value.string());
+    } else if (value.array()) {
+      found.push_back(key + (value.array()->empty() ? ": list" : ": list that is not empty"));
+    } else if (value.dictionary()->empty()) {
+      found.push_back(key + ": dictionary");
+    } else {
+      collect(value, found);
     }
-    collect(value, index, sections);
   }
 }
 
+std::vector<std::string> found(const PlistValue& object) {
+  std::vector<std::string> found;
+  collect(object, found);
+  std::ranges::sort(found);
+  return found;
+}
+
 template <typename Index>
-Sections sectionsOf(const std::string& name) {
+std::vector<std::string> sectionsOf() {
   test::TestPlatform surroundings;
   const Index index(surroundings.platform());
-  Sections sections;
-  collect(displayTemplate(name), index, sections);
+  std::vector<std::string> sections;
+  for (const auto& decoder : index.decoders()) {
+    const bool isList = decoder->sectionKind() == SectionKind::list;
+    sections.push_back(std::string(decoder->getSectionName()) + (isList ? ": list" : ": dictionary"));
+  }
   return sections;
+}
+
+// What the decoders of the technology can show.
+template <typename... Index>
+std::vector<std::string> wanted(const std::string& name, testing::Types<Index...>) {
+  std::vector<std::string> wanted;
+  if (name == "C2KTemplate") wanted.assign(test::c2kLookupNames.begin(), test::c2kLookupNames.end());
+  ((name == test::Required<Index>::displayTemplate ? void(wanted = sectionsOf<Index>()) : void()), ...);
+  std::ranges::sort(wanted);
+  return wanted;
+}
+std::vector<std::string> wanted(const std::string& name) {
+  return wanted(name, test::ClassIndexes());
+}
+
+TEST(Templates, EachHoldsWhatItsDecodersShowOnceAndNothingElse) {
+  EXPECT_THAT(templateNames(), UnorderedElementsAreArray({"C2KTemplate", "LTE", "Orvane_GSM", "UTRAN"}));
+  for (const std::string& name : templateNames())
+    EXPECT_EQ(found(displayTemplate(name)), wanted(name)) << name;
+}
+
+using Path = std::vector<std::string>;
+
+void collectPaths(const PlistDictionary& entries, const Path& above, std::vector<Path>& paths) {
+  for (const auto& [key, value] : entries) {
+    if (key == "_sorted") continue;
+    Path path = above;
+    path.push_back(key);
+    paths.push_back(path);
+    if (value.dictionary()) collectPaths(*value.dictionary(), path, paths);
+  }
+}
+
+std::vector<Path> pathsIn(const PlistValue& object) {
+  std::vector<Path> paths;
+  collectPaths(*object.dictionary(), {}, paths);
+  return paths;
+}
+
+// The template with the entry at `path` taken out, and with `changed` in its place, if anything.
+PlistValue broken(const std::string& name, const Path& path, const std::string& key,
+                  const PlistValue& changed) {
+  const PlistValue whole = displayTemplate(name);
+  PlistValue group = whole;
+  for (std::size_t step = 0; step + 1 < path.size(); ++step) group = group.dictionary()->get(path[step]);
+  group.dictionary()->remove(path.back());
+  group.dictionary()->set(key, changed);
+  return whole;
+}
+
+PlistValue entryAt(const std::string& name, const Path& path) {
+  PlistValue entry = displayTemplate(name);
+  for (const std::string& step : path) entry = entry.dictionary()->get(step);
+  return entry;
+}
+
+TEST(Templates, AnEntryThatIsMissingMisspeltOrOfAnotherKindDoesNotPass) {
+  for (const std::string& name : templateNames()) {
+    for (const Path& path : pathsIn(displayTemplate(name))) {
+      const PlistValue entry = entryAt(name, path);
+      const std::string& key = path.back();
+      const PlistValue otherKind = entry.array() ? PlistValue(PlistDictionary::make()) : PlistArray::make();
+      EXPECT_NE(found(broken(name, path, key, {})), wanted(name)) << name << " " << key;
+      EXPECT_NE(found(broken(name, path, key, otherKind)), wanted(name)) << name << " " << key;
+      EXPECT_NE(found(broken(name, path, key, "kOther")), wanted(name)) << name << " " << key;
+      const bool isNamedByKey = entry.array() || (entry.dictionary() && entry.dictionary()->empty());
+      if (isNamedByKey) {
+        EXPECT_NE(found(broken(name, path, key + "x", entry)), wanted(name)) << name << " " << key;
+      }
+    }
+  }
 }
 
 std::vector<std::string> groupsOf(const std::string& name) {
@@ -57,58 +148,12 @@ std::vector<std::string> groupsOf(const std::string& name) {
   return names;
 }
 
-TEST(LTETemplate, HasEverySectionOnceAndOfItsDecodersKind) {
-  EXPECT_EQ(sectionsOf<LTEClassIndex>("LTE"),
-            (Sections{{"Serving Cell Info", Kind::rows},
-                      {"Serving Cell Measurements", Kind::rows},
-                      {"Connected mode LTE Intra-frequency Measurement", Kind::rows},
-                      {"Measured Neighbor Cells", Kind::list},
-                      {"Detected Cells", Kind::list},
-                      {"Neighbor Measurements", Kind::rows},
-                      {"Neighbor Cells List", Kind::list},
-                      {"Reselection Candidates", Kind::rows},
-                      {"Reselection Candidates List", Kind::list},
-                      {"SIM Info", Kind::rows},
-                      {"PDP Context Info", Kind::list}}));
-}
-
-TEST(LTETemplate, IsOrderedFromTheServingCellOutwards) {
+TEST(Templates, AreOrderedFromTheServingCellOutwards) {
+  EXPECT_THAT(groupsOf("Orvane_GSM"), ElementsAre("Registration", "GSM", "UMTS", "Packet Data", "SIM"));
   EXPECT_THAT(groupsOf("LTE"), ElementsAre("Serving Cell", "Idle Mode Neighbors", "Reselection",
                                            "Connected Mode", "SIM and Data"));
-}
-
-TEST(UTRANTemplate, HasEverySectionOnceAndOfItsDecodersKind) {
-  EXPECT_EQ(sectionsOf<UTRANClassIndex>("UTRAN"), (Sections{{"RRC Info", Kind::rows},
-                                                            {"Serving Cell Info", Kind::rows},
-                                                            {"Neighbor Cell List", Kind::list},
-                                                            {"GSM Neighbor Cell List", Kind::list},
-                                                            {"TRCH BLER", Kind::list},
-                                                            {"CCTRCH SIR", Kind::list},
-                                                            {"SIM Info", Kind::rows},
-                                                            {"PDP Context Info", Kind::list}}));
-}
-
-TEST(UTRANTemplate, IsOrderedFromTheServingCellOutwards) {
   EXPECT_THAT(groupsOf("UTRAN"),
               ElementsAre("Serving Cell", "Neighbor Cells", "Channel Quality", "SIM and Data"));
-}
-
-// The lookup names of the leaves, wherever they stand.
-std::vector<std::string> lookupNames(const PlistValue& object) {
-  std::vector<std::string> names;
-  for (const auto& [key, value] : *object.dictionary()) {
-    const auto inside = value.dictionary() ? lookupNames(value) : std::vector<std::string>{*value.string()};
-    if (key != "_sorted") names.insert(names.end(), inside.begin(), inside.end());
-  }
-  return names;
-}
-
-TEST(C2KTemplate, UsesEveryLookupNameOnce) {
-  EXPECT_THAT(lookupNames(displayTemplate("C2KTemplate")),
-              testing::UnorderedElementsAreArray(test::c2kLookupNames));
-}
-
-TEST(C2KTemplate, ShowsTheVoiceSystemBeforeTheDataSystem) {
   EXPECT_THAT(groupsOf("C2KTemplate"), ElementsAre("1x", "1x System", "EV-DO", "EV-DO Data Rates"));
 }
 

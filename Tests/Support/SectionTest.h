@@ -26,11 +26,10 @@ inline std::string asText(const PlistValue& value) {
   return "(neither text nor container)";
 }
 
-// An empty section of the kind that the decoder of this name fills.
-inline PlistValue sectionFor(std::string_view name) {
-  const bool isList = name.ends_with("List") || name.ends_with("Cells") || name.ends_with("Set") ||
-                      name == "PDP Context Info" || name == "TRCH BLER" || name == "CCTRCH SIR";
-  return isList ? PlistValue(PlistArray::make()) : PlistValue(PlistDictionary::make());
+// An empty section of the decoder's kind.
+inline PlistValue sectionFor(const Base& decoder) {
+  if (decoder.sectionKind() == SectionKind::list) return PlistArray::make();
+  return PlistDictionary::make();
 }
 
 template <typename Decoder>

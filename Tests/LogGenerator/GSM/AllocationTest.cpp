@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-// Once the rows of a section exist, a record costs no allocation.
+// Once the rows of a section exist, a record costs no allocation: what the test of every section does not
+// reach by itself.
 #include <gtest/gtest.h>
 
 #include "LogGenerator/GSM/Orvane_GSMClassIndex.h"
@@ -40,7 +41,7 @@ class Sections {
 
  private:
   void bind(Base& decoder) {
-    containers_.push_back(test::sectionFor(decoder.getSectionName()));
+    containers_.push_back(test::sectionFor(decoder));
     decoder.updateSectionRef(containers_.back());
   }
 
@@ -67,29 +68,7 @@ TEST(AllocationCounter, SeesAnAllocation) {
   EXPECT_EQ(test::allocationsDuring([] {}), 0u);
 }
 
-class RecordsInTurn : public testing::TestWithParam<LogCode> {};
-
-// Records of three list entries, or two, with small and with large values: all bytes 03, then FF after them.
-TEST_P(RecordsInTurn, CostNoAllocation) {
-  Sections sections;
-  Bytes few = record(GetParam(), "", 13);
-  few.resize(250, 3);
-  Bytes fewer = record(GetParam(), "", 13);
-  fewer.resize(36, 2);
-  fewer.resize(250, 0xFF);
-  EXPECT_EQ(allocationsOfAThousand(sections, few, fewer), 0u);
-  const bool showsRows = GetParam() != 0x51FF;
-  EXPECT_EQ(!sections.shown().empty(), showsRows);
-}
-
-INSTANTIATE_TEST_SUITE_P(GSM, RecordsInTurn,
-                         testing::Values(0x4005, 0x4031, 0x4116, 0x4125, 0x4127, 0x4157, 0x417A, 0x4221,
-                                         0x5072, 0x5076, 0x512C, 0x5134, 0x5137, 0x51F4, 0x51F5, 0x51F6,
-                                         0x51F8, 0x51FB, 0x51FD, 0x51FF, 0x7130, 0x7131, 0x7132, 0x7135,
-                                         0x7150),
-                         [](const auto& each) { return "Code" + std::to_string(each.param); });
-
-TEST(Allocations, AnActiveSetOfTwoCellsCostsNone) {
+TEST(GSMAllocations, AnActiveSetOfTwoCellsCostsNone) {
   Sections sections;
   const Bytes strong = record(0x417A, "0000 02", 200);
   const Bytes weak = record(0x417A, "0080 02 00000000000000 FF1F", 200);
@@ -97,7 +76,7 @@ TEST(Allocations, AnActiveSetOfTwoCellsCostsNone) {
   EXPECT_NE(sections.shown(), "");
 }
 
-TEST(Allocations, BsicsThatComeAndGoCostNone) {
+TEST(GSMAllocations, BsicsThatComeAndGoCostNone) {
   Sections sections;
   const Bytes measured = record(0x5137, "0000 00 00000000 00000000 0000 00 00 01 0A00 10", 60);
   const Bytes coded = record(0x51FF, "00 01 0A00 3F");
@@ -112,7 +91,7 @@ TEST(Allocations, BsicsThatComeAndGoCostNone) {
             0u);
 }
 
-TEST(Allocations, ACellListCostsNoneUntilItChanges) {
+TEST(GSMAllocations, ACellListCostsNoneUntilItChanges) {
   Sections sections;
   const auto full = [](std::string_view technology, std::string_view type) {
     return cell(technology, type,
@@ -134,7 +113,7 @@ TEST(Allocations, ACellListCostsNoneUntilItChanges) {
   EXPECT_NE(sections.shown(), "");
 }
 
-TEST(Allocations, SimFilesAndContextsCostNoneUntilTheyChange) {
+TEST(GSMAllocations, SimFilesAndContextsCostNoneUntilTheyChange) {
   Sections sections;
   const Bytes sim = sections.plistRecord(
       0xFF0000, PlistDictionary::make({{"kSimFile_ICCID", "8949001234567890123456"},

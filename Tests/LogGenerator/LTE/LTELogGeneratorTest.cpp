@@ -13,47 +13,6 @@ namespace {
 
 using test::record;
 using testing::ElementsAre;
-using testing::IsEmpty;
-
-template <typename... Decoder>
-std::vector<Base*> places(Decoder&... decoder) {
-  return {&decoder...};
-}
-
-std::vector<Base*> subscribers(const ClassIndex& index, LogCode code) {
-  const auto found = index.getSubscribers(code);
-  return {found.begin(), found.end()};
-}
-
-TEST(LTEClassIndex, HandsARecordToItsSubscribersInOrderOfCreation) {
-  test::TestPlatform surroundings;
-  LTEClassIndex index(surroundings.platform());
-  EXPECT_EQ(subscribers(index, 0xB179), places(index.objConnectedModeMeasurementMisc,
-                                               index.objMeasuredNeighborCells, index.objDetectedCells));
-  EXPECT_EQ(subscribers(index, 0xB180), places(index.objNeighborMeasurementMisc, index.objNeighborCellsList));
-  EXPECT_EQ(subscribers(index, 0xB186),
-            places(index.objReselectionCandidatesMisc, index.objReselectionCandidatesList));
-  EXPECT_EQ(subscribers(index, 0xB17F), places(index.objServingCellMeasurement));
-  for (const LogCode code : {0xB0C1u, 0xB0C2u, 0xFF0001u})
-    EXPECT_EQ(subscribers(index, code), places(index.objLTEServingCellInfo));
-}
-
-TEST(LTEClassIndex, FindsEachDecoderByItsSection) {
-  test::TestPlatform surroundings;
-  LTEClassIndex index(surroundings.platform());
-  EXPECT_EQ(index.getClass("Serving Cell Info"), &index.objLTEServingCellInfo);
-  EXPECT_EQ(index.getClass("Serving Cell Measurements"), &index.objServingCellMeasurement);
-  EXPECT_EQ(index.getClass("Connected mode LTE Intra-frequency Measurement"),
-            &index.objConnectedModeMeasurementMisc);
-  EXPECT_EQ(index.getClass("Measured Neighbor Cells"), &index.objMeasuredNeighborCells);
-  EXPECT_EQ(index.getClass("Detected Cells"), &index.objDetectedCells);
-  EXPECT_EQ(index.getClass("Neighbor Measurements"), &index.objNeighborMeasurementMisc);
-  EXPECT_EQ(index.getClass("Neighbor Cells List"), &index.objNeighborCellsList);
-  EXPECT_EQ(index.getClass("Reselection Candidates"), &index.objReselectionCandidatesMisc);
-  EXPECT_EQ(index.getClass("Reselection Candidates List"), &index.objReselectionCandidatesList);
-  EXPECT_EQ(index.getClass("SIM Info"), &index.objSimInfo);
-  EXPECT_EQ(index.getClass("PDP Context Info"), &index.objPDPContextList);
-}
 
 TEST(LTEClassIndex, SaysOnTheStandardOutputThatItGoes) {
   test::TestPlatform surroundings;
@@ -80,15 +39,6 @@ TEST(LTELogGenerator, AnnouncesItselfBeforeEverythingElse) {
   }
   EXPECT_THAT(surroundings.log.warnings(), ElementsAre("LTELogGenerator is destructed <ptr>",
                                                        "Orvane_GSMLogGenerator is destructed <ptr>"));
-}
-
-TEST(LTELogGenerator, AsksForTheRecordsOfItsDecoders) {
-  test::TestPlatform surroundings;
-  const PlistValue command = LTELogGenerator(surroundings.platform()).getStartCommand();
-  EXPECT_EQ(command.dictionary()->get("SetState"), "Streaming");
-  EXPECT_EQ(command.dictionary()->get("SetOrvaneLogCodes"),
-            PlistArray::make({0xB0C2, 0xB0C1, 0xB179, 0xB17F, 0xB180, 0xB186}));
-  EXPECT_EQ(command.dictionary()->get("SetTelvonExtraCodes"), PlistArray::make({1, 0, 2}));
 }
 
 TEST(LTELogGenerator, ShowsOneRecordInEverySectionThatTakesIt) {

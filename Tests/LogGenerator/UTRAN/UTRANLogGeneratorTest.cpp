@@ -13,7 +13,6 @@ namespace {
 
 using test::record;
 using testing::ElementsAre;
-using testing::IsEmpty;
 
 PlistValue channelsTemplate() {
   return PlistDictionary::make({{"CCTRCH SIR", PlistArray::make()}, {"TRCH BLER", PlistArray::make()}});
@@ -22,33 +21,6 @@ PlistValue channelsTemplate() {
 std::unique_ptr<LogGenerator> generatorFor(test::TestPlatform& surroundings) {
   return LogGenerator::generatorFromTechnology(kTelvonLogChannelTechnology_Orvane_UTRAN2,
                                                surroundings.platform());
-}
-
-TEST(UTRANClassIndex, HandsARecordToItsSubscribersInOrderOfCreation) {
-  test::TestPlatform surroundings;
-  UTRANClassIndex index(surroundings.platform());
-  const auto channels = index.getSubscribers(0xD00C);
-  ASSERT_EQ(channels.size(), 2u);
-  EXPECT_EQ(channels[0], &index.trchMeasurements);
-  EXPECT_EQ(channels[1], &index.cctrchMeasurements);
-  EXPECT_EQ(index.getSubscribers(0xD0E0)[0], &index.rrc_state);
-  EXPECT_EQ(index.getSubscribers(0xD0E2)[0], &index.servingCellInfo);
-  EXPECT_EQ(index.getSubscribers(0xFF0001)[0], &index.servingCellInfo);
-  EXPECT_EQ(index.getSubscribers(0xD00A)[0], &index.tdMeasurements);
-  EXPECT_EQ(index.getSubscribers(0xD00E)[0], &index.gsmMeasurements);
-}
-
-TEST(UTRANClassIndex, FindsEachDecoderByItsSection) {
-  test::TestPlatform surroundings;
-  UTRANClassIndex index(surroundings.platform());
-  EXPECT_EQ(index.getClass("RRC Info"), &index.rrc_state);
-  EXPECT_EQ(index.getClass("Serving Cell Info"), &index.servingCellInfo);
-  EXPECT_EQ(index.getClass("Neighbor Cell List"), &index.tdMeasurements);
-  EXPECT_EQ(index.getClass("GSM Neighbor Cell List"), &index.gsmMeasurements);
-  EXPECT_EQ(index.getClass("TRCH BLER"), &index.trchMeasurements);
-  EXPECT_EQ(index.getClass("CCTRCH SIR"), &index.cctrchMeasurements);
-  EXPECT_EQ(index.getClass("PDP Context Info"), &index.pdpList);
-  EXPECT_EQ(index.getClass("SIM Info"), &index.simInfo);
 }
 
 TEST(UTRANClassIndex, GoesWithTheLineOfEveryIndexOnly) {
@@ -82,15 +54,6 @@ TEST(UTRANLogGenerator, SaysAfterItsBaseThatItIsThere) {
   surroundings.log.clear();
   generator.reset();
   EXPECT_THAT(surroundings.log.warnings(), ElementsAre("Orvane_GSMLogGenerator is destructed <ptr>"));
-}
-
-TEST(UTRANLogGenerator, AsksForTheRecordsOfItsDecoders) {
-  test::TestPlatform surroundings;
-  surroundings.resources.files["UTRAN.plist"] = {};
-  const PlistValue command = generatorFor(surroundings)->getStartCommand();
-  EXPECT_EQ(command.dictionary()->get("SetOrvaneLogCodes"),
-            PlistArray::make({0xD0E0, 0xD0E2, 0xD00A, 0xD00E, 0xD00C}));
-  EXPECT_EQ(command.dictionary()->get("SetTelvonExtraCodes"), PlistArray::make({1, 2, 0}));
 }
 
 TEST(UTRANLogGenerator, OneRecordUpdatesBothChannelSections) {
