@@ -1,10 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The decoders of the GSM/UMTS technology.
 //
-// To add one: declare the record in a header of its own (layout, count and entries, rows), write the decoder
-// beside the others around a StateSection or a ListSection table, list its .cpp in
-// LogGenerator/CMakeLists.txt, and add a line below. The order is the order of creation, and so the order in
-// which the subscribers of one log code receive a record; it is also the order of release.
+// To add one: write its table or class in a file of its own and add it below, as CONTRIBUTING.md shows. The
+// order is the order of creation, and so the order in which the subscribers of one log code receive a record;
+// it is also the order of release.
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The decoders of the LTE technology.
 //
-// To add one: write its class beside the others, then add a line below. The order is the order of creation,
-// and so the order in which the subscribers of one log code receive a record.
+// To add one: write its table or class in a file of its own and add it below, as CONTRIBUTING.md shows. The
+// order is the order of creation, and so the order in which the subscribers of one log code receive a record.
 #pragma once
 
 #include "LogGenerator/ClassIndex.h"
