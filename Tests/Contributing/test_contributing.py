@@ -1,0 +1,77 @@
+# SPDX-License-Identifier: Apache-2.0
+"""Adds the decoder of CONTRIBUTING.md to a copy of the tree, as it stands there, and runs what it says to run."""
+
+import os
+import pathlib
+import re
+import shutil
+import subprocess
+import sys
+import unittest
+
+ROOT = pathlib.Path(__file__).resolve().parents[2]
+COPY = pathlib.Path(os.environ["COPY"])
+CHAPTER = "## Adding a decoder in five minutes"
+# A file of the tree, the line of it at which the block goes in, if it is there already, and the block.
+EDIT = re.compile(r"^`([^`]+)`(?:, (above|below) the line of `([^`]+)`)?:\n\n```\w+\n(.*?)^```$", re.M | re.S)
+COMMANDS = re.compile(r"^```sh\n(.*?)^```$", re.M | re.S)
+
+
+def copy_tree():
+    shutil.rmtree(COPY, ignore_errors=True)
+    listed = subprocess.run(["git", "ls-files", "-co", "--exclude-standard"], cwd=ROOT, capture_output=True, text=True,
+                            check=True).stdout
+    for name in filter(lambda each: (ROOT / each).is_file(), listed.splitlines()):
+        (COPY / name).parent.mkdir(parents=True, exist_ok=True)
+        shutil.copy2(ROOT / name, COPY / name)
+
+
+def edit(name, where, line, block):
+    path = COPY / name
+    if not line:
+        if path.exists():
+            raise AssertionError(f"{name} is there already")
+        path.write_text(block)
+        return
+    lines = path.read_text().splitlines(keepends=True)
+    places = [place for place, each in enumerate(lines) if line in each]
+    if len(places) != 1:
+        raise AssertionError(f"{name}: {len(places)} lines have {line!r}")
+    lines.insert(places[0] + (where == "below"), block)
+    path.write_text("".join(lines))
+
+
+def run(command):
+    # The copy's objects are the tree's own, but for what the new decoder changes.
+    environment = {**os.environ, "CCACHE_NOHASHDIR": "1"}
+    environment.setdefault("CCACHE_BASEDIR", str(ROOT))
+    return subprocess.run(["bash", "-e", "-c", command], cwd=COPY, env=environment, capture_output=True, text=True,
+                          check=False)
+
+
+class Contributing(unittest.TestCase):
+    def test_a_decoder_takes_what_the_recipe_says_and_nothing_else(self):
+        chapter = (ROOT / "CONTRIBUTING.md").read_text().split(CHAPTER, 1)[1].split("\n## ", 1)[0]
+        copy_tree()
+        edits = EDIT.findall(chapter)
+        for each in edits:
+            edit(*each)
+        self.assertEqual(len({name for name, *_ in edits}), 4)
+        (commands,) = COMMANDS.findall(chapter)
+        result = run(commands)
+        print(result.stdout[-4000:], result.stderr[-4000:], file=sys.stderr)
+        self.assertEqual(result.returncode, 0)
+        for test in ("PagingInfo.ShowsPeriodModeAndPages", "Templates.EachHoldsWhatItsDecodersShowOnceAndNothingElse",
+                     "RecordSweep.RecordsShorterThanTheirMinimumChangeNothing<RecordSweep/Orvane_GSM",
+                     "Allocations.RecordsInTurnCostNone<Allocations/Orvane_GSM", "RecordFuzz.Seeds"):
+            self.assertRegex(result.stdout, re.escape(test) + ".*Passed")
+        self.expect_fault_without_the_line_in_the_template()
+
+    def expect_fault_without_the_line_in_the_template(self):
+        template = COPY / "Resources" / "Orvane_GSM.plist"
+        template.write_text(template.read_text().replace("<key>Paging Info</key>\n\t\t<dict/>", ""))
+        self.assertNotEqual(run("ctest --test-dir build/release -R '^Templates'").returncode, 0)
+
+
+if __name__ == "__main__":
+    unittest.main()
