@@ -34,6 +34,12 @@ class Message {
   Message& active(const CellIdentity& cell, const Quantity& quantity, std::int64_t raw) {
     return add(activeSection, cell, quantity, raw, entry_++);
   }
+  // A value that is no whole number.
+  Message& level(const CellIdentity& cell, const Quantity& quantity, double value) {
+    add(servingSection, cell, quantity, rawOf(value), Reading::notInList);
+    rows_->back().scale = Scale{.curve = fromRaw};
+    return *this;
+  }
   Message& plain(const Quantity& quantity, std::int64_t raw, std::span<const std::string_view> texts = {}) {
     return add(plainSection, {}, quantity, raw, Reading::notInList, texts);
   }
