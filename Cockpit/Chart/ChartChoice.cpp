@@ -16,6 +16,16 @@ struct Beside {
   double level = 0;
 };
 
+// A row that names a part of a cell only is of the cell that was measured last.
+const SeenCell* cellOf(const View& view, const CellIdentity& identity, const Quantity& quantity) {
+  const SeenCell* newest = nullptr;
+  for (const SeenCell& cell : view.survey.cells().all()) {
+    if (!canBeSame(cell.identity, identity) || !cell.level(quantity)) continue;
+    if (!newest || cell.level(quantity)->lastTime > newest->level(quantity)->lastTime) newest = &cell;
+  }
+  return newest;
+}
+
 // Those of the serving cell's family that are heard now, the best first.
 std::vector<Beside> besides(const View& view, const SeenCell& serving, LevelKind kind, Arrival now) {
   std::vector<Beside> cells;
@@ -39,13 +49,11 @@ std::optional<ChartLineKey> chartLineOf(const View& view, std::string_view path)
     if (view.rowSeries.whole({row->id, quantity}).count == 0) return std::nullopt;
     return ChartLineKey{.row = row->id};
   }
+  const SeenCell* cell = cellOf(view, row->cell, *quantity);
+  if (!cell) return std::nullopt;
   const auto kind = levelKindOf(row->cell.family, *quantity);
-  for (const SeenCell& cell : view.survey.cells().all()) {
-    if (!canBeSame(cell.identity, row->cell) || !cell.level(*quantity)) continue;
-    return kind ? ChartLineKey{.cell = cell.number, .level = kind}
-                : ChartLineKey{.cell = cell.number, .quantity = quantity};
-  }
-  return std::nullopt;
+  return kind ? ChartLineKey{.cell = cell->number, .level = kind}
+              : ChartLineKey{.cell = cell->number, .quantity = quantity};
 }
 
 std::vector<ChartLineKey> chartLinesOf(const View& view, Arrival now, std::optional<LevelKind> kind,

@@ -76,22 +76,25 @@ void Pins::restore(const std::vector<std::string>& keys) {
   }
 }
 
-// The row where it stood last, else wherever the cell stands now.
+// The row where it stood last, else wherever the cell stands now; a row that names a part of the cell only is
+// the cell's when no other can be.
 const std::string* Pins::placeOf(const RowBook& book, const Pin& pin) const {
-  const auto isIt = [&](const std::string& path, const BookedRow& row) {
-    return row.isPresent &&
-           (pin.cell.empty() ? path == pin.key : textOf(row.cell) == pin.cell && shapeOf(path) == pin.shape);
-  };
   const auto last = book.all().find(pin.lastPath);
-  if (last != book.all().end() && isIt(last->first, last->second)) return &last->first;
-  if (pin.cell.empty()) return nullptr;
+  const bool stands = last != book.all().end() && last->second.isPresent;
+  if (pin.cell.empty()) return stands ? &last->first : nullptr;
+  const auto cell = cellFromText(pin.cell).value_or(CellIdentity());
+  if (stands && last->second.cell == cell && shapeOf(last->first) == pin.shape) return &last->first;
   // All paths of a shape begin alike.
   const std::string begin = pin.shape.substr(0, pin.shape.find('*'));
+  std::vector<const std::string*> places;
   for (auto row = book.all().lower_bound(begin); row != book.all().end() && row->first.starts_with(begin);
        ++row) {
-    if (isIt(row->first, row->second)) return &row->first;
+    if (!row->second.isPresent || !canBeSame(row->second.cell, cell) || shapeOf(row->first) != pin.shape)
+      continue;
+    if (row->second.cell == cell) return &row->first;
+    places.push_back(&row->first);
   }
-  return nullptr;
+  return places.size() == 1 ? places.front() : nullptr;
 }
 
 std::vector<PinLine> Pins::at(const RowBook& book, Arrival now) {

@@ -18,12 +18,13 @@ Reading readingOf(const BookedRow& row) {
 }
 
 bool isSame(const BookedRow& row, const Reading& reading) {
-  if (row.row != reading.row || row.raw != reading.raw) return false;
-  return reading.value ? row.value == *reading.value : row.value.isAbsent();
+  if (reading.value) return row.value == *reading.value;
+  if (row.row == reading.row) return row.raw == reading.raw;
+  // Two kinds of record that write the same row.
+  return row.text() == textOf(reading);
 }
 
-void forget(BookedRow& row, const CellIdentity& cell, Arrival time) {
-  row.cell = cell;
+void forget(BookedRow& row, Arrival time) {
   row.since = time;
   row.changed = time;
   row.writings = 0;
@@ -67,11 +68,12 @@ BookedRow* RowBook::write(const std::string& path, const Reading& reading, Arriv
     place->second.id = static_cast<std::uint32_t>(rows_.size());
   }
   BookedRow& row = place->second;
-  if (isNew || row.cell != reading.cell) {
-    forget(row, reading.cell, time);
+  if (isNew || !canBeSame(row.cell, reading.cell)) {
+    forget(row, time);
   } else if (!isSame(row, reading)) {
     row.changed = time;
   }
+  row.cell = reading.cell;
   row.isPresent = true;
   row.isInList = reading.entry != Reading::notInList || reading.element != Reading::notInList;
   row.row = reading.row;

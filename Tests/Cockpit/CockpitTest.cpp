@@ -74,6 +74,29 @@ TEST(Cockpit, TheLastThreeEventsTheNewestFirst) {
   EXPECT_EQ(fed.cockpit.events(10, 3).size(), 1U);
 }
 
+TEST(Cockpit, SeriesOfADayAreInThirtyTwoMegabytes) {
+  EXPECT_LE(Cockpit().bytes(), 32U * 1000 * 1000);
+}
+
+TEST(Cockpit, AlarmsComeAndGo) {
+  Fed fed;
+  EXPECT_EQ(fed.cockpit.addAlarm("rsrp < -100"), "");
+  EXPECT_EQ(fed.cockpit.addAlarm("event reject"), "");
+  EXPECT_EQ(fed.cockpit.addAlarm("rsrp < -100"), "");  // it is there
+  EXPECT_EQ(fed.cockpit.alarmRules(), (std::vector<std::string>{"rsrp < -100", "event reject"}));
+  fed.take(served(0s, cell404, -110));
+  fed.cockpit.removeAlarm(1);
+  EXPECT_EQ(fed.at(0s).alarms.size(), 1U);
+  EXPECT_EQ(fed.at(0s).alarms[0].words, "RSRP -110 dBm, LTE 3350/404");
+  EXPECT_TRUE(fed.at(0s).alarms[0].isRaised);
+  fed.take(served(1s, cell404, -90));
+  EXPECT_FALSE(fed.at(1s).alarms[0].isRaised);
+  EXPECT_EQ(fed.at(1s).alarms[0].given, 1U);
+  fed.cockpit.removeAlarm(5);
+  fed.cockpit.removeAlarm(0);
+  EXPECT_EQ(fed.cockpit.alarmRules().size(), 0U);
+}
+
 TEST(Cockpit, HandsOnWhatHappens) {
   std::vector<std::string> words;
   std::vector<std::string> alarms;

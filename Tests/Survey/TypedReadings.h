@@ -31,6 +31,11 @@ class Message {
   Message& neighbour(const CellIdentity& cell, const Quantity& quantity, std::int64_t raw) {
     return add(neighbourSection, cell, quantity, raw, entry_++);
   }
+  // That a list of so many neighbours is written anew.
+  Message& removeNeighbours(std::size_t entries) {
+    readings_.addRemovals(neighbourSection, {}, entries);
+    return *this;
+  }
   Message& active(const CellIdentity& cell, const Quantity& quantity, std::int64_t raw) {
     return add(activeSection, cell, quantity, raw, entry_++);
   }

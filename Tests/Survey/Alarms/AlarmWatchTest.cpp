@@ -190,5 +190,21 @@ TEST(AlarmWatch, OtherQuantitiesDoNotCount) {
   EXPECT_EQ(watch.given, Given{});
 }
 
+TEST(AlarmWatch, WhatHasBegunGoesOnWhenOtherRulesChange) {
+  Watch watch("rsrp < -115 for 10s");
+  const auto rule = [](const char* text) { return std::get<AlarmRule>(parseAlarmRule(text)); };
+  for (int second = 0; second < 6; ++second) watch.rsrp(second * 1s, -120);
+  watch.watch.change({rule("event reject"), rule("rsrp < -115 for 10s")});
+  for (int second = 6; second < 12; ++second) watch.rsrp(second * 1s, -120);
+  EXPECT_EQ(watch.given, Given{"10"});
+  ASSERT_EQ(watch.watch.rules(), 2U);
+  EXPECT_EQ(watch.watch.rule(0).text, "event reject");
+  EXPECT_FALSE(watch.watch.isRaised(0));
+  EXPECT_TRUE(watch.watch.isRaised(1));
+  watch.watch.change({rule("event reject")});
+  for (int second = 12; second < 60; ++second) watch.rsrp(second * 1s, -120);
+  EXPECT_EQ(watch.given, Given{"10"});
+}
+
 }  // namespace
 }  // namespace kelvasi::survey
