@@ -37,7 +37,7 @@ inline constexpr StateSection neighborMeasurements{.name = "Neighbor Measurement
 
 // The cell from which reselection looks for candidates.
 inline constexpr std::array reselectionCodes{reselectionCandidates::logCode};
-inline constexpr std::array reselectionRecords{reselectionCandidates::record};
+inline constexpr std::array reselectionRecords{reselectionCandidates::servingRecord};
 inline constexpr StateSection reselection{.name = "Reselection Candidates",
                                           .trace = "Reselection Candidates",
                                           .logCodes = reselectionCodes,

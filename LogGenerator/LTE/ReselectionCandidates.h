@@ -68,6 +68,6 @@ inline constexpr std::array rows{
         .quantity = quantity::pci,
         .field = indexIn(layout, "serving cell identity")},
 };
-inline constexpr RecordRows record{logCode, minimumLength, layout, rows, serving};
+inline constexpr RecordRows servingRecord{logCode, minimumLength, layout, rows, serving};
 
 }  // namespace kelvasi::lte::reselectionCandidates
