@@ -15,6 +15,7 @@
 #include "LogGenerator/Intake.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordView.h"
+#include "LogGenerator/RowCatalog.h"
 #include "LogGenerator/RowWriter.h"
 #include "Platform/Platform.h"
 #include "Platform/SystemLog.h"
@@ -58,6 +59,8 @@ class Base {
 
   // The byte that says which version of this record it is; nothing where the record has none.
   virtual std::optional<std::size_t> versionAt(LogCode) const { return std::nullopt; }
+  // Every row that the decoder can write.
+  virtual void describe(RowCatalog&) const {}
   // What the cells of the section are to the handset.
   virtual CellRole role() const { return CellRole::none; }
 

@@ -20,6 +20,13 @@ Outcome ListDecoder::decodeOther(RecordView, LogCode logCode) {
   return Outcome::notAskedFor;
 }
 
+void ListDecoder::describe(RowCatalog& catalog) const {
+  if (!section_.staysEmpty)
+    catalog.add(section_.name, {section_.logCode, section_.list.layout, section_.rows, "entry"});
+  for (const RecordPart& part : section_.others) catalog.add(section_.name, part);
+  if (section_.cells) section_.cells->describe(section_.name, catalog);
+}
+
 CellIdentity ListDecoder::cellOf(RecordView record, std::size_t place) const {
   return kelvasi::cellOf(section_.cell, record, entry(record, place));
 }

@@ -29,6 +29,7 @@ struct ListSection {
   CellRole role = CellRole::none;
   CellFields cell = {};   // of an entry
   bool isSilent = false;  // no line in the system log for a record that neither table describes
+  std::span<const RecordPart> others = {};  // of an entry, beside `rows`
 };
 
 class ListDecoder : public Base {
@@ -41,6 +42,7 @@ class ListDecoder : public Base {
   SectionKind sectionKind() const override { return SectionKind::list; }
   std::span<const LogCode> getLogCodeArray() const override { return section_.logCodes; }
   CellRole role() const override { return section_.role; }
+  void describe(RowCatalog& catalog) const override;
 
  protected:
   // Adds what the section shows of one entry, if anything; unless overridden, the rows of the table.

@@ -57,6 +57,8 @@ bool LogGenerator::ownsDisplay(const PlistDictionary&) const {
   return true;
 }
 
+void LogGenerator::describe(RowCatalog&) const {}
+
 void LogGenerator::updateHistoryInState(PlistDictionary& state, const Clock& clock) {
   if (!state.get("History").array()) state.set("History", PlistArray::make());
   PlistArray& history = *state.get("History").array();

@@ -18,6 +18,7 @@
 #include "LogGenerator/Arrival.h"
 #include "LogGenerator/Intake.h"
 #include "LogGenerator/Readings.h"
+#include "LogGenerator/RowCatalog.h"
 #include "Platform/Platform.h"
 #include "Plist/PlistValue.h"
 
@@ -62,6 +63,9 @@ class LogGenerator {
   const Intake& intake() const { return intake_; }
   // Goes on counting where another generator of the technology has left off.
   void continueIntake(Intake intake) { intake_ = std::move(intake); }
+
+  // Every row that a display of the technology can have, in the order of its decoders.
+  virtual void describe(RowCatalog& catalog) const;
 
   // The generator for what the daemon calls the technology; null for one that is not known.
   static std::unique_ptr<LogGenerator> generatorFromTechnology(std::string_view technology,

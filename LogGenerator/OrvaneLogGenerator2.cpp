@@ -80,6 +80,11 @@ void OrvaneLogGenerator2::decode(const FramedRecord& framed) {
   count(framed.logCode, outcome.value_or(Outcome::notAskedFor), framed.record.bytes(), versionAt);
 }
 
+void OrvaneLogGenerator2::describe(RowCatalog& catalog) const {
+  if (!cIndex_) return;
+  for (const auto& decoder : cIndex_->decoders()) decoder->describe(catalog);
+}
+
 void OrvaneLogGenerator2::gatherInto(Readings* readings) {
   OrvaneLogGenerator::gatherInto(readings);
   if (cIndex_) cIndex_->gatherInto(readings);

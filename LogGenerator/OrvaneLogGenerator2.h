@@ -27,6 +27,7 @@ class OrvaneLogGenerator2 : public OrvaneLogGenerator {
 
   void updateState(PlistDictionary& state, std::span<const std::uint8_t> data) override;
   void gatherInto(Readings* readings) override;
+  void describe(RowCatalog& catalog) const override;
   PlistValue generateLogUsingState(PlistDictionary& state) override;
   PlistValue getStartCommand() const override;
   // A display is of this technology when the state's template is, by value, and the display has its shape.

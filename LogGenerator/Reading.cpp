@@ -70,8 +70,8 @@ std::optional<double> numberOf(const Reading& reading) {
 }
 
 std::optional<std::string> textOf(const Reading& reading) {
-  if (reading.row) return textOf(*reading.row, reading.raw);
   if (reading.value) return textOf(*reading.value);
+  if (reading.row) return textOf(*reading.row, reading.raw);
   return std::nullopt;
 }
 

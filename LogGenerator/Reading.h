@@ -37,7 +37,7 @@ struct ReadingSection {
 struct Reading {
   enum class Kind : std::uint8_t {
     row,      // `row` and `raw` say what was written
-    value,    // `value` was put there as it came
+    value,    // `value` was put there as it came; where its name tells what it is, `row` and `raw` say so
     removal,  // what stood there went, and all below it
   };
   enum class Key : std::uint8_t {
@@ -52,7 +52,7 @@ struct Reading {
   std::int32_t entry = notInList;           // the place in the section, where that is a list
   std::int32_t element = notInList;         // the place in the list inside the section
   const ReadingSection* section = nullptr;  // null: the display as a whole
-  const Row* row = nullptr;                 // of kind `row` only
+  const Row* row = nullptr;                 // what `raw` is
   std::int64_t raw = 0;
   std::string_view list = {};  // the row that holds a list, where the reading is in one
   std::string_view key = {};

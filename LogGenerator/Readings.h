@@ -34,6 +34,7 @@ class Readings {
 
   // For those who gather.
   void begin(Arrival arrival, LogCode logCode);
+  std::span<Reading> all() { return readings_; }
   std::size_t count() const { return readings_.size(); }
   void add(const Reading& reading) { readings_.push_back(reading); }
   void addRemovalOfEverything() { add({.kind = Reading::Kind::removal}); }

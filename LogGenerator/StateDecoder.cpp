@@ -59,6 +59,20 @@ Outcome StateDecoder::decodeOther(RecordView, LogCode logCode) {
   return Outcome::notAskedFor;
 }
 
+void StateDecoder::describe(RowCatalog& catalog) const {
+  for (const RecordRows& record : section_.records) {
+    catalog.add(section_.name, {.logCode = record.logCode, .layout = record.layout, .rows = record.rows});
+    for (const ListColumn& column : record.lists)
+      catalog.add(section_.name, {.logCode = record.logCode,
+                                  .layout = column.list.layout,
+                                  .rows = column.element ? std::span(column.element, 1) : column.rows,
+                                  .of = "entry",
+                                  .list = column.key});
+  }
+  for (const RecordPart& part : section_.others) catalog.add(section_.name, part);
+  if (section_.cells) section_.cells->describe(section_.name, catalog);
+}
+
 std::optional<std::size_t> StateDecoder::versionAt(LogCode logCode) const {
   const auto rows = std::ranges::find(section_.records, logCode, &RecordRows::logCode);
   if (rows == section_.records.end()) return std::nullopt;

@@ -31,7 +31,8 @@ struct StateSection {
   std::span<const RecordRows> records = {};
   const CellTable* cells = nullptr;  // the first such cell of the cell-information record is shown
   CellRole role = CellRole::none;
-  bool isSilent = false;  // no line in the system log for a record that no table describes
+  bool isSilent = false;                    // no line in the system log for a record that no table describes
+  std::span<const RecordPart> others = {};  // of records that these tables do not describe
 };
 
 class StateDecoder : public Base {
@@ -42,6 +43,7 @@ class StateDecoder : public Base {
   Outcome updateWithData(RecordView record, LogCode logCode) override;
   std::optional<std::size_t> versionAt(LogCode logCode) const override;
   CellRole role() const override { return section_.role; }
+  void describe(RowCatalog& catalog) const override;
   std::string_view getSectionName() const override { return section_.name; }
   SectionKind sectionKind() const override { return SectionKind::dictionary; }
   std::span<const LogCode> getLogCodeArray() const override { return section_.logCodes; }

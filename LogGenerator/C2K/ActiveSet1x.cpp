@@ -5,7 +5,6 @@
 #include <cmath>
 
 #include "LogGenerator/C2K/DeviceStatus.h"
-#include "LogGenerator/C2K/ValueTexts.h"
 
 namespace kelvasi {
 
@@ -13,13 +12,8 @@ namespace {
 
 using namespace deviceStatus;
 
-constexpr Row pilotRow{
-    .key = "k1xActiveSetInfo", .quantity = quantity::ecio, .unit = " dB", .scale = decibelScale};
-constexpr Row referenceRow{.key = "k1xActiveSetInfo",
-                           .quantity = quantity::ecio,
-                           .before = "(ref pilot) ",
-                           .unit = " dB",
-                           .scale = decibelScale};
+constexpr const Row& pilotRow = activeSet1xRows[0];
+constexpr const Row& referenceRow = activeSet1xRows[1];
 
 constexpr double leastRatio = 0.00001;  // -50 dB
 

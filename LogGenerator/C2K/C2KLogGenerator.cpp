@@ -11,6 +11,7 @@
 #include "LogGenerator/C2K/EvdoRates.h"
 #include "LogGenerator/C2K/EvdoStatus.h"
 #include "LogGenerator/C2K/Fingers.h"
+#include "LogGenerator/C2K/PilotList.h"
 #include "LogGenerator/C2K/SystemParameters.h"
 #include "LogGenerator/C2K/TrafficFER.h"
 #include "LogGenerator/RecordFraming.h"
@@ -24,14 +25,14 @@ namespace {
 
 // In the order in which the start command names the codes. A new record adds its line here.
 constexpr std::array records{
-    C2KRecord{fingers::logCode, parseFingers},
-    C2KRecord{evdoStatus::logCode, parseEvdoStatus},
-    C2KRecord{evdoForwardRate::logCode, parseEvdoForwardRate},
-    C2KRecord{evdoActiveSet::logCode, parseEvdoActiveSet},
-    C2KRecord{deviceStatus::logCode, parseDeviceStatus},
-    C2KRecord{trafficFER::logCode, parseTrafficFER},
-    C2KRecord{evdoReverseRate::logCode, parseEvdoReverseRate},
-    C2KRecord{systemParameters::logCode, parseSystemParameters,
+    C2KRecord{fingers::logCode, parseFingers, fingersParts},
+    C2KRecord{evdoStatus::logCode, parseEvdoStatus, evdoStatusParts},
+    C2KRecord{evdoForwardRate::logCode, parseEvdoForwardRate, evdoForwardRateParts},
+    C2KRecord{evdoActiveSet::logCode, parseEvdoActiveSet, evdoActiveSetParts},
+    C2KRecord{deviceStatus::logCode, parseDeviceStatus, deviceStatusParts},
+    C2KRecord{trafficFER::logCode, parseTrafficFER, trafficFERParts},
+    C2KRecord{evdoReverseRate::logCode, parseEvdoReverseRate, evdoReverseRateParts},
+    C2KRecord{systemParameters::logCode, parseSystemParameters, systemParametersParts,
               fieldIn(systemParameters::layout, "version").byte},
 };
 
@@ -91,6 +92,34 @@ void C2KLogGenerator::updateFromLog(std::span<const std::uint8_t> data, const Pl
       record->parse({framed->record, state, lookup, platform().log, sections_, readings()});
   count(framed->logCode, outcome, framed->record.bytes(), record->versionAt);
   appendRawMessage(framed->record.bytes());
+}
+
+void C2KLogGenerator::describe(RowCatalog& catalog) const {
+  PlistDictionary state;
+  C2KSections sections;
+  getDisplayFromState(state, platform());
+  sections.learn(getDisplayFromState(state, platform()));
+  const PlistValue lookup = state.get("Lookup");
+  if (!lookup.dictionary()) return;
+  for (const C2KRecord& record : records) {
+    RowCatalog byName;
+    for (const RecordPart& part : record.parts()) byName.add({}, part);
+    for (const CatalogRow& row : byName.rows()) {
+      forEachLeaf(row.row->key, *lookup.dictionary(),
+                  [&](const PlistDictionary& display, const std::string& key) {
+                    CatalogRow& added = catalog.rows().emplace_back(row);
+                    added.section = sections.find(&display)->name;
+                    added.key = key;
+                    if (added.list.empty()) return;
+                    added.list = key;
+                    catalog.add({.section = added.section,
+                                 .key = std::string(sortedRow.key),
+                                 .logCode = added.logCode,
+                                 .row = &sortedRow,
+                                 .list = key});
+                  });
+    }
+  }
 }
 
 PlistValue C2KLogGenerator::generateLogUsingState(PlistDictionary& state) {

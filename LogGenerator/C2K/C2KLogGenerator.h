@@ -19,6 +19,7 @@ class C2KLogGenerator : public OrvaneLogGenerator {
   using OrvaneLogGenerator::OrvaneLogGenerator;
 
   void updateState(PlistDictionary& state, std::span<const std::uint8_t> data) override;
+  void describe(RowCatalog& catalog) const override;
   PlistValue generateLogUsingState(PlistDictionary& state) override;
   PlistValue getStartCommand() const override;
   // A display is of this technology when all leaves of the state's lookup table are in it. Into another's

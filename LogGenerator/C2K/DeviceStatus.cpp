@@ -68,8 +68,6 @@ constexpr std::array trafficRows{
         .absent = notAvailableText,
         .scale = transmitScale},
 };
-constexpr Row activeSetRow{.key = "k1xActiveSetInfo", .quantity = quantity::ecio};
-
 void showRadio(const C2KUpdate& update, RecordView radio, bool isTraffic, const CellIdentity& serving) {
   show(update, radio, radioLayout, receiverRows, serving);
   if (isTraffic) return show(update, radio, radioLayout, trafficRows);
@@ -85,6 +83,17 @@ void showOldErrorRate(const C2KUpdate& update) {
 }
 
 }  // namespace
+
+std::span<const RecordPart> deviceStatusParts() {
+  static constexpr std::array parts{
+      RecordPart{logCode, stateLayout, stateRows, "sub-packet 1"},
+      RecordPart{logCode, radioLayout, receiverRows, "sub-packet 2"},
+      RecordPart{logCode, radioLayout, trafficRows, "sub-packet 2"},
+      RecordPart{.logCode = logCode, .rows = std::span(activeSet1xRows).first(1), .list = "pilots"},
+      RecordPart{.logCode = logCode, .rows = std::span(&trafficFER::oldRateRow, 1)},
+  };
+  return parts;
+}
 
 Outcome parseDeviceStatus(const C2KUpdate& update) {
   if (!isLongEnough(update, subPackets::minimumLength,
@@ -105,7 +114,7 @@ Outcome parseDeviceStatus(const C2KUpdate& update) {
   if (update.readings && serving) update.readings->servingCells().say(logCode, {.cell = serving});
   show(update, *state, stateLayout, stateRows);
   showRadio(update, *radio, isTraffic, serving);
-  update.write(activeSetRow, activeSet1x(*activeSet, channel, update.isGathered()));
+  update.write(activeSet1xRows.front(), activeSet1x(*activeSet, channel, update.isGathered()));
   if (!isTraffic) showOldErrorRate(update);
   return Outcome::shown;
 }

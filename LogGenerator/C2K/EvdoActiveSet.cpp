@@ -18,6 +18,12 @@ constexpr Row pilotRow{.key = "kActiveSetPilots",
 
 }  // namespace
 
+std::span<const RecordPart> evdoActiveSetParts() {
+  static constexpr std::array parts{RecordPart{evdoActiveSet::logCode, evdoActiveSet::pilotLayout,
+                                               std::span(&pilotRow, 1), "pilot", "pilots"}};
+  return parts;
+}
+
 Outcome parseEvdoActiveSet(const C2KUpdate& update) {
   using namespace evdoActiveSet;
   if (!isLongEnough(update, minimumLength,

@@ -76,6 +76,18 @@ void showRate(const C2KUpdate& update, const Link& link, std::uint32_t sequence,
 
 }  // namespace
 
+std::span<const RecordPart> evdoForwardRateParts() {
+  static constexpr std::array parts{
+      RecordPart{.logCode = evdoForwardRate::logCode, .rows = std::span(&forwardRow, 1)}};
+  return parts;
+}
+
+std::span<const RecordPart> evdoReverseRateParts() {
+  static constexpr std::array parts{
+      RecordPart{.logCode = evdoReverseRate::logCode, .rows = std::span(&reverseRow, 1)}};
+  return parts;
+}
+
 Outcome parseEvdoForwardRate(const C2KUpdate& update) {
   using namespace evdoForwardRate;
   if (!isLongEnough(update, minimumLength,

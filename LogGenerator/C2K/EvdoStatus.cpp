@@ -66,6 +66,15 @@ CellIdentity servingCell(RecordView record) {
 
 }  // namespace
 
+std::span<const RecordPart> evdoStatusParts() {
+  static constexpr std::array parts{
+      RecordPart{evdoStatus::logCode, layout, radioRows},
+      RecordPart{evdoStatus::logCode, layout, connectedRows},
+      RecordPart{evdoStatus::logCode, layout, sessionRows},
+  };
+  return parts;
+}
+
 Outcome parseEvdoStatus(const C2KUpdate& update) {
   if (update.record.size() != evdoStatus::length) {
     update.log.print(LogPriority::error, "Log code 0x1183 is %u bytes long but should be %lu bytes.",

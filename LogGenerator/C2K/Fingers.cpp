@@ -19,6 +19,12 @@ constexpr Row fingerRow{.key = "kFingerC2I",
 
 }  // namespace
 
+std::span<const RecordPart> fingersParts() {
+  static constexpr std::array parts{
+      RecordPart{fingers::logCode, fingers::fingerLayout, std::span(&fingerRow, 1), "finger", "fingers"}};
+  return parts;
+}
+
 Outcome parseFingers(const C2KUpdate& update) {
   using namespace fingers;
   if (!isLongEnough(update, minimumLength,

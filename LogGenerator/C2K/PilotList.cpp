@@ -2,17 +2,12 @@
 #include "LogGenerator/C2K/PilotList.h"
 
 #include "LogGenerator/C2K/NoPilot.h"
-#include "LogGenerator/SortPrefix.h"
 
 namespace kelvasi {
 
 namespace {
 
 constexpr Row emptyList{.key = "", .quantity = quantity::group, .special = ValueText{0, "{}"}};
-constexpr Row mark{.key = sortedMark,
-                   .quantity = quantity::none,
-                   .special = ValueText{0, sortedMark},
-                   .reason = "asks for the list to be shown sorted"};
 
 }  // namespace
 
@@ -31,7 +26,7 @@ void PilotList::add(std::size_t place, std::int64_t pilot, const Row& row, std::
 std::vector<Reading> PilotList::readings() const {
   std::vector<Reading> readings{
       {.keyKind = Reading::Key::element, .row = &emptyList},
-      {.keyKind = Reading::Key::element, .row = &mark, .key = mark.key},
+      {.keyKind = Reading::Key::element, .row = &sortedRow, .key = sortedRow.key},
   };
   auto entry = list_->begin() + 1;
   for (const Pilot& pilot : pilots_) {

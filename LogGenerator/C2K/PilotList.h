@@ -7,8 +7,15 @@
 
 #include "LogGenerator/Reading.h"
 #include "LogGenerator/Row.h"
+#include "LogGenerator/SortPrefix.h"
 
 namespace kelvasi {
+
+// What every such list begins with.
+inline constexpr Row sortedRow{.key = sortedMark,
+                               .quantity = quantity::none,
+                               .special = ValueText{0, sortedMark},
+                               .reason = "asks for the list to be shown sorted"};
 
 class PilotList {
  public:

@@ -44,6 +44,16 @@ constexpr std::array cellRows{
 
 }  // namespace
 
+std::span<const RecordPart> systemParametersParts() {
+  static constexpr std::array parts{
+      RecordPart{logCode, layout, roamingRows},
+      RecordPart{logCode, layout, identityRows},
+      RecordPart{logCode, layout, unknownRows},
+      RecordPart{logCode, layout, cellRows},
+  };
+  return parts;
+}
+
 Outcome parseSystemParameters(const C2KUpdate& update) {
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x134f is %d bytes long but must be at least %lu bytes."))

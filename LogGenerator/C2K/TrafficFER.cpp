@@ -13,6 +13,12 @@ std::optional<double> trafficFER::rateOf(const PlistDictionary& state) {
   return std::nullopt;
 }
 
+std::span<const RecordPart> trafficFERParts() {
+  static constexpr std::array parts{
+      RecordPart{.logCode = trafficFER::logCode, .rows = std::span(&trafficFER::rateRow, 1)}};
+  return parts;
+}
+
 Outcome parseTrafficFER(const C2KUpdate& update) {
   using namespace trafficFER;
   if (!isLongEnough(update, subPackets::minimumLength,

@@ -14,6 +14,16 @@ bool CellTable::takes(const PlistValue& cell) const {
          });
 }
 
+void CellTable::describe(std::string_view section, RowCatalog& catalog) const {
+  for (const CellRow& each : rows) {
+    catalog.add({.section = std::string(section),
+                 .key = std::string(each.row.key),
+                 .logCode = cellInfoLogCode,
+                 .row = &each.row,
+                 .source = std::string(each.cellKey)});
+  }
+}
+
 ServingCells::Word CellTable::identityOf(const PlistDictionary& cell) const {
   const auto number = [&](std::string_view key) {
     const auto stated = key.empty() ? std::nullopt : cellNumber(cell, key);

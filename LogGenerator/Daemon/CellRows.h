@@ -8,6 +8,7 @@
 #include <string_view>
 
 #include "LogGenerator/RecordView.h"
+#include "LogGenerator/RowCatalog.h"
 #include "LogGenerator/RowWriter.h"
 #include "Platform/Platform.h"
 #include "Plist/PlistValue.h"
@@ -40,6 +41,7 @@ struct CellTable {
   CellKeys keys = {};
 
   bool takes(const PlistValue& cell) const;
+  void describe(std::string_view section, RowCatalog& catalog) const;
   // Which cell it is, and what the network calls it.
   ServingCells::Word identityOf(const PlistDictionary& cell) const;
 };

@@ -3,6 +3,7 @@
 
 #include <array>
 
+#include "LogGenerator/Row.h"
 #include "Platform/PlistSerialiser.h"
 
 namespace kelvasi {
@@ -13,6 +14,15 @@ constexpr std::array logCodes{pdpContextLogCode};
 
 std::span<const LogCode> PDPContextList::getLogCodeArray() const {
   return logCodes;
+}
+
+void PDPContextList::describe(RowCatalog& catalog) const {
+  static constexpr Row anyValue{.key = "", .quantity = quantity::text};
+  catalog.add({.section = std::string(getSectionName()),
+               .key = "*",
+               .logCode = pdpContextLogCode,
+               .row = &anyValue,
+               .source = "*"});
 }
 
 Outcome PDPContextList::updateWithData(RecordView record, LogCode logCode) {

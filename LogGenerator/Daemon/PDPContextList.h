@@ -11,6 +11,7 @@ class PDPContextList : public Base {
   using Base::Base;
 
   Outcome updateWithData(RecordView record, LogCode logCode) override;
+  void describe(RowCatalog& catalog) const override;
   std::string_view getSectionName() const override { return "PDP Context Info"; }
   SectionKind sectionKind() const override { return SectionKind::list; }
   std::span<const LogCode> getLogCodeArray() const override;

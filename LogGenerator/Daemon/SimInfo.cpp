@@ -16,6 +16,17 @@ std::span<const LogCode> SimInfo::getLogCodeArray() const {
   return logCodes;
 }
 
+void SimInfo::describe(RowCatalog& catalog) const {
+  static constexpr Row anyValue{.key = "", .quantity = quantity::text};
+  for (const simFiles::SimFile& file : simFiles::files) {
+    catalog.add({.section = std::string(getSectionName()),
+                 .key = std::string(file.row),
+                 .logCode = simFilesLogCode,
+                 .row = &anyValue,
+                 .source = std::string(file.key)});
+  }
+}
+
 Outcome SimInfo::updateWithData(RecordView record, LogCode logCode) {
   trace("SimInfo");
   if (logCode != simFilesLogCode) return Outcome::notAskedFor;

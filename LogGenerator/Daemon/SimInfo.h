@@ -16,6 +16,7 @@ class SimInfo : public Base {
   std::string_view getSectionName() const override { return "SIM Info"; }
   SectionKind sectionKind() const override { return SectionKind::dictionary; }
   std::span<const LogCode> getLogCodeArray() const override;
+  void describe(RowCatalog& catalog) const override;
 
  private:
   void show(std::string_view row, const PlistValue& value) const;

@@ -14,9 +14,13 @@ constexpr std::array rows{
         .quantity = quantity::scramblingCode,
         .field = indexIn(identityLayout, "scrambling code")},
 };
-// Both are calculated.
-constexpr Row powerRow{.key = "RSCP", .quantity = quantity::rscp, .unit = " dB"};
-constexpr Row energyRow{.key = "Energy Per Chip", .quantity = quantity::ecno, .unit = " dB"};
+constexpr std::array calculatedRows{
+    Row{.key = "RSCP", .quantity = quantity::rscp, .unit = " dB"},
+    Row{.key = "Energy Per Chip", .quantity = quantity::ecno, .unit = " dB"},
+};
+constexpr const Row& powerRow = calculatedRows[0];
+constexpr const Row& energyRow = calculatedRows[1];
+constexpr std::array others{RecordPart{.logCode = cellSets::logCode, .rows = calculatedRows}};
 
 constexpr CellFields memberCell{.family = RadioFamily::umts,
                                 .code = fieldIn(identityLayout, "scrambling code"),
@@ -30,7 +34,8 @@ constexpr ListSection section{.name = "Active Set",
                               .list = identities,
                               .rows = rows,
                               .role = CellRole::active,
-                              .cell = memberCell};
+                              .cell = memberCell,
+                              .others = others};
 
 // dBm, from steps of a tenth of a dB.
 std::int64_t receivedPower(RecordView record) {

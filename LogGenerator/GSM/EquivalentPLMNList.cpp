@@ -9,19 +9,28 @@ namespace {
 
 constexpr std::array logCodes{equivalentPlmn::logCode};
 // Each begins with its first digit's field.
-constexpr Row countryRow{.key = "Mobile Country Code",
-                         .quantity = quantity::mcc,
-                         .field = indexIn(equivalentPlmn::entryLayout, "MCC hundreds")};
-constexpr Row networkRow{.key = "Mobile Network Code",
-                         .quantity = quantity::mnc,
-                         .field = indexIn(equivalentPlmn::entryLayout, "MNC hundreds")};
+constexpr std::array rows{
+    Row{.key = "Mobile Country Code",
+        .quantity = quantity::mcc,
+        .field = indexIn(equivalentPlmn::entryLayout, "MCC hundreds")},
+    Row{.key = "Mobile Network Code",
+        .quantity = quantity::mnc,
+        .field = indexIn(equivalentPlmn::entryLayout, "MNC hundreds")},
+};
+
+constexpr std::array parts{RecordPart{.logCode = equivalentPlmn::logCode,
+                                      .layout = equivalentPlmn::entryLayout,
+                                      .rows = rows,
+                                      .of = "entry",
+                                      .digits = 3}};
 
 constexpr ListSection section{.name = "Equivalent PLMN List",
                               .trace = "Equivalent PLMN List",
                               .logCodes = logCodes,
                               .logCode = equivalentPlmn::logCode,
                               .minimumLength = equivalentPlmn::minimumLength,
-                              .list = equivalentPlmn::plmns};
+                              .list = equivalentPlmn::plmns,
+                              .others = parts};
 
 std::int64_t decimal(RecordView entry, std::size_t firstDigit) {
   const auto digit = [&](std::size_t place) { return valueOf(entry, equivalentPlmn::entryLayout[place]); };
@@ -35,8 +44,7 @@ EquivalentPLMNList::EquivalentPLMNList(const Platform& platform) : ListDecoder(p
 void EquivalentPLMNList::addEntry(RecordView record, std::size_t place) {
   const RecordView plmn = entry(record, place);
   RowWriter row = addRows();
-  row.write(countryRow, decimal(plmn, countryRow.field));
-  row.write(networkRow, decimal(plmn, networkRow.field));
+  for (const Row& each : rows) row.write(each, decimal(plmn, each.field));
 }
 
 }  // namespace kelvasi

@@ -39,8 +39,13 @@ constexpr CellTable neighbours{
     technologies, kTelvonCellMonitorCellTypeNeighbor, cellRows, {RadioFamily::gsm, kTelvonCellMonitorARFCN}};
 
 // From the record of the codes.
-constexpr Row codeRow{
-    .key = "BSIC", .quantity = quantity::bsic, .field = indexIn(bsicList::cellLayout, "BSIC")};
+constexpr std::array codeRows{
+    Row{.key = "BSIC", .quantity = quantity::bsic, .field = indexIn(bsicList::cellLayout, "BSIC")},
+};
+constexpr std::array others{
+    RecordPart{bsicList::logCode, bsicList::cellLayout, codeRows, "entry"},
+    RecordPart{.logCode = gsmMeasurements::logCode, .rows = codeRows, .of = "the last record 0x51FF"},
+};
 
 constexpr ListSection section{.name = "Neighboring Cells",
                               .trace = "NeighboringCells",
@@ -51,7 +56,8 @@ constexpr ListSection section{.name = "Neighboring Cells",
                               .rows = rows,
                               .cells = &neighbours,
                               .role = CellRole::neighbour,
-                              .cell = {.family = RadioFamily::gsm}};
+                              .cell = {.family = RadioFamily::gsm},
+                              .others = others};
 
 }  // namespace
 
@@ -62,7 +68,7 @@ void NeighboringCells::addEntry(RecordView record, std::size_t place) {
   RowWriter row = addRows();
   show(neighbour, neighbourLayout, rows, row);
   if (const auto bsic = bsicOf(valueOf(neighbour, fieldIn(neighbourLayout, "ARFCN"))))
-    row.write(codeRow, *bsic);
+    row.write(codeRows.front(), *bsic);
 }
 
 std::optional<std::int64_t> NeighboringCells::bsicOf(std::int64_t arfcn) const {

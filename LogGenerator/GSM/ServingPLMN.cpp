@@ -44,21 +44,30 @@ constexpr std::array technologies{kTelvonCellMonitorRadioAccessTechnologyUMTS,
                                   kTelvonCellMonitorRadioAccessTechnologyGSM};
 constexpr CellTable servingCell{technologies, kTelvonCellMonitorCellTypeServing, cellRows};
 
+// A filler digit shows as a blank, so a two-digit network code ends with one. Each begins with its first
+// digit's field.
+constexpr std::array digitRows{
+    Row{.key = mccKey,
+        .quantity = quantity::mcc,
+        .field = indexIn(registeredPlmn::layout, "MCC digit 1"),
+        .digits = 3},
+    Row{.key = mncKey,
+        .quantity = quantity::mnc,
+        .field = indexIn(registeredPlmn::layout, "MNC digit 1"),
+        .digits = 3},
+};
+constexpr std::array parts{
+    RecordPart{
+        .logCode = registeredPlmn::logCode, .layout = registeredPlmn::layout, .rows = digitRows, .digits = 3},
+    RecordPart{registeredPlmn::logCode, registeredPlmn::layout, registeredPlmn::rows},
+};
+
 constexpr StateSection section{.name = "Serving PLMN",
                                .trace = "Serving PLMN",
                                .logCodes = logCodes,
                                .records = records,
-                               .cells = &servingCell};
-
-// A filler digit shows as a blank, so a two-digit network code ends with one.
-constexpr Row countryRow{.key = mccKey,
-                         .quantity = quantity::mcc,
-                         .field = indexIn(registeredPlmn::layout, "MCC digit 1"),
-                         .digits = 3};
-constexpr Row networkRow{.key = mncKey,
-                         .quantity = quantity::mnc,
-                         .field = indexIn(registeredPlmn::layout, "MNC digit 1"),
-                         .digits = 3};
+                               .cells = &servingCell,
+                               .others = parts};
 
 std::int64_t packed(RecordView record, std::span<const std::size_t, 3> fields) {
   const auto digit = [&](std::size_t place) {
@@ -76,8 +85,8 @@ Outcome ServingPLMN::decodeOther(RecordView record, LogCode logCode) {
   if (record.size() < registeredPlmn::minimumLength) return Outcome::tooShort;
   if (!sectionRows()) return Outcome::sectionMissing;
   RowWriter writer(*sectionRows(), place());
-  writer.write(countryRow, packed(record, registeredPlmn::mccDigits));
-  writer.write(networkRow, packed(record, registeredPlmn::mncDigits));
+  writer.write(digitRows[0], packed(record, registeredPlmn::mccDigits));
+  writer.write(digitRows[1], packed(record, registeredPlmn::mncDigits));
   show(record, registeredPlmn::layout, registeredPlmn::rows, writer);
   return Outcome::shown;
 }

@@ -17,9 +17,18 @@ constexpr auto uarfcnKey = "UARFCN"sv;
 
 constexpr std::array logCodes{rrcState::logCode, transmitPower::logCode, umtsServingCell::logCode,
                               ciphering::logCode, cellInfoLogCode};
-// Calculated.
-constexpr Row powerRow{
-    .key = "Transmit Power", .quantity = quantity::txPower, .unit = " dBm", .scale = Scale{.curve = fromRaw}};
+// The mean of the samples.
+constexpr std::array powerRows{
+    Row{.key = "Transmit Power",
+        .quantity = quantity::txPower,
+        .unit = " dBm",
+        .scale = Scale{.curve = fromRaw}},
+};
+constexpr std::array parts{
+    RecordPart{.logCode = transmitPower::logCode, .rows = powerRows},
+    RecordPart{umtsServingCell::logCode, umtsServingCell::layout, umtsServingCell::cellRows},
+    RecordPart{umtsServingCell::logCode, umtsServingCell::layout, umtsServingCell::areaRows},
+};
 
 constexpr std::array records{rrcState::record, ciphering::record};
 
@@ -45,7 +54,8 @@ constexpr StateSection section{.name = "UMTS RR Info",
                                .logCodes = logCodes,
                                .records = records,
                                .cells = &servingCell,
-                               .role = CellRole::serving};
+                               .role = CellRole::serving,
+                               .others = parts};
 
 // The mean of the samples in dBm. Not a number when there is none: 0/0, whose sign differs from processor to
 // processor and would show.
@@ -76,7 +86,7 @@ Outcome UMTSRRInfo::decodeOther(RecordView record, LogCode logCode) {
 Outcome UMTSRRInfo::showTransmitPower(RecordView record) const {
   if (record.size() < transmitPower::minimumLength) return Outcome::tooShort;
   if (!sectionRows()) return Outcome::sectionMissing;
-  RowWriter(*sectionRows(), place()).write(powerRow, rawOf(meanPower(record)));
+  RowWriter(*sectionRows(), place()).write(powerRows.front(), rawOf(meanPower(record)));
   return Outcome::shown;
 }
 

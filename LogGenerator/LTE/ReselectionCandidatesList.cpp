@@ -74,6 +74,14 @@ const RatType& ratOf(RecordView candidate) {
   return type < ratTypes.size() ? ratTypes[type] : otherRat;
 }
 
+constexpr std::array others{
+    RecordPart{logCode, lteLayout, lteRows, "byte 4 of an LTE entry"},
+    RecordPart{logCode, utranLayout, utranRows, "byte 4 of a UTRAN entry"},
+    RecordPart{logCode, geranLayout, geranRows, "byte 4 of a GERAN entry"},
+    RecordPart{logCode, cdmaLayout, cdmaRows, "byte 4 of a CDMA entry"},
+};
+static_assert(ratSpecific == 4);
+
 constexpr ListSection section{.name = "Reselection Candidates List",
                               .trace = "Reselection Candidates List",
                               .logCodes = logCodes,
@@ -81,7 +89,8 @@ constexpr ListSection section{.name = "Reselection Candidates List",
                               .minimumLength = minimumLength,
                               .list = candidates,
                               .rows = candidateRows,
-                              .role = CellRole::candidate};
+                              .role = CellRole::candidate,
+                              .others = others};
 
 }  // namespace
 

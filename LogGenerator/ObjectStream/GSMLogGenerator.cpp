@@ -4,6 +4,7 @@
 #include <string>
 
 #include "LogGenerator/Exceptions.h"
+#include "LogGenerator/ObjectStream/ObjectReadings.h"
 #include "Platform/PlistSerialiser.h"
 
 namespace kelvasi {
@@ -42,7 +43,14 @@ void GSMLogGenerator::updateState(PlistDictionary& state, std::span<const std::u
   state.set("Display", display);
   state.set("ExtraInfo", PlistDictionary::make());
   count(0, Outcome::shown, data);
-  if (readings()) readings()->addDisplay(display);
+  if (!readings()) return;
+  readings()->addDisplay(display);
+  nameObjectReadings(readings()->all());
+}
+
+// The names may stand anywhere.
+void GSMLogGenerator::describe(RowCatalog& catalog) const {
+  catalog.add({}, {.rows = objectRows()});
 }
 
 PlistValue GSMLogGenerator::generateLogUsingState(PlistDictionary& state) {

@@ -16,6 +16,7 @@ class GSMLogGenerator : public LogGenerator {
   // Replaces the display wholesale. Throws AssertionFailure when the message is no property list, or holds
   // anything but strings, dictionaries and arrays.
   void updateState(PlistDictionary& state, std::span<const std::uint8_t> data) override;
+  void describe(RowCatalog& catalog) const override;
   PlistValue generateLogUsingState(PlistDictionary& state) override;
   PlistValue getStartCommand() const override;
   // A display is this technology's once it was made from a message.

@@ -19,7 +19,11 @@ constexpr std::array rows{
     Row{.key = "TSNUM", .quantity = quantity::timeslot, .field = indexIn(compositeLayout, "timeslot number")},
 };
 
-constexpr Row ratioRow{.key = "SIR", .quantity = quantity::sir, .field = indexIn(compositeLayout, "SIR 0")};
+constexpr std::array ratioRows{
+    Row{.key = "SIR", .quantity = quantity::sir, .field = indexIn(compositeLayout, "SIR 0")},
+};
+constexpr std::array others{
+    RecordPart{channelMeasurement::logCode, compositeLayout, ratioRows, "entry", ratioRows.front().key}};
 
 constexpr ListSection section{.name = "CCTRCH SIR",
                               .trace = "CCTRCH SIR Measurement",
@@ -28,7 +32,8 @@ constexpr ListSection section{.name = "CCTRCH SIR",
                               .minimumLength = channelMeasurement::minimumLength,
                               .list = channelMeasurement::compositeChannels,
                               .rows = rows,
-                              .isSilent = true};
+                              .isSilent = true,
+                              .others = others};
 
 }  // namespace
 
@@ -39,9 +44,9 @@ void CCTRCHSIRMeasurement::addEntry(RecordView record, std::size_t place) {
   const auto ratios = PlistArray::make();
   RowWriter row = addRows();
   show(channel, compositeLayout, rows, row);
-  row.list(ratioRow.key, ratios);
+  row.list(ratioRows.front().key, ratios);
   for (std::size_t timeslot = 0; timeslot < channelMeasurement::timeslots; ++timeslot)
-    row.element(*ratios, ratioRow, channelMeasurement::ratioOf(channel, timeslot));
+    row.element(*ratios, ratioRows.front(), channelMeasurement::ratioOf(channel, timeslot));
 }
 
 }  // namespace kelvasi

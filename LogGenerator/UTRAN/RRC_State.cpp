@@ -33,6 +33,10 @@ std::span<const LogCode> RRC_State::getLogCodeArray() const {
   return logCodes;
 }
 
+void RRC_State::describe(RowCatalog& catalog) const {
+  catalog.add(getSectionName(), {rrcState::logCode, rrcState::layout, std::span(&stateRow, 1)});
+}
+
 std::optional<std::size_t> RRC_State::versionAt(LogCode) const {
   return fieldIn(rrcState::layout, "layout version").byte;
 }

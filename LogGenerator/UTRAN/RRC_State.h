@@ -15,6 +15,7 @@ class RRC_State : public Base {
   SectionKind sectionKind() const override { return SectionKind::dictionary; }
   std::span<const LogCode> getLogCodeArray() const override;
   std::optional<std::size_t> versionAt(LogCode) const override;
+  void describe(RowCatalog& catalog) const override;
 
  private:
   void traceDisplay(std::int64_t mode, const std::string& text) const;

@@ -33,6 +33,11 @@ constexpr std::array lastRows{
         .texts = truth},
 };
 
+constexpr std::array others{
+    RecordPart{utran::neighborCells::logCode, cellLayout, membershipRows, "entry"},
+    RecordPart{utran::neighborCells::logCode, cellLayout, lastRows, "entry"},
+};
+
 constexpr ListSection section{.name = "Neighbor Cell List",
                               .trace = "NeighbhorMeasurements List",
                               .logCodes = logCodes,
@@ -42,7 +47,8 @@ constexpr ListSection section{.name = "Neighbor Cell List",
                               .rows = rows,
                               .role = CellRole::neighbour,
                               .cell = utran::neighborCells::cell,
-                              .isSilent = true};
+                              .isSilent = true,
+                              .others = others};
 
 }  // namespace
 

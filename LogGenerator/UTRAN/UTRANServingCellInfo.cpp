@@ -72,6 +72,11 @@ constexpr CellTable cells{.technologies = technologies,
 
 UTRANServingCellInfo::UTRANServingCellInfo(const Platform& platform) : StateDecoder(platform, section) {}
 
+void UTRANServingCellInfo::describe(RowCatalog& catalog) const {
+  StateDecoder::describe(catalog);
+  cells.describe(getSectionName(), catalog);
+}
+
 // Every serving cell of the list is shown, so the last one wins. A code that it did not ask for is not worth
 // a line.
 Outcome UTRANServingCellInfo::decodeOther(RecordView record, LogCode logCode) {

@@ -10,6 +10,8 @@ class UTRANServingCellInfo : public StateDecoder {
  public:
   explicit UTRANServingCellInfo(const Platform& platform);
 
+  void describe(RowCatalog& catalog) const override;
+
  protected:
   Outcome decodeOther(RecordView record, LogCode logCode) override;
 };

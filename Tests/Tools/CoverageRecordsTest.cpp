@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include "Tools/Kelvasictl/LogCodeText.h"
 #include "Tools/Kelvasictl/MessageTally.h"
 
 namespace kelvasi {
@@ -125,10 +126,10 @@ TEST(MessageTally, AddsUp) {
   EXPECT_EQ(tally.text(), "50 % of 4 messages were not shown");
 }
 
-TEST(CodeText, HasFourDigitsAtLeast) {
-  EXPECT_EQ(codeText(0x7), "0x0007");
-  EXPECT_EQ(codeText(0xB17F), "0xB17F");
-  EXPECT_EQ(codeText(0xFF0001), "0xFF0001");
+TEST(LogCodeText, HasFourDigitsAtLeast) {
+  EXPECT_EQ(logCodeText(0x7), "0x0007");
+  EXPECT_EQ(logCodeText(0xB17F), "0xB17F");
+  EXPECT_EQ(logCodeText(0xFF0001), "0xFF0001");
 }
 
 }  // namespace

@@ -3,9 +3,9 @@
 
 #include <algorithm>
 #include <array>
-#include <cstdio>
 #include <utility>
 
+#include "Tools/Kelvasictl/LogCodeText.h"
 #include "Tools/Kelvasictl/RecordText.h"
 
 namespace kelvasi {
@@ -41,7 +41,7 @@ Json nearest(const IntakeCount& count, std::span<const LogCode> known) {
   };
   const auto found =
       std::ranges::min_element(known, {}, [&](LogCode code) { return std::pair(away(code), code); });
-  return found == known.end() ? Json() : Json(codeText(*found));
+  return found == known.end() ? Json() : Json(logCodeText(*found));
 }
 
 void add(IntakeCount& to, const IntakeCount& count) {
@@ -94,7 +94,7 @@ Json Coverage::recordOf(const Counted& counted) const {
   const bool hasCode = count.logCode != 0 && count.outcome != Outcome::notARecord;
   Json record;
   record["technology"] = counted.technology;
-  record["code"] = hasCode ? Json(codeText(count.logCode)) : Json();
+  record["code"] = hasCode ? Json(logCodeText(count.logCode)) : Json();
   record["outcome"] = nameOf(count.outcome);
   record["messages"] = count.messages;
   record["share"] = shareOf(count.messages);
@@ -132,12 +132,6 @@ std::vector<LogCode> logCodesAsked(const LogGenerator& generator) {
     }
   }
   return asked;
-}
-
-std::string codeText(LogCode logCode) {
-  std::array<char, 16> text;
-  std::snprintf(text.data(), text.size(), "0x%04X", logCode);
-  return text.data();
 }
 
 }  // namespace kelvasi

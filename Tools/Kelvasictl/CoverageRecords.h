@@ -45,7 +45,4 @@ class Coverage {
 // The codes in the generator's start command.
 std::vector<LogCode> logCodesAsked(const LogGenerator& generator);
 
-// "0xB17F", "0xFF0001".
-std::string codeText(LogCode logCode);
-
 }  // namespace kelvasi

@@ -3,9 +3,9 @@
 
 #include <algorithm>
 #include <charconv>
-#include <cstdio>
 #include <nlohmann/json.hpp>
 
+#include "Tools/Kelvasictl/LogCodeText.h"
 #include "Tools/Kelvasictl/RecordText.h"
 
 namespace kelvasi {
@@ -45,12 +45,6 @@ void appendNumber(std::string& to, double number) {
   to.append(digits.data(), std::to_chars(digits.data(), digits.data() + digits.size(), number).ptr);
 }
 
-std::string codeText(LogCode code) {
-  std::array<char, 16> text;
-  const int length = std::snprintf(text.data(), text.size(), "0x%04X", static_cast<unsigned>(code));
-  return {text.data(), static_cast<std::size_t>(length)};
-}
-
 }  // namespace
 
 std::string ReadingLines::heading() const {
@@ -63,7 +57,7 @@ std::string ReadingLines::heading() const {
 
 void ReadingLines::startMessage(const Readings& message, std::string_view technology) {
   const std::string time = rfc3339(message.arrival());
-  const std::string code = message.logCode() == 0 ? "" : codeText(message.logCode());
+  const std::string code = message.logCode() == 0 ? "" : logCodeText(message.logCode());
   beginning_.clear();
   if (format_ == Format::csv) {
     beginning_ = time + ',' + std::string(technology) + ',' + code + ',';

@@ -18,12 +18,16 @@ std::string readTechnology(std::string& text) {
 
 }  // namespace
 
-void addTechnology(CLI::App& verb, std::string& technology) {
-  verb.add_option("--technology", technology,
-                  "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2; otherwise it is found from the "
-                  "messages")
+void addTechnology(CLI::App& verb, std::string& technology, const std::string& help) {
+  verb.add_option("--technology", technology, help)
       ->type_name("TECH")
       ->transform(CLI::Validator(readTechnology, ""));
+}
+
+void addTechnology(CLI::App& verb, std::string& technology) {
+  addTechnology(verb, technology,
+                "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2; otherwise it is found from the "
+                "messages");
 }
 
 }  // namespace kelvasi

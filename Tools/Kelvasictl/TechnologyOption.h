@@ -11,6 +11,8 @@ class App;
 namespace kelvasi {
 
 // `technology` becomes an identifier, and stays as it is where the option is not given.
+void addTechnology(CLI::App& verb, std::string& technology, const std::string& help);
+// For a verb that finds the technology of a capture itself.
 void addTechnology(CLI::App& verb, std::string& technology);
 
 }  // namespace kelvasi

@@ -22,6 +22,7 @@ Action declareCells(CLI::App& verb);
 Action declareCoverage(CLI::App& verb);
 Action declareDecode(CLI::App& verb);
 Action declareEvents(CLI::App& verb);
+Action declareFields(CLI::App& verb);
 Action declareMonitor(CLI::App& verb);
 Action declareReadings(CLI::App& verb);
 Action declareRecord(CLI::App& verb);

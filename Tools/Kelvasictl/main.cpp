@@ -26,6 +26,7 @@ constexpr std::array verbs{
     Verb{"events", "what happened: cell changes, states, rejects, service, link", declareEvents},
     Verb{"coverage", "what became of the messages, by log code", declareCoverage},
     Verb{"alarms", "watch captures or a live link by rules", declareAlarms},
+    Verb{"fields", "list every row of every technology, and what stands behind it", declareFields},
 };
 
 std::string verbNames() {
