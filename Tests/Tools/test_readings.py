@@ -11,7 +11,7 @@ import subprocess
 import unittest
 
 import jsonschema
-from live_support import DAEMON
+from live_support import DAEMON, PATIENCE, LiveTest
 from readings_fold import Fold
 from support import CAPTURES, START, TEMPLATES, KelvasictlTest, pcap, record
 
@@ -216,6 +216,97 @@ class Lines(ReadingsTest):
             ("/Detected Cells/1", None, None), ("/Detected Cells/0", None, None),
             ("/Detected Cells/0/Physical Cell ID", "9", "lte:3350/9")])
         self.assertEqual({line["row"] for line in lines if line["text"] is None}, {None})
+
+
+class SeveralCaptures(ReadingsTest):
+    def drives(self):
+        return [self.write_drive(technology, 1500) for technology in ("Orvane_LTE", "Orvane_GSM", "Orvane_CDMA")]
+
+    def test_without_jobs_they_are_one_run(self):
+        whole = pathlib.Path(self.write_drive("Orvane_GSM", 1500))
+        subprocess.run([DAEMON, "--technology", "Orvane_GSM", "--seed", "5", "--write", self.path("other.pcap"),
+                        "--messages", "1500"], check=True, capture_output=True, env=self.environment, timeout=60)
+        resources = CAPTURES.parent.parent / "Resources"
+        result = self.run_program("readings", "--resources", resources, whole, self.path("other.pcap"))
+        decoded = self.run_program("decode", "--resources", resources, whole, self.path("other.pcap"))
+        self.assertEqual((result.returncode, decoded.returncode), (0, 0))
+        lines = [json.loads(line) for line in result.stdout.splitlines()]
+        folded = self.fold(lines, "Orvane_GSM", resources)
+        self.assertTrue(same(in_order(folded), ordered(decoded.stdout)))
+
+    def test_with_jobs_each_is_a_run_of_its_own(self):
+        captures = self.drives()
+        for format in ("ndjson", "csv"):
+            alone = [self.run_program("readings", "--format", format, capture) for capture in captures]
+            heading = alone[0].stdout.splitlines(keepends=True)[0] if format == "csv" else b""
+            for jobs in (1, 2, 3, 999):
+                together = self.run_program("readings", "--format", format, "--jobs", jobs, *captures)
+                self.assertEqual(together.returncode, 0)
+                self.assertEqual(together.stdout, heading + b"".join(each.stdout[len(heading):] for each in alone))
+                for capture in captures:
+                    self.assertIn(capture.encode() + b": Orvane_", together.stderr)
+
+    def test_with_jobs_a_bad_one_is_said_and_the_others_are_read(self):
+        first, second, _ = self.drives()
+        bad = self.write("bad.pcap", b"no capture")
+        expected = self.run_program("readings", first).stdout + self.run_program("readings", second).stdout
+        result = self.run_program("readings", "--jobs", 2, first, bad, self.path("missing.pcap"), second)
+        self.assertEqual((result.returncode, result.stdout), (1, expected))
+        self.assertIn(bad, result.stderr.decode())
+        self.assertIn("missing.pcap", result.stderr.decode())
+
+    def test_with_jobs_what_was_not_shown_is_said_once(self):
+        capture = self.write("unknown.pcap", pcap(Lines.MEASURED, record(0xB193, b"")))
+        result = self.run_program("readings", "--jobs", 2, capture, capture)
+        self.assertEqual(result.stderr.decode().splitlines()[-1], "kelvasictl: 50 % of 4 messages were not shown")
+
+    def test_wrong_usage(self):
+        capture = self.write("one.pcap", pcap(Lines.MEASURED))
+        for arguments, words in (((), "CAPTURE or --live is required"), (("--jobs", "0", capture), '"0" is no number of jobs'),
+                                 (("--live", capture), "--live: takes no CAPTURE"),
+                                 (("--live", "--jobs", "2"), "--jobs: is for captures"),
+                                 (("--live", "--technology", "IFX"), "--technology: is told by the daemon"),
+                                 (("--seconds", "3", capture), "--seconds: needs --live")):
+            with self.subTest(arguments):
+                self.assert_fault(self.run_program("readings", *arguments), words, status=2)
+
+
+class Live(LiveTest, ReadingsTest):
+    def test_lines_of_a_live_link_are_those_of_its_capture(self):
+        world = self.write("world.pcap", pcap((0.0, Lines.MEASURED), (0.2, Lines.MEASURED), (0.4, record(0xB0C2, b"short"))))
+        daemon = self.start_daemon("--replay", world, "--leave", technology="Orvane_LTE")
+        readings = self.start_live("readings", "--live")
+        self.assertEqual(daemon.wait(PATIENCE), 0)
+        status, out, error = self.end(readings)
+        self.assertEqual(status, 0)
+        self.assertEqual(error.splitlines()[-1], "kelvasictl: 33 % of 3 messages were not shown")
+        without_time = lambda lines: [line | {"time": None} for line in lines]
+        lines = [json.loads(line) for line in out.splitlines()]
+        self.assertGreater(len(lines), 10)
+        self.assertEqual(without_time(lines), without_time(self.lines(world, technology="Orvane_LTE")))
+
+    def test_lines_come_while_the_link_goes_on(self):
+        self.start_daemon("--seed", "7", technology="Orvane_GSM")
+        readings = self.start_live("readings", "--live", "--format", "csv", "--changes",
+                                   resources=CAPTURES.parent.parent / "Resources")
+        self.assertEqual(readings.stdout.readline().decode().strip().split(","), KEYS)
+        self.assertIn(",Orvane_GSM,", readings.stdout.readline().decode())
+        self.assertEqual(self.end(readings)[0], 0)
+
+    def test_it_ends_after_the_seconds(self):
+        self.start_daemon("--seed", "7", "--speed", "20", technology="Orvane_UTRAN2")
+        result = self.run_program("readings", "--live", "--seconds", "2", "--select", "rscp_level")
+        self.assertEqual(result.returncode, 0, result.stderr)
+        lines = [json.loads(line) for line in result.stdout.splitlines()]
+        self.assertEqual({line["quantity"] for line in lines}, {"rscp_level"})
+
+    def test_a_reader_that_goes_away_ends_it(self):
+        self.start_daemon("--seed", "7", "--speed", "20", technology="Orvane_GSM")
+        readings = self.start_live("readings", "--live", resources=CAPTURES.parent.parent / "Resources")
+        readings.stdout.readline()
+        readings.stdout.close()
+        self.assertEqual(readings.wait(PATIENCE), 1)
+        self.assertIn("standard output: Broken pipe", readings.stderr.read().decode())
 
 
 if __name__ == "__main__":

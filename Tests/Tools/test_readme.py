@@ -3,6 +3,7 @@
 
 import os
 import pathlib
+import re
 import subprocess
 import unittest
 
@@ -22,19 +23,31 @@ def block_after(text):
 
 
 class Readme(LiveTest):
-    def test_the_first_capture_can_be_recorded_and_decoded(self):
-        commands = "\n".join(block_after("A first look at a live link"))
-        for name, program in (("kelvasictl", PROGRAM), ("telvon-sim", DAEMON)):
-            self.assertIn(PREFIX + name, commands)
-            commands = commands.replace(PREFIX + name, program)
-        os.mkdir(self.path("run"), 0o700)
+    def run_block(self, text):
+        """Runs the commands that follow, with the programs under test; their standard error and output."""
+        programs = {"kelvasictl": PROGRAM, "telvon-sim": DAEMON}
+        commands = "\n".join(block_after(text))
+        self.assertIn(PREFIX, commands)
+        commands = re.sub(PREFIX + r"(\S+)", lambda program: programs[program[1]], commands)
+        commands = commands.replace(" Docs/", f" {README.parent}/Docs/")
         result = subprocess.run(["bash", "-e", "-c", commands], cwd=self.directory.name, env=self.environment,
                                 capture_output=True, timeout=60, check=False)
-        error = result.stderr.decode()
-        self.assertEqual(result.returncode, 0, error)
+        self.assertEqual(result.returncode, 0, result.stderr.decode())
+        return result.stderr.decode(), result.stdout.decode()
+
+    def test_a_drive_becomes_a_plot(self):
+        self.run_block("Without an application and without waiting")
+        error, _ = self.run_block("RSRP over time")
+        self.assertEqual(error, "kelvasictl: lte.pcap: Orvane_LTE\n")
+        self.assertRegex(self.read("rsrp.csv").decode(), r"lte:\d+/\d+,-\d+\.\d\d dBm,")
+        self.assertTrue(self.read("rsrp.png").startswith(b"\x89PNG"))
+
+    def test_the_first_capture_can_be_recorded_and_decoded(self):
+        os.mkdir(self.path("run"), 0o700)
+        error, out = self.run_block("A first look at a live link")
         self.assertRegex(error, r"[1-9]\d* messages recorded in drive.pcap\n")
         self.assertIn("drive.pcap: Orvane_GSM\n", error)
-        self.assertIn("/GSM/", result.stdout.decode())
+        self.assertIn("/GSM/", out)
 
 
 if __name__ == "__main__":

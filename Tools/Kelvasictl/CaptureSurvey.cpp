@@ -12,13 +12,13 @@ constexpr std::uint64_t messagesPerTick = 1000;
 
 }  // namespace
 
-CaptureSurvey::CaptureSurvey(Surroundings& surroundings, std::string path, std::string technology)
+CaptureSurvey::CaptureSurvey(const Surroundings& surroundings, std::string path, std::string technology)
     : surroundings_(surroundings),
       path_(std::move(path)),
       technology_(std::move(technology)),
       clock_(surroundings.clock) {}
 
-void CaptureSurvey::run(const SurveyUse& use, const SurveyOutput& output) {
+void CaptureSurvey::run(const SurveyUse& use, const CaptureOutput& output) {
   CaptureInput::Choice choice{.paths = {path_}, .technology = {}};
   if (!technology_.empty()) choice.technology = technology_;
   CaptureInput input(std::move(choice), surroundings_.plists, output.complain, output.advance);
@@ -35,9 +35,7 @@ void CaptureSurvey::giveTo(const SurveyUse& use) const {
 
 void CaptureSurvey::begin(std::string_view technology, const SurveyUse& use, const SurveyUse::Print& print) {
   technology_ = technology;
-  generator_ = LogGenerator::generatorFromTechnology(
-      technology_,
-      {*surroundings_.log, *surroundings_.trace, surroundings_.plists, surroundings_.resources, clock_});
+  generator_ = LogGenerator::generatorFromTechnology(technology_, surroundings_.platformWith(clock_));
   generator_->gatherInto(&readings_);
   survey_ = std::make_unique<survey::Survey>(use.setUp(std::string(shortTechnologyName(technology_)), print));
 }

@@ -7,26 +7,20 @@
 #include <string>
 #include <string_view>
 
-#include "Capture/CaptureInput.h"
 #include "LogGenerator/LogGenerator.h"
 #include "LogGenerator/Readings.h"
 #include "Platform/PushedClock.h"
+#include "Tools/Kelvasictl/CaptureWork.h"
 #include "Tools/Kelvasictl/SurveyRun.h"
 
 namespace kelvasi {
 
-struct SurveyOutput {
-  SurveyUse::Print print;
-  CaptureInput::Tell complain;
-  CaptureInput::Advance advance;
-};
-
 class CaptureSurvey {
  public:
   // `surroundings` outlives it. `technology` by its identifier, empty where it is to be found.
-  CaptureSurvey(Surroundings& surroundings, std::string path, std::string technology);
+  CaptureSurvey(const Surroundings& surroundings, std::string path, std::string technology);
 
-  void run(const SurveyUse& use, const SurveyOutput& output);
+  void run(const SurveyUse& use, const CaptureOutput& output);
   // Whether something of the capture could not be read.
   bool hasFault() const { return hasFault_; }
   // The result, where there was a technology.
@@ -38,7 +32,7 @@ class CaptureSurvey {
   // An exception of a decoder ends the process.
   void decode(const CapturedMessage& message) noexcept;
 
-  Surroundings& surroundings_;
+  const Surroundings& surroundings_;
   std::string path_;
   std::string technology_;
   PushedClock clock_;

@@ -5,6 +5,7 @@
 #include <memory>
 #include <string>
 
+#include "Tools/Kelvasictl/LiveRun.h"
 #include "Tools/Kelvasictl/SurveyRun.h"
 
 namespace kelvasi {
@@ -14,18 +15,16 @@ class LiveSurvey {
   LiveSurvey(const LiveOptions& options, const SurveyUse& use);
 
   // As LiveSession's; gives the survey to its use at the end, and when the technology changes.
-  void run();
+  void run() { run_.run(); }
 
  private:
-  void take(const Readings& readings, const Intake& intake);
-  void begin();
-  void finish();
-  void pass();
+  LiveUse liveUse();
+  void begin(std::string_view technology);
+  void look(Arrival now, bool isConnected);
 
   const SurveyUse& use_;
-  LiveSession session_;
-  std::string technology_;  // of the survey
-  std::shared_ptr<const LogGenerator> generator_;
+  LiveRun run_;
+  std::string technology_;  // of the survey, its short name
   std::unique_ptr<survey::Survey> survey_;
 };
 

@@ -36,7 +36,8 @@ class Surroundings {
   // KELVASI_LOG_LEVEL says what is logged, and `unasked` where it does not.
   explicit Surroundings(const SurroundingsOptions& options, const LogLevel& unasked = LogLevel());
 
-  Platform platform() { return {*log, *trace, plists, resources, clock}; }
+  Platform platform() const { return platformWith(clock); }
+  Platform platformWith(const Clock& other) const { return {*log, *trace, plists, resources, other}; }
 
   const std::unique_ptr<SystemLog> log;
   const std::unique_ptr<TraceOutput> trace;
@@ -51,7 +52,7 @@ class OfflineSurroundings : public Surroundings {
  public:
   explicit OfflineSurroundings(const SurroundingsOptions& options);
 
-  Platform platform() { return {*log, *trace, plists, resources, captureClock}; }
+  Platform platform() const { return platformWith(captureClock); }
 
   PushedClock captureClock;
 };

@@ -7,7 +7,7 @@
 #include <vector>
 
 #include "Survey/Survey.h"
-#include "Tools/Kelvasictl/LiveSession.h"
+#include "Tools/Kelvasictl/InputOptions.h"
 #include "Tools/Kelvasictl/RecordOutput.h"
 
 namespace CLI {
@@ -16,12 +16,7 @@ class App;
 
 namespace kelvasi {
 
-struct SurveyOptions {
-  std::string technology;  // its identifier; empty: each capture's is found
-  std::vector<std::string> captures;
-  unsigned jobs = 1;  // captures that are surveyed side by side
-  bool isLive = false;
-  LiveOptions live;
+struct SurveyOptions : InputOptions {
   FormatOption format;
 
   void addTo(CLI::App& verb);

@@ -1,0 +1,55 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "Tools/Kelvasictl/LiveRun.h"
+
+#include "Tools/Kelvasictl/ToolError.h"
+
+namespace kelvasi {
+
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr auto timeBetweenLooks = 250ms;
+
+}  // namespace
+
+// The tree is asked for so that the generator lets the messages of the last tick go.
+LiveRun::LiveRun(const LiveOptions& options, LiveUse use)
+    : use_(std::move(use)), session_(options, [this] { session_.model().topLevelNodes(); }) {
+  session_.model().gatherReadings([this](const Readings& readings, const Intake& intake) {
+    endAtFault([&] { take(readings, intake); });
+  });
+}
+
+void LiveRun::run() {
+  const auto timer = session_.queue().repeat(timeBetweenLooks, [this] {
+    endAtFault([&] { use_.look(arrivalAt(session_.clock().now()), session_.model().isConnected()); });
+  });
+  session_.run();
+  finish();
+}
+
+void LiveRun::take(const Readings& readings, const Intake& intake) {
+  if (!generator_ || technology_ != session_.model().technology()) {
+    finish();
+    technology_ = session_.model().technology();
+    use_.begin(technology_);
+  }
+  generator_ = session_.model().sharedLogGenerator();
+  use_.take(readings, intake);
+}
+
+void LiveRun::finish() {
+  if (generator_) use_.finish(*generator_);
+}
+
+template <typename Action>
+void LiveRun::endAtFault(Action action) {
+  try {
+    action();
+  } catch (const ToolError& error) {
+    session_.end(error.what());
+  }
+}
+
+}  // namespace kelvasi
