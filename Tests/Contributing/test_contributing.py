@@ -45,11 +45,15 @@ def run(command):
     # The copy's objects are the tree's own, but for what the new decoder changes.
     environment = {**os.environ, "CCACHE_NOHASHDIR": "1"}
     environment.setdefault("CCACHE_BASEDIR", str(ROOT))
-    return subprocess.run(["bash", "-e", "-c", command], cwd=COPY, env=environment, capture_output=True, text=True,
-                          check=False)
+    # Behind the tests that wait for ticks beside it.
+    return subprocess.run(["nice", "-n", "19", "bash", "-e", "-c", command], cwd=COPY, env=environment,
+                          capture_output=True, text=True, check=False)
 
 
 class Contributing(unittest.TestCase):
+    def tearDown(self):
+        shutil.rmtree(COPY, ignore_errors=True)
+
     def test_a_decoder_takes_what_the_recipe_says_and_nothing_else(self):
         chapter = (ROOT / "CONTRIBUTING.md").read_text().split(CHAPTER, 1)[1].split("\n## ", 1)[0]
         copy_tree()
