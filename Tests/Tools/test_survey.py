@@ -103,14 +103,14 @@ class Cells(Survey):
     def test_jobs_change_nothing(self):
         captures = [self.drive(technology, 1500, seed) for technology in ("Orvane_LTE", "Orvane_GSM", "Orvane_CDMA")
                     for seed in (1, 2)]
-        for verb in ("cells", "events", "coverage"):
+        for verb, status in (("cells",), 0), (("events",), 0), (("coverage",), 0), (("alarms", "--rule", "event cell_change"), 3):
             with self.subTest(verb):
-                alone = self.run_program(verb, *captures)
-                together = self.run_program(verb, "--jobs", "3", *captures)
-                self.assertEqual(alone.returncode, 0)
+                alone = self.run_program(*verb, *captures)
+                together = self.run_program(*verb, "--jobs", "3", *captures)
+                self.assertEqual(alone.returncode, status)
                 self.assertGreater(len(alone.stdout), 1000)
                 self.assertEqual((together.returncode, together.stdout, together.stderr),
-                                 (0, alone.stdout, alone.stderr))
+                                 (status, alone.stdout, alone.stderr))
 
     def test_a_bad_capture_is_said_and_the_others_are_read(self):
         bad = self.write("bad.pcap", b"no capture")
@@ -257,6 +257,10 @@ class Alarms(Survey):
         result = self.run_program("alarms", "--rule", "rsrp < -115", "--run", "echo oops", self.levels(-120))
         self.assertEqual(result.returncode, 1)
         self.assertIn("echo oops: No such file or directory", result.stderr.decode())
+
+    def test_a_command_has_one_run_at_a_time(self):
+        self.assert_fault(self.run_program("alarms", "--rule", "rsrp < -115", "--run", "true", "--jobs", "2", "a.pcap"),
+                          "--run excludes --jobs", status=2)
 
     def test_what_the_command_prints_is_no_record(self):
         result = self.run_program("alarms", "--rule", "rsrp < -115", "--run", self.script("echo heard\n"), self.levels(-120))

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl alarms: watches captures or a live link by rules, and runs a program for each alarm.
 #include <CLI/CLI.hpp>
+#include <atomic>
 #include <variant>
 
 #include "Tools/Kelvasictl/AlarmCommand.h"
@@ -27,7 +28,8 @@ value must come back before the alarm is over) and "every 5min" (at most so ofte
 Each alarm is a record with the keys time, technology, rule, since, cell, quantity, value, unit, event, held_back and
 text. The command gets the same in its environment, as KELVASI_ALARM_TIME, KELVASI_ALARM_TECHNOLOGY and so on, what
 is null empty; no shell sees it, its standard input is empty, and what it prints goes to the standard error. One run
-ends before the next begins: captures wait for it, a live link goes on and leaves the alarm without a run.
+ends before the next begins: captures wait for it, a live link goes on and leaves the alarm without a run. So --jobs
+is for alarms without a command.
 
 Exit status: 0 without an alarm, 3 with one, 1 when a capture could not be read or a command failed, 2 for wrong
 usage.)";
@@ -45,21 +47,22 @@ constexpr int exitAlarm = 3;
 class AlarmsVerb {
  public:
   explicit AlarmsVerb(const AlarmsOptions& options)
-      : options_(options), output_(options.survey.format.format(), alarmColumns(), printOut) {
+      : options_(options), format_(options.survey.format.format()) {
     for (const std::string& rule : options.rules)
       rules_.push_back(std::get<survey::AlarmRule>(survey::parseAlarmRule(rule)));
     if (!options.command.empty()) prepareCommand();
   }
 
   int run(MessageTally& tally) {
-    output_.begin();
-    const SurveyUse use{
-        .setUp = [this](const std::string& technology, const SurveyUse::Print&) { return setUp(technology); },
-        .take = [&](const Surveyed& surveyed) { tally.add(surveyed.generator.intake()); },
-        .tick =
-            [this] {
-              if (command_) command_->look();
-            }};
+    RecordOutput(format_, alarmColumns(), printOut).begin();
+    const SurveyUse use{.setUp = [this](const std::string& technology,
+                                        const SurveyUse::Print& print) { return setUp(technology, print); },
+                        .take = [&](const Surveyed& surveyed) { tally.add(surveyed.generator.intake()); },
+                        .printsMeanwhile = true,
+                        .tick =
+                            [this] {
+                              if (command_) command_->look();
+                            }};
     const int status = runSurvey(options_.survey, use);
     if (command_) command_->finish();
     if (status != exitSuccess || (command_ && !command_->isWell())) return exitFault;
@@ -77,27 +80,29 @@ class AlarmsVerb {
         options_.survey.isLive ? AlarmCommand::WhenBusy::leaveOut : AlarmCommand::WhenBusy::wait);
   }
 
-  survey::SurveySetUp setUp(const std::string& technology) {
+  survey::SurveySetUp setUp(const std::string& technology, const SurveyUse::Print& print) {
     survey::SurveySetUp result;
     result.keepsSeries = false;
     result.events = 0;
     result.rules = rules_;
-    result.onAlarm = [this, technology](const survey::Alarm& alarm) { take(alarm, technology); };
+    result.onAlarm = [this, technology, output = RecordOutput(format_, alarmColumns(), print)](
+                         const survey::Alarm& alarm) mutable { take(alarm, technology, output); };
     return result;
   }
 
-  void take(const survey::Alarm& alarm, const std::string& technology) {
+  // With several jobs, in the thread of the capture; there is no command then.
+  void take(const survey::Alarm& alarm, const std::string& technology, RecordOutput& output) {
     ++alarms_;
     const Json record = alarmRecord(alarm, technology);
-    output_.print(record);
+    output.print(record);
     if (command_) command_->run(record, alarm.time);
   }
 
   const AlarmsOptions& options_;
   std::vector<survey::AlarmRule> rules_;
-  RecordOutput output_;
+  const RecordOutput::Format format_;
   std::optional<AlarmCommand> command_;
-  std::uint64_t alarms_ = 0;
+  std::atomic<std::uint64_t> alarms_ = 0;
 };
 
 std::string checkRule(const std::string& text) {
@@ -128,6 +133,7 @@ Action declareAlarms(CLI::App& verb) {
       ->check(numberBetween(0, 1e9, "from 0 to 1000000000"))
       ->needs(command);
   options->survey.addTo(verb);
+  options->survey.addJobsTo(verb)->excludes(command);
   verb.footer(footer);
   return [options](MessageTally& tally) { return AlarmsVerb(*options).run(tally); };
 }

@@ -37,8 +37,8 @@ void InputOptions::addTo(CLI::App& verb, const std::string& severalCaptures) {
   verb.callback([this] { check(*this); });
 }
 
-void InputOptions::addJobsTo(CLI::App& verb, const std::string& help) {
-  verb.add_option("--jobs", jobs, help)->type_name("N")->check(CLI::Validator(checkJobs, ""));
+CLI::Option* InputOptions::addJobsTo(CLI::App& verb, const std::string& help) {
+  return verb.add_option("--jobs", jobs, help)->type_name("N")->check(CLI::Validator(checkJobs, ""));
 }
 
 }  // namespace kelvasi

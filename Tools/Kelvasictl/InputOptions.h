@@ -10,7 +10,8 @@
 
 namespace CLI {
 class App;
-}
+class Option;
+}  // namespace CLI
 
 namespace kelvasi {
 
@@ -23,7 +24,7 @@ struct InputOptions {
 
   // `severalCaptures` ends the help of CAPTURE: what becomes of several of them.
   void addTo(CLI::App& verb, const std::string& severalCaptures);
-  void addJobsTo(CLI::App& verb, const std::string& help);
+  CLI::Option* addJobsTo(CLI::App& verb, const std::string& help);
 };
 
 }  // namespace kelvasi

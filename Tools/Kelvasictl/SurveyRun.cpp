@@ -36,8 +36,8 @@ void SurveyOptions::addTo(CLI::App& verb) {
   format.addTo(verb);
 }
 
-void SurveyOptions::addJobsTo(CLI::App& verb) {
-  InputOptions::addJobsTo(verb, "so many captures side by side; the output stays in their order");
+CLI::Option* SurveyOptions::addJobsTo(CLI::App& verb) {
+  return InputOptions::addJobsTo(verb, "so many captures side by side; the output stays in their order");
 }
 
 int runSurvey(const SurveyOptions& options, const SurveyUse& use) {

@@ -12,7 +12,8 @@
 
 namespace CLI {
 class App;
-}
+class Option;
+}  // namespace CLI
 
 namespace kelvasi {
 
@@ -20,7 +21,7 @@ struct SurveyOptions : InputOptions {
   FormatOption format;
 
   void addTo(CLI::App& verb);
-  void addJobsTo(CLI::App& verb);
+  CLI::Option* addJobsTo(CLI::App& verb);
 };
 
 // One capture, or a live link as long as its technology is the same. It lasts for a call.
