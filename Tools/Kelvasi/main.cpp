@@ -21,6 +21,7 @@
 #include "Platform/QtDesktop/QtPreferences.h"
 #include "Platform/QtWidgets/QtApplicationFramework.h"
 #include "Platform/QtWidgets/QtUserInterface.h"
+#include "Platform/RateLimitedLog.h"
 #include "Tools/CommandLine.h"
 #include "Tools/Kelvasi/Options.h"
 #include "Tools/Kelvasi/Script.h"
@@ -40,8 +41,9 @@ bool run(QtApplicationFramework& framework, const ViewerOptions& options) {
   const PackageResources resources;
   const PosixClock clock;
   QtMainQueue queue;
-  QtMessagePorts ports(*log);
-  QtTelephonyDaemon daemon(*log);
+  RateLimitedLog peerLog(*log, queue);
+  QtMessagePorts ports(peerLog);
+  QtTelephonyDaemon daemon(peerLog);
   const std::string memoryPath =
       options.script.empty() || !options.memory.empty() ? memoryFile(options.memory) : std::string();
   ViewerMemory memory = readMemory(memoryPath);

@@ -36,8 +36,9 @@ void LiveOptions::addTo(CLI::App& verb) {
 LiveSession::LiveSession(const LiveOptions& options, KelvasiModel::ViewControllerUpdate onUpdate)
     : seconds_(options.seconds),
       surroundings_(options.surroundings),
-      ports_(*surroundings_.log),
-      daemon_(*surroundings_.log),
+      peerLog_(*surroundings_.log, queue_),
+      ports_(peerLog_),
+      daemon_(peerLog_),
       model_(surroundings_.platform(), {queue_, ports_, daemon_}, std::move(onUpdate)) {}
 
 void LiveSession::connect() {

@@ -11,6 +11,7 @@
 #include "Platform/Qt/QtMainQueue.h"
 #include "Platform/Qt/QtMessagePorts.h"
 #include "Platform/Qt/QtTelephonyDaemon.h"
+#include "Platform/RateLimitedLog.h"
 #include "Tools/Kelvasictl/Surroundings.h"
 
 namespace kelvasi {
@@ -46,6 +47,7 @@ class LiveSession {
   std::optional<double> seconds_;
   Surroundings surroundings_;
   QtMainQueue queue_;
+  RateLimitedLog peerLog_;  // of what the other side causes
   QtMessagePorts ports_;
   QtTelephonyDaemon daemon_;
   KelvasiModel model_;
