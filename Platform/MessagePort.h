@@ -38,6 +38,10 @@ class LocalPort : public MessagePort {
   // reply. A sender that does not wait for a reply is sent none.
   using ReceiveHandler =
       std::function<std::optional<Bytes>(MessageId id, std::span<const std::uint8_t> data)>;
+  using DesertionHandler = std::function<void()>;
+
+  // Run when the last of those who had sent something has closed its connection. It may destroy the port.
+  virtual void setDesertionHandler(DesertionHandler handler) = 0;
 };
 
 // Status of a request; the numbers are what log lines print.

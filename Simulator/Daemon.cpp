@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <utility>
+#include <vector>
 
 namespace kelvasi::sim {
 
@@ -11,6 +12,7 @@ constexpr std::string_view portPrefix = "telvon.log.";
 constexpr MessageId commandId = 0;
 constexpr DaemonError noApplicationPort{.domain = 1, .code = 2};
 constexpr DaemonError noPort{.domain = 1, .code = 12};
+constexpr DaemonError tooManyChannels{.domain = 1, .code = 24};
 }  // namespace
 
 Daemon::Daemon(const DaemonPlatform& platform, std::string_view technology, Faults faults,
@@ -22,26 +24,32 @@ Daemon::Daemon(const DaemonPlatform& platform, std::string_view technology, Faul
 
 std::optional<LogChannelAnswer> Daemon::openChannel(std::string_view applicationPort) {
   if (faults_.has(Fault::noChannel)) return std::nullopt;
+  if (channels_.size() >= channelLimit) {
+    platform_.log.print(LogPriority::error, "More than %zu channels; one refused", channelLimit);
+    return LogChannelAnswer{.error = tooManyChannels, .portName = std::nullopt};
+  }
   const auto identifier = platform_.ports.makeUniqueIdentifier();
   if (!identifier) return LogChannelAnswer{.error = noPort, .portName = std::nullopt};
   const std::string name = std::string(portPrefix) + *identifier;
   if (auto faulty = faultyChannelAnswer(name, faults_)) return faulty;
-  if (addChannel(name, applicationPort)) return LogChannelAnswer{.error = {}, .portName = name};
+  const DaemonError error = addChannel(name, applicationPort);
+  if (error.code == 0) return LogChannelAnswer{.error = {}, .portName = name};
   platform_.log.print(LogPriority::error, "No channel for %s", std::string(applicationPort).c_str());
-  return LogChannelAnswer{.error = noApplicationPort, .portName = std::nullopt};
+  return LogChannelAnswer{.error = error, .portName = std::nullopt};
 }
 
-bool Daemon::addChannel(const std::string& name, std::string_view applicationPort) {
+DaemonError Daemon::addChannel(const std::string& name, std::string_view applicationPort) {
   auto application = platform_.ports.createRemotePort(applicationPort);
-  if (!application) return false;
+  if (!application) return noApplicationPort;
   auto channel = std::make_unique<Channel>(name, std::move(application));
   auto port = platform_.ports.createLocalPort(
       name, [this, &to = *channel](MessageId id, std::span<const std::uint8_t> data) {
         return receive(to, id, data);
       });
-  if (!port) return false;
+  if (!port) return noPort;
+  port->setDesertionHandler([this, name] { close(name); });
   channels_.emplace(name, Entry{std::move(channel), std::move(port)});
-  return true;
+  return {};
 }
 
 std::optional<Bytes> Daemon::receive(Channel& channel, MessageId id, std::span<const std::uint8_t> data) {
@@ -104,6 +112,11 @@ void Daemon::giveUp() {
   }
 }
 
+void Daemon::close(const std::string& name) {
+  platform_.log.print(LogPriority::notice, "%s: closed, its application has gone", name.c_str());
+  channels_.erase(name);
+}
+
 void Daemon::sweep() {
   for (const auto& [name, entry] : channels_) {
     const std::uint64_t dropped = entry.channel->takeDropped();
@@ -111,11 +124,11 @@ void Daemon::sweep() {
       platform_.log.print(LogPriority::warning, "%s: %llu messages dropped, its application does not keep up",
                           name.c_str(), static_cast<unsigned long long>(dropped));
   }
-  std::erase_if(channels_, [this](const auto& item) {
-    if (item.second.channel->isValid()) return false;
-    platform_.log.print(LogPriority::notice, "%s: closed, its application has gone", item.first.c_str());
-    return true;
-  });
+  std::vector<std::string> deserted;
+  for (const auto& [name, entry] : channels_) {
+    if (!entry.channel->isValid()) deserted.push_back(name);
+  }
+  for (const std::string& name : deserted) close(name);
 }
 
 }  // namespace kelvasi::sim

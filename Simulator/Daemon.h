@@ -36,6 +36,9 @@ class Daemon {
   // `technology` is a full id.
   Daemon(const DaemonPlatform& platform, std::string_view technology, Faults faults, StreamHandler onStream);
 
+  // More channels at a time are refused.
+  static constexpr std::size_t channelLimit = 64;
+
   // The daemon's answer to a request for a log channel; nothing when a fault leaves it unanswered.
   std::optional<LogChannelAnswer> openChannel(std::string_view applicationPort);
 
@@ -50,8 +53,9 @@ class Daemon {
   // Drops what is held back for applications that take nothing any more.
   void giveUp();
 
-  // To be called once a second: closes the channels whose application has gone, and writes a line for each
-  // that lost messages.
+  // To be called once a second: closes the channels whose application has closed its port, and writes a line
+  // for each that lost messages. One whose application sends no commands any more, having closed its
+  // connection, is closed at once.
   void sweep();
 
  private:
@@ -62,7 +66,8 @@ class Daemon {
 
   std::optional<Bytes> receive(Channel& channel, MessageId id, std::span<const std::uint8_t> data);
   void start(Channel& channel, Subscription subscription);
-  bool addChannel(const std::string& name, std::string_view applicationPort);
+  void close(const std::string& name);
+  DaemonError addChannel(const std::string& name, std::string_view applicationPort);
 
   DaemonPlatform platform_;
   std::string technology_;

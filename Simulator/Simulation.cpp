@@ -24,7 +24,10 @@ Simulation::Simulation(const SimulationPlatform& platform, std::string_view tech
       handlers_(std::move(handlers)),
       source_(std::move(source)),
       daemon_(platform.daemon, technology, faults,
-              [this](Channel& channel) { player_.streamBegan(channel); }),
+              [this](Channel& channel) {
+                hasStreamed_ = true;
+                player_.streamBegan(channel);
+              }),
       player_(platform.queue, platform.clock, daemon_, *source_, speed, faults, [this] {
         if (handlers_.sourceEnded) handlers_.sourceEnded();
       }) {}
@@ -32,10 +35,17 @@ Simulation::Simulation(const SimulationPlatform& platform, std::string_view tech
 bool Simulation::serve(DaemonServerHost& host) {
   server_ = host.serve([this](std::string_view port) { return daemon_.openChannel(port); });
   if (!server_) return false;
-  sweeping_ = platform_.queue.repeat(sweepInterval, [this] { daemon_.sweep(); });
+  sweeping_ = platform_.queue.repeat(sweepInterval, [this] { sweep(); });
   schedule(Fault::death, handlers_.die);
   schedule(Fault::stall, handlers_.stall);
   return true;
+}
+
+void Simulation::sweep() {
+  daemon_.sweep();
+  if (!hasStreamed_ || daemon_.channelCount() > 0) return;
+  hasStreamed_ = false;
+  if (handlers_.lastApplicationLeft) handlers_.lastApplicationLeft();
 }
 
 void Simulation::schedule(Fault fault, const std::function<void()>& handler) {

@@ -22,6 +22,7 @@ struct SimulationHandlers {
   std::function<void()> die;    // ends the process without a goodbye
   std::function<void()> stall;  // stops the process
   std::function<void()> sourceEnded;
+  std::function<void()> lastApplicationLeft;  // of those that had begun a stream; noticed within a second
 };
 
 class Simulation {
@@ -34,6 +35,7 @@ class Simulation {
   const Daemon& daemon() const { return daemon_; }
 
  private:
+  void sweep();
   void schedule(Fault fault, const std::function<void()>& handler);
 
   SimulationPlatform platform_;
@@ -42,6 +44,7 @@ class Simulation {
   std::unique_ptr<MessageSource> source_;
   Daemon daemon_;
   Player player_;
+  bool hasStreamed_ = false;  // since the last application left
   std::unique_ptr<Timer> sweeping_;
   std::unique_ptr<DaemonServer> server_;
 };

@@ -50,9 +50,10 @@ FrameChannel::~FrameChannel() {
   close();
 }
 
-void FrameChannel::start(FrameHandler onFrame, EndHandler onEnd) {
+void FrameChannel::start(FrameHandler onFrame, EndHandler onEnd, ReadHandler onRead) {
   onFrame_ = std::move(onFrame);
   onEnd_ = std::move(onEnd);
+  onRead_ = std::move(onRead);
   readNotifier_ = std::make_unique<QSocketNotifier>(socket_.number(), QSocketNotifier::Read);
   // What a handler throws ends the program here, ahead of Qt, which must not be unwound.
   // NOLINTNEXTLINE(bugprone-exception-escape)
@@ -132,6 +133,7 @@ void FrameChannel::readable() {
   const auto self = shared_from_this();  // through handlers that release the channel
   fill();
   takeFrames();
+  if (isOpen() && onRead_) onRead_();
   tellEnd();
 }
 
@@ -145,6 +147,7 @@ void FrameChannel::takeFrames() {
   while (isOpen() && !hasEnded_) {
     const auto frame = received_.next();
     if (!frame) break;
+    hasSpoken_ = true;
     if (!onFrame_(*frame)) fail("frame of a kind or size that has no place here");
   }
   if (received_.fault()) fail((std::string("frame ") + received_.fault()).c_str());

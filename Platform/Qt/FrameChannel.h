@@ -27,6 +27,8 @@ class FrameChannel : public std::enable_shared_from_this<FrameChannel> {
   using FrameHandler = std::function<bool(const Frame& frame)>;
   // The peer has gone or was closed for a fault; the channel is closed by then.
   using EndHandler = std::function<void()>;
+  // The loop has read from the peer, and what was whole has been taken.
+  using ReadHandler = std::function<void()>;
   enum class Outcome { done, timedOut, ended };
 
   // Above this many waiting bytes post() takes no more.
@@ -38,9 +40,9 @@ class FrameChannel : public std::enable_shared_from_this<FrameChannel> {
   FrameChannel(const FrameChannel&) = delete;
   FrameChannel& operator=(const FrameChannel&) = delete;
 
-  // To be called once, first. Both handlers are called from the event loop, the frame handler from
-  // receiveBy() too; both may close or release the channel.
-  void start(FrameHandler onFrame, EndHandler onEnd);
+  // To be called once, first. The handlers are called from the event loop, the frame handler from receiveBy()
+  // too; each may close or release the channel.
+  void start(FrameHandler onFrame, EndHandler onEnd, ReadHandler onRead = {});
   // What the socket takes at once still goes. No handler is called afterwards.
   void close();
 
@@ -48,6 +50,11 @@ class FrameChannel : public std::enable_shared_from_this<FrameChannel> {
   // Asks the socket, so that it holds without the event loop having run.
   bool isPeerThere() const;
   bool hadFault() const { return hadFault_; }
+  // Whether a frame has come from the peer.
+  bool hasSpoken() const { return hasSpoken_; }
+  // Bytes that wait here: of frames that are not whole yet, and of those that the peer has not taken. 0 once
+  // the channel is ending.
+  std::size_t held() const { return hasEnded_ ? 0 : received_.size() + toSend_.size(); }
 
   // Puts a frame on its way without waiting, many in one write. False when it is too large, the backlog is
   // full or the peer has gone.
@@ -75,11 +82,13 @@ class FrameChannel : public std::enable_shared_from_this<FrameChannel> {
   SystemLog& log_;
   FrameHandler onFrame_;
   EndHandler onEnd_;
+  ReadHandler onRead_;
   ReceiveBuffer received_;
   SendBuffer toSend_;
   std::size_t sinceFlush_ = 0;  // bytes put up since the socket was last tried
   bool hasEnded_ = false;       // nothing more comes in; onEnd is due
   bool hadFault_ = false;
+  bool hasSpoken_ = false;
   bool isSendingOver_ = false;
   std::unique_ptr<QSocketNotifier> readNotifier_;
   std::unique_ptr<QSocketNotifier> writeNotifier_;

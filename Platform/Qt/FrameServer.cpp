@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Platform/Qt/FrameServer.h"
 
+#include <algorithm>
+
 #include "Platform/SystemLog.h"
 
 namespace kelvasi {
@@ -35,9 +37,28 @@ void FrameServer::add(FileDescriptor socket) {
   const auto channel = std::make_shared<FrameChannel>(std::move(socket), name_, log_);
   FrameChannel* const self = channel.get();
   channels_.push_back(channel);
-  channel->start(
-      [onFrame = onFrame_, self](const Frame& frame) { return (*onFrame)(*self, frame); },
-      [this, self] { std::erase_if(channels_, [self](const auto& one) { return one.get() == self; }); });
+  channel->start([onFrame = onFrame_, self](const Frame& frame) { return (*onFrame)(*self, frame); },
+                 [this, self] { remove(*self); }, [this] { boundHeld(); });
+}
+
+void FrameServer::remove(const FrameChannel& ended) {
+  const bool hadSpoken = ended.hasSpoken();
+  std::erase_if(channels_, [&ended](const auto& one) { return one.get() == &ended; });
+  const bool isDeserted = std::ranges::none_of(channels_, [](const auto& one) { return one->hasSpoken(); });
+  const DesertionHandler handler = onDesertion_;
+  if (hadSpoken && isDeserted && handler) handler();
+}
+
+void FrameServer::boundHeld() {
+  const auto held = [](const auto& channel) { return channel->held(); };
+  const auto total = [&] {
+    std::size_t sum = 0;
+    for (const auto& channel : channels_) sum += held(channel);
+    return sum;
+  };
+  while (total() > heldLimit)
+    (*std::ranges::max_element(channels_, {}, held))
+        ->fail("all connections hold more than 64 MiB, this one most");
 }
 
 }  // namespace kelvasi

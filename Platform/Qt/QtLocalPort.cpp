@@ -39,6 +39,10 @@ std::unique_ptr<QtLocalPort> QtLocalPort::open(std::string_view name, SystemLog&
   return std::unique_ptr<QtLocalPort>(new QtLocalPort(std::move(server)));
 }
 
+void QtLocalPort::setDesertionHandler(DesertionHandler handler) {
+  if (server_) server_->setDesertionHandler(std::move(handler));
+}
+
 // The handler may destroy the port.
 void QtLocalPort::invalidate() {
   if (!server_) return;

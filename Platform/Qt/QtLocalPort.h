@@ -15,6 +15,7 @@ class QtLocalPort : public LocalPort {
   bool isValid() const override { return server_ != nullptr; }
   void invalidate() override;
   void setInvalidationHandler(InvalidationHandler handler) override { onInvalid_ = std::move(handler); }
+  void setDesertionHandler(DesertionHandler handler) override;
 
  private:
   explicit QtLocalPort(std::unique_ptr<FrameServer> server) : server_(std::move(server)) {}

@@ -24,6 +24,8 @@ class ReceiveBuffer {
   // What is wrong with the frame at hand, in words; null while nothing is.
   const char* fault() const { return fault_; }
   bool isEmpty() const { return begin_ == end_; }
+  // Bytes of frames that nobody has taken.
+  std::size_t size() const { return end_ - begin_; }
 
  private:
   std::span<const std::uint8_t> waiting() const { return {bytes_.get() + begin_, end_ - begin_}; }

@@ -167,6 +167,42 @@ TEST_F(SimulatedDaemon, IgnoresCommandsThatAreNone) {
   EXPECT_FALSE(daemon->isStreaming());
 }
 
+TEST_F(SimulatedDaemon, ClosesAChannelWhenItsApplicationSendsNoCommandsAnyMore) {
+  viewer.connect();
+  viewer.startEverything();
+  viewer.hangUp();
+  queue.runPosted();
+  EXPECT_FALSE(daemon->isStreaming());
+  EXPECT_EQ(daemon->channelCount(), 0u);
+  send({0x7130});
+  EXPECT_THAT(viewer.received, IsEmpty());
+}
+
+TEST_F(SimulatedDaemon, KeepsAChannelWhileAnotherConnectionSendsItCommands) {
+  viewer.connect();
+  viewer.startEverything();
+  test::FakeApplication second{ports, "KelvasiApp.2"};
+  second.use(viewer.answered);
+  second.ask(getTechnology());
+  viewer.hangUp();
+  queue.runPosted();
+  EXPECT_EQ(daemon->channelCount(), 1u);
+  second.hangUp();
+  queue.runPosted();
+  EXPECT_EQ(daemon->channelCount(), 0u);
+}
+
+TEST_F(SimulatedDaemon, RefusesTheChannelAfterTheLast) {
+  for (std::size_t number = 0; number < 64; ++number)
+    EXPECT_EQ(daemon->openChannel(viewer.name)->error.code, 0);
+  EXPECT_THAT(surroundings.log.errors(), IsEmpty());
+  const auto refused = daemon->openChannel(viewer.name);
+  EXPECT_NE(refused->error.code, 0);
+  EXPECT_EQ(refused->portName, std::nullopt);
+  EXPECT_EQ(daemon->channelCount(), 64u);
+  EXPECT_THAT(surroundings.log.errors(), ElementsAre("More than 64 channels; one refused"));
+}
+
 TEST_F(SimulatedDaemon, FaultNoAnswer) {
   make({"no-answer"});
   viewer.connect();

@@ -50,7 +50,10 @@ class FakeApplication {
                                {"SetTelvonExtraCodes", PlistArray::make(extraCodes)}}));
   }
   void startEverything() { ask(PlistDictionary::make({{"SetState", "Streaming"}})); }
+  // Closes its own port; what commands go over stays open.
   void leave() { port_.reset(); }
+  // The other way round.
+  void hangUp() { daemon_.reset(); }
 
   Bytes bytesReceived() const {
     Bytes all;

@@ -73,7 +73,7 @@ class FakeLink : public MessagePorts, public TelephonyDaemon {
     if (!opensLocalPorts) return nullptr;
     receive = std::move(handler);
     localValid = std::make_shared<bool>(true);
-    auto port = std::make_unique<FakePort<LocalPort>>(localValid);
+    auto port = std::make_unique<Local>(localValid);
     localPort = port.get();
     return port;
   }
@@ -104,6 +104,11 @@ class FakeLink : public MessagePorts, public TelephonyDaemon {
       return link.answer;
     }
     FakeLink& link;
+  };
+
+  struct Local : FakePort<LocalPort> {
+    using FakePort::FakePort;
+    void setDesertionHandler(DesertionHandler) override {}
   };
 
   struct Remote : FakePort<RemotePort> {

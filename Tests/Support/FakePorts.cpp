@@ -19,6 +19,9 @@ class FakePorts::Local : public LocalPort {
     if (close() && handler_) std::exchange(handler_, {})();
   }
   void setInvalidationHandler(InvalidationHandler handler) override { handler_ = std::move(handler); }
+  void setDesertionHandler(DesertionHandler handler) override {
+    ports_.listeners_.at(name_)->onDesertion = std::move(handler);
+  }
 
  private:
   bool close() {
@@ -35,9 +38,11 @@ class FakePorts::Local : public LocalPort {
 class FakePorts::Remote : public RemotePort {
  public:
   Remote(FakePorts& ports, const std::shared_ptr<Listener>& listener) : ports_(ports), listener_(listener) {}
+  ~Remote() override { hangUp(); }
 
   bool isValid() const override { return isOpen_ && !listener_.expired(); }
   void invalidate() override {
+    hangUp();
     if (std::exchange(isOpen_, false) && handler_) std::exchange(handler_, {})();
   }
   void setInvalidationHandler(InvalidationHandler handler) override { handler_ = std::move(handler); }
@@ -46,6 +51,7 @@ class FakePorts::Remote : public RemotePort {
                          std::chrono::milliseconds, Reply reply) override {
     const auto listener = listener_.lock();
     if (!isOpen_ || !listener) return {SendStatus::invalid, std::nullopt};
+    speak(*listener);
     if (listener->isStalled)
       return {reply == Reply::awaited ? SendStatus::receiveTimeout : SendStatus::success, std::nullopt};
     auto answer = listener->handler(id, data);
@@ -56,15 +62,24 @@ class FakePorts::Remote : public RemotePort {
   bool sendNow(MessageId id, std::span<const std::uint8_t> data) override {
     const auto listener = listener_.lock();
     if (!isOpen_ || !listener || listener->waiting.size() >= ports_.backlog) return false;
+    speak(*listener);
     listener->waiting.emplace_back(id, Bytes(data.begin(), data.end()));
     ports_.deliverLater(listener);
     return true;
   }
 
  private:
+  void speak(Listener& listener) {
+    if (!std::exchange(hasSpoken_, true)) ++listener.senders;
+  }
+  void hangUp() {
+    if (std::exchange(hasSpoken_, false)) ports_.removeSender(listener_);
+  }
+
   FakePorts& ports_;
   std::weak_ptr<Listener> listener_;
   bool isOpen_ = true;
+  bool hasSpoken_ = false;
   InvalidationHandler handler_;
 };
 
@@ -128,6 +143,15 @@ void FakePorts::resume(const std::string& name) {
   const auto& listener = listeners_.at(name);
   listener->isStalled = false;
   for (std::size_t count = listener->waiting.size(); count > 0; --count) deliverLater(listener);
+}
+
+void FakePorts::removeSender(const std::weak_ptr<Listener>& listener) {
+  queue_.post([listener] {
+    const auto from = listener.lock();
+    if (!from || --from->senders > 0) return;
+    const auto handler = from->onDesertion;
+    if (handler) handler();
+  });
 }
 
 void FakePorts::deliverLater(const std::shared_ptr<Listener>& listener) {

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Message ports and a daemon's server in memory: both sides of a log channel in one process, deterministic.
-// Messages sent without waiting arrive when the main queue runs; requests are handed over at once.
+// Messages sent without waiting arrive when the main queue runs, as does the news that a sender has gone;
+// requests are handed over at once.
 #pragma once
 
 #include <deque>
@@ -37,6 +38,8 @@ class FakePorts : public MessagePorts, public TelephonyDaemon, public DaemonServ
  private:
   struct Listener {
     LocalPort::ReceiveHandler handler;
+    LocalPort::DesertionHandler onDesertion = {};
+    int senders = 0;
     std::deque<std::pair<MessageId, Bytes>> waiting;
     bool isStalled = false;
   };
@@ -45,6 +48,7 @@ class FakePorts : public MessagePorts, public TelephonyDaemon, public DaemonServ
   class Connection;
   class Server;
 
+  void removeSender(const std::weak_ptr<Listener>& listener);
   void deliverLater(const std::shared_ptr<Listener>& listener);
 
   FakeMainQueue& queue_;

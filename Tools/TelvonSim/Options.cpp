@@ -81,7 +81,9 @@ void declareOptions(CommandLine& commandLine, SimulatorOptions& options) {
       ->type_name("CAPTURE")
       ->excludes(scenario);
   app.add_flag("--loop", options.isLooping, "begin the capture again when it has ended")->needs("--replay");
-  app.add_flag("--leave", options.leavesAtEnd, "end when the capture has been played")->needs("--replay");
+  app.add_flag("--leave", options.leavesAtEnd,
+               "end when the capture has been played, or the last application has left")
+      ->needs("--replay");
   app.add_option("--speed", options.speed.factor,
                  "world seconds per second; \"max\" or 0 is as fast as the applications take it")
       ->type_name("X")

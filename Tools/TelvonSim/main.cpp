@@ -12,6 +12,7 @@
 #include "Platform/Qt/QtMainQueue.h"
 #include "Platform/Qt/QtMessagePorts.h"
 #include "Platform/Qt/RuntimeDirectory.h"
+#include "Platform/RateLimitedLog.h"
 #include "Simulator/Simulation.h"
 #include "Telvon/TechnologyName.h"
 #include "Tools/CommandLine.h"
@@ -39,6 +40,12 @@ sim::SimulationHandlers handlersFor(QtEventLoop& loop, const SimulatorOptions& o
               [&loop, leaves = options.leavesAtEnd] {
                 complain("the capture has been played");
                 if (leaves) loop.quit();
+              },
+          .lastApplicationLeft =
+              [&loop, leaves = options.leavesAtEnd] {
+                if (!leaves) return;
+                complain("the last application has left");
+                loop.quit();
               }};
 }
 
@@ -49,8 +56,9 @@ int serve(const SimulatorOptions& options) {
   const LibplistSerialiser plists;
   const PosixClock clock;
   QtMainQueue queue;
-  QtMessagePorts ports(log);
-  QtDaemonServerHost host(log);
+  RateLimitedLog peerLog(log, queue);
+  QtMessagePorts ports(peerLog);
+  QtDaemonServerHost host(peerLog);
 
   SourceResult made = makeSource(options, plists);
   if (!made.source) {
@@ -59,7 +67,7 @@ int serve(const SimulatorOptions& options) {
   }
   const auto directory = RuntimeDirectory::open(log);
   if (!directory) return 1;
-  sim::Simulation simulation({.daemon = {log, ports, plists}, .queue = queue, .clock = clock},
+  sim::Simulation simulation({.daemon = {peerLog, ports, plists}, .queue = queue, .clock = clock},
                              options.technology, options.faults, std::move(made.source), options.speed,
                              handlersFor(loop, options));
   if (!simulation.serve(host)) {

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The receiving end of a message port.
+#include <array>
+#include <atomic>
 #include <csignal>
+#include <thread>
 
 #include "Platform/Qt/Frame.h"
 #include "Tests/Platform/Qt/PortTest.h"
@@ -54,6 +57,14 @@ TEST_F(LocalPortTest, SendsRepliesUnderTheRequestsToken) {
                        0, 0, 0, 0, 1, 4, 0, 0, 0, 0, 0, 0, 9,    0,    0,    0,                         //
                        0, 0, 0, 0, 1, 3, 0, 0, 0, 0, 0, 0, 10,   0,    0,    0};
   EXPECT_EQ(bytes, expected);
+}
+
+TEST_F(LocalPortTest, RepliesUnderToken0Too) {
+  RawSocket peer = connect();
+  peer.write(frame(2, 7, 0, bytesOf("what")));
+  EXPECT_TRUE(runUntilReceived(1));
+  runWhatIsDue();
+  EXPECT_EQ(peer.read(20), frame(3, 0, 0, bytesOf("what")));
 }
 
 TEST_F(LocalPortTest, TakesFramesThatComeByteByByte) {
@@ -186,6 +197,95 @@ TEST_F(LocalPortTest, ClosesConnectionsAboveTheLimit) {
   EXPECT_THAT(log.errors(), ElementsAre("port: more than 64 connections; connection closed"));
   peers.front().write(frame(1, 0, 0, bytesOf("still served")));
   EXPECT_TRUE(runUntilReceived(1));
+}
+
+// Four connections that hold 16 MiB each of frames which want one byte more.
+class UnfinishedFrames : public LocalPortTest {
+ protected:
+  UnfinishedFrames() {
+    Bytes unfinished = header(maximumFrameData, 1, 0, 0);
+    unfinished.resize(maximumFrameData);
+    for (RawSocket& holder : holders) EXPECT_TRUE(sendWhileTheLoopRuns(holder, unfinished));
+  }
+  bool sendWhileTheLoopRuns(RawSocket& peer, const Bytes& bytes) {
+    std::atomic<bool> isDone = false;
+    std::thread sender([&] { isDone = peer.write(bytes) || true; });
+    const bool isSent = runUntil([&] { return isDone && peer.isTaken(); });
+    sender.join();
+    return isSent;
+  }
+
+  std::array<RawSocket, 4> holders{connect(), connect(), connect(), connect()};
+};
+
+TEST_F(UnfinishedFrames, OfAllConnectionsMayHoldAsMuchAsTheLimit) {
+  runWhatIsDue();
+  EXPECT_THAT(log.errors(), testing::IsEmpty());
+  const Bytes rest(frameHeaderSize, 'x');
+  for (RawSocket& holder : holders) EXPECT_TRUE(sendWhileTheLoopRuns(holder, rest));
+  EXPECT_TRUE(runUntilReceived(4));
+}
+
+TEST_F(UnfinishedFrames, CloseTheWorstConnectionWithTheFirstByteMore) {
+  EXPECT_TRUE(holders[2].write({'x'}));
+  EXPECT_TRUE(runUntil([this] { return !log.errors().empty(); }));
+  runWhatIsDue();
+  EXPECT_THAT(log.errors(),
+              ElementsAre("port: all connections hold more than 64 MiB, this one most; connection closed"));
+  EXPECT_EQ(holders[2].read(1).size(), 0u);
+  RawSocket bystander = connect();
+  EXPECT_TRUE(bystander.write(frame(1, 0, 0, bytesOf("quick"))));
+  EXPECT_TRUE(runUntilReceived(1));
+  EXPECT_THAT(received, ElementsAre("0:quick"));
+}
+
+class Desertion : public LocalPortTest {
+ protected:
+  Desertion() {
+    port->setDesertionHandler([this] { ++desertions; });
+  }
+  int desertions = 0;
+};
+
+TEST_F(Desertion, IsToldWhenTheLastWhoHadSentSomethingCloses) {
+  RawSocket first = connect();
+  RawSocket second = connect();
+  first.write(frame(1, 0, 0, bytesOf("one")));
+  second.write(frame(2, 0, 9, bytesOf("two")));
+  EXPECT_TRUE(runUntilReceived(2));
+  first.close();
+  runWhatIsDue();
+  EXPECT_EQ(desertions, 0);
+  second.close();
+  EXPECT_TRUE(runUntil([this] { return desertions > 0; }));
+  EXPECT_EQ(desertions, 1);
+}
+
+TEST_F(Desertion, IsNotToldOfThoseWhoSaidNothing) {
+  RawSocket speaker = connect();
+  speaker.write(frame(1, 0, 0, bytesOf("one")));
+  EXPECT_TRUE(runUntilReceived(1));
+  connect().close();
+  runWhatIsDue();
+  EXPECT_EQ(desertions, 0);
+}
+
+TEST_F(Desertion, IsToldAfterAFaultToo) {
+  RawSocket peer = connect();
+  peer.write(frame(1, 0, 0, bytesOf("one")));
+  peer.write(header(0, 9, 0, 0));
+  EXPECT_TRUE(runUntil([this] { return desertions > 0; }));
+}
+
+TEST_F(Desertion, MayDestroyThePort) {
+  port->setDesertionHandler([this] { port.reset(); });
+  RawSocket silent = connect();
+  RawSocket peer = connect();
+  peer.write(frame(1, 0, 0, bytesOf("one")));
+  EXPECT_TRUE(runUntilReceived(1));
+  peer.close();
+  EXPECT_TRUE(runUntil([this] { return !port; }));
+  EXPECT_EQ(silent.read(1).size(), 0u);
 }
 
 TEST_F(LocalPortTest, MayBeDestroyedByItsReceiveHandler) {

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tests/Platform/Qt/RawSocket.h"
 
+#include <linux/sockios.h>
+#include <sys/ioctl.h>
 #include <sys/socket.h>
 #include <sys/un.h>
 
@@ -66,6 +68,12 @@ Bytes RawSocket::readToEnd() {
     if (some.empty()) return all;
     all.insert(all.end(), some.begin(), some.end());
   }
+}
+
+bool RawSocket::isTaken() const {
+  int unread = 0;
+  check(::ioctl(socket_.number(), SIOCOUTQ, &unread) == 0, "ioctl");
+  return unread == 0;
 }
 
 RawListener::RawListener(const std::string& path, int queue) : socket_(makeSocket()) {

@@ -22,6 +22,8 @@ class RawSocket {
   Bytes read(std::size_t count);
   // Everything until the peer closes.
   Bytes readToEnd();
+  // Whether the peer has read all that was written.
+  bool isTaken() const;
   void close() { socket_.close(); }
 
  private:
