@@ -151,6 +151,19 @@ TEST(BinaryReader, CountsSharedBytesAsOftenAsTheyAreShared) {
   EXPECT_FALSE(reads(repeated(65, megabyte)));
 }
 
+TEST(BinaryReader, BoundsTheBytesOfAllTextsAndDataToTheByte) {
+  Bytes megabyte{0x4f, 0x12, 0, 0x10, 0, 0};
+  megabyte.resize(megabyte.size() + (std::size_t{1} << 20));
+  Bytes array{0xaf, 0x10, 65};
+  for (int place = 0; place < 64; ++place) array.insert(array.end(), {0, 1});
+  array.insert(array.end(), {0, 2});
+  const auto document = [&](const Bytes& last) {
+    return BinaryDocument().add(array).add(megabyte).add(last).bytes();
+  };
+  EXPECT_TRUE(reads(document({0x40})));
+  EXPECT_FALSE(reads(document({0x41, 0})));
+}
+
 TEST(BinaryReader, BoundsTheEntriesOfADictionary) {
   const auto document = [](std::size_t entries) {
     return BinaryDocument().add(dictionaryOf(entries, 1)).addText("a").bytes();

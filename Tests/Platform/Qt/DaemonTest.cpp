@@ -178,6 +178,52 @@ TEST_F(DaemonTest, ClosesApplicationsThatAskNonsense) {
   }
 }
 
+TEST_F(DaemonTest, TakesPortNamesOf255Bytes) {
+  std::string asked;
+  auto server = host.serve([&](std::string_view name) {
+    asked = name;
+    return LogChannelAnswer{};
+  });
+  RawSocket peer = RawSocket::connectTo(directory + "/telvon");
+  peer.write(frame(5, 0, 1, Bytes(255, 'n')));
+  EXPECT_TRUE(runUntil([&] { return !asked.empty(); }));
+  EXPECT_EQ(asked, std::string(255, 'n'));
+  Bytes answer(8 + 255);
+  std::fill(answer.begin() + 8, answer.end(), std::uint8_t{'p'});
+  server.reset();
+  EXPECT_EQ(answerToRaw(frame(6, 0, 1, answer)).portName, std::string(255, 'p'));
+}
+
+// A server whose bytes are typed, and an application that stays connected to it.
+class TypedNotifications : public DaemonTest {
+ protected:
+  RawListener listener{directory + "/telvon"};
+  std::unique_ptr<DaemonConnection> connection = connect();
+  RawSocket server = listener.accept();
+};
+
+TEST_F(TypedNotifications, MayHave4096Bytes) {
+  server.write(frame(7, 0, 0, Bytes(4096, 'n')));
+  EXPECT_TRUE(runUntil([this] { return !notifications.empty(); }));
+  EXPECT_THAT(notifications, ElementsAre(std::string(4096, 'n')));
+  server.write(frame(7, 0, 0, Bytes(4097, 'n')));
+  EXPECT_TRUE(runUntil([this] { return !log.errors().empty(); }));
+  EXPECT_THAT(log.errors(),
+              ElementsAre("telvon: frame of a kind or size that has no place here; connection closed"));
+  EXPECT_EQ(notifications.size(), 1u);
+}
+
+TEST_F(TypedNotifications, WaitUpTo64AtATime) {
+  for (const int count : {64, 65}) {
+    notifications.clear();
+    for (int number = 0; number < count; ++number) server.write(frame(7, 0, 0, {}));
+    server.write(frame(6, 0, count == 64 ? 1 : 2, Bytes(8)));
+    EXPECT_EQ(connection->createNetworkMonitorLogChannel("port").error.code, 0);
+    runWhatIsDue();
+    EXPECT_EQ(notifications.size(), 64u);
+  }
+}
+
 TEST_F(DaemonTest, RefusesToBeTheSecond) {
   const auto first = host.serve([](std::string_view) { return std::nullopt; });
   ASSERT_NE(first, nullptr);
@@ -198,6 +244,7 @@ TEST_F(DaemonTest, TakesThePlaceOfADeadOneAndTidiesUp) {
   const auto successor = host.serve([](std::string_view) { return std::nullopt; });
   EXPECT_NE(successor, nullptr);
   EXPECT_FALSE(std::filesystem::exists(directory + "/KelvasiApp.left"));
+  EXPECT_TRUE(std::filesystem::exists(directory + "/telvon"));  // its own
   EXPECT_TRUE(std::filesystem::exists(directory + "/note"));
 }
 
