@@ -57,6 +57,25 @@ TEST(DlfFile, HoldsTheZoneInMinutesTruncatedTowardZero) {
   }
 }
 
+// A zone that went over to summer time this year.
+struct ZoneThatChanged : test::FakeClock {
+  ZoneState localZone(PlistDate at) const override {
+    const bool isSummer = at.secondsSince1970 >= 1711846800;  // 2024-03-31 01:00:00 UTC
+    return {.secondsFromGmt = isSummer ? 7200 : 3600, .isDaylightSaving = isSummer};
+  }
+};
+
+TEST(DlfFile, HoldsTheZoneAsItIsAtItsCreation) {
+  test::TestPlatform surroundings;
+  ZoneThatChanged clock;
+  const Platform platform{surroundings.log, surroundings.trace, surroundings.plists, surroundings.resources,
+                          clock};
+  clock.time = PlistDate{1711846799};
+  EXPECT_EQ(part(*beginDlf(platform), 85, 4), hex("3C00 0000"));
+  clock.time = PlistDate{1711846800};
+  EXPECT_EQ(part(*beginDlf(platform), 85, 4), hex("7800 0100"));
+}
+
 TEST(DlfFile, SaysWhenTheHeaderFindsNoRoom) {
   test::TestPlatform surroundings;
   Bytes tooShort(160, 0xAA);

@@ -2,7 +2,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include "Model/KelvasiModel.h"
 #include "Tests/Support/HexBytes.h"
 #include "Tests/Support/ModelFixture.h"
 
@@ -10,8 +9,10 @@ namespace kelvasi {
 namespace {
 
 using namespace std::chrono_literals;
+using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::Not;
 
 class Session : public testing::Test, protected test::ModelFixture {
  protected:
@@ -220,6 +221,12 @@ TEST_F(Session, RetriesWhenTheStartCommandCannotBeSent) {
   EXPECT_TRUE(model.isConnected());
 }
 
+TEST_F(Session, TellsOfTheTimerOnceTheStartCommandIsSent) {
+  link.startStatus = SendStatus::sendTimeout;
+  model.startMonitor();
+  EXPECT_THAT(errors(), Not(Contains("Starting the display update timer")));
+}
+
 TEST_F(Session, DropsMessagesWithAnotherIdSilently) {
   model.startMonitor();
   surroundings.log.clear();
@@ -346,6 +353,33 @@ TEST_F(Session, RestartsWhenTheReceivePortIsInvalidatedFromOutside) {
   link.localPort->invalidate();
   EXPECT_EQ(link.localPortNames.size(), 2u);
   EXPECT_TRUE(model.isConnected());
+}
+
+TEST_F(Session, TearsTheReceivePortDownBeforeTheSendPort) {
+  model.startMonitor();
+  model.destroyPorts();
+  EXPECT_THAT(link.invalidated, ElementsAre("receive", "send"));
+}
+
+// A daemon that opens a channel to nobody.
+TEST_F(Session, WithoutAReceivePortATickTakesNoNoteOfTheDaemonsDeath) {
+  link.opensLocalPorts = false;
+  link.daemonRefusesNoName = false;
+  model.startMonitor();
+  EXPECT_FALSE(model.isConnected());
+  *link.remoteValid = false;
+  surroundings.log.clear();
+  queue.advance(20s);
+  EXPECT_EQ(link.localPortNames.size(), 1u);
+  EXPECT_THAT(errors(), IsEmpty());
+}
+
+TEST_F(Session, NamesTheSendPortBeforeTheReceivePort) {
+  ASSERT_TRUE(model.createPorts());
+  char line[100];
+  std::snprintf(line, sizeof line, " ***** Created ports (send=%p, recv=%p)",
+                static_cast<void*>(link.remotePort), static_cast<void*>(link.localPort));
+  EXPECT_EQ(surroundings.log.firstLine(), line);
 }
 
 TEST_F(Session, ItsOwnTearDownStartsNothingAgain) {

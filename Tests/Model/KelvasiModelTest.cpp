@@ -15,6 +15,11 @@ using test::record;
 class KelvasiModelTest : public testing::Test, protected test::ModelFixture {
  protected:
   void take(const Bytes& message) { link.receive(0, message); }
+  void loseTheGenerator() {
+    answerTechnology("kTelvonLogChannelTechnology_Unheard");
+    model.restartMonitor();
+    ASSERT_EQ(model.logGenerator(), nullptr);
+  }
   std::string stateShown() { return *model.nodeAtPath("/Process CO/MM State")->value(); }
 };
 
@@ -99,6 +104,23 @@ TEST_F(KelvasiModelTest, DataWithoutAGeneratorStillMarksTheModelUpdated) {
   EXPECT_EQ(updates, 1);
   EXPECT_EQ(model.topLevelNodes(), nullptr);
   EXPECT_EQ(model.nodeAtPath("/"), nullptr);
+}
+
+TEST_F(KelvasiModelTest, ATreeThatIsThereIsShownThoughThereIsNoGenerator) {
+  model.startMonitor();
+  const NodeRef tree = model.topLevelNodes();
+  loseTheGenerator();
+  EXPECT_NE(model.topLevelNodes(), nullptr);
+  EXPECT_EQ(model.topLevelNodes(), tree);
+}
+
+TEST_F(KelvasiModelTest, ATickWithDataDropsThePathsWithTheTree) {
+  model.startMonitor();
+  take(record(0x7131, "13", 16));
+  EXPECT_NE(model.nodeAtPath("/Process CO/MM State"), nullptr);
+  loseTheGenerator();
+  model.refresh();
+  EXPECT_EQ(model.nodeAtPath("/Process CO/MM State"), nullptr);
 }
 
 TEST_F(KelvasiModelTest, APathThatTheTreeDoesNotHoldGivesNothing) {

@@ -47,6 +47,7 @@ class FakeLink : public MessagePorts, public TelephonyDaemon {
   std::optional<std::string> identifier = "UUID";
   bool opensLocalPorts = true;
   bool daemonIsThere = true;
+  bool daemonRefusesNoName = true;
   LogChannelAnswer answer{.error = {}, .portName = "daemon's port"};
   bool remotePortIsThere = true;
   SendResult technologyResult{.status = SendStatus::success, .reply = std::nullopt};
@@ -62,6 +63,8 @@ class FakeLink : public MessagePorts, public TelephonyDaemon {
   std::shared_ptr<bool> localValid = std::make_shared<bool>(false);
   std::shared_ptr<bool> remoteValid = std::make_shared<bool>(false);
   MessagePort* localPort = nullptr;
+  MessagePort* remotePort = nullptr;
+  std::vector<std::string> invalidated;  // "receive" and "send", in the order in which they were told to
   LocalPort::ReceiveHandler receive;
   NotificationHandler notify;
   int openConnections = 0;
@@ -73,7 +76,7 @@ class FakeLink : public MessagePorts, public TelephonyDaemon {
     if (!opensLocalPorts) return nullptr;
     receive = std::move(handler);
     localValid = std::make_shared<bool>(true);
-    auto port = std::make_unique<Local>(localValid);
+    auto port = std::make_unique<Local>(*this);
     localPort = port.get();
     return port;
   }
@@ -83,7 +86,9 @@ class FakeLink : public MessagePorts, public TelephonyDaemon {
     connectionsAtRemotePort = openConnections;
     if (!remotePortIsThere) return nullptr;
     remoteValid = std::make_shared<bool>(true);
-    return std::make_unique<Remote>(*this);
+    auto port = std::make_unique<Remote>(*this);
+    remotePort = port.get();
+    return port;
   }
 
   std::optional<std::string> makeUniqueIdentifier() override { return identifier; }
@@ -100,19 +105,29 @@ class FakeLink : public MessagePorts, public TelephonyDaemon {
     ~Connection() override { --link.openConnections; }
     LogChannelAnswer createNetworkMonitorLogChannel(std::string_view name) override {
       link.channelPortNames.emplace_back(name);
-      if (name.empty()) return {.error = {.domain = 1, .code = 22}, .portName = std::nullopt};
+      if (name.empty() && link.daemonRefusesNoName)
+        return {.error = {.domain = 1, .code = 22}, .portName = std::nullopt};
       return link.answer;
     }
     FakeLink& link;
   };
 
   struct Local : FakePort<LocalPort> {
-    using FakePort::FakePort;
+    explicit Local(FakeLink& itsLink) : FakePort(itsLink.localValid), link(itsLink) {}
+    void invalidate() override {
+      link.invalidated.emplace_back("receive");
+      FakePort::invalidate();
+    }
     void setDesertionHandler(DesertionHandler) override {}
+    FakeLink& link;
   };
 
   struct Remote : FakePort<RemotePort> {
     explicit Remote(FakeLink& itsLink) : FakePort(itsLink.remoteValid), link(itsLink) {}
+    void invalidate() override {
+      link.invalidated.emplace_back("send");
+      FakePort::invalidate();
+    }
     SendResult sendRequest(MessageId id, std::span<const std::uint8_t> data,
                            std::chrono::milliseconds sendTimeout, std::chrono::milliseconds receiveTimeout,
                            Reply reply) override {
