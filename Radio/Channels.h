@@ -7,6 +7,7 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
 
 #include "Radio/Carrier.h"
 
@@ -30,6 +31,10 @@ Carriers utraTddCarriers(std::uint32_t uarfcn);
 // By E-ARFCN, which says itself whether it is the downlink's or the uplink's (3GPP TS 36.101, table 5.7.3-1).
 // Without band 54, bands from 106 up, and those for satellites.
 Carriers eutraCarriers(std::uint32_t earfcn);
+
+// The uplink's E-ARFCN that belongs to a downlink's; the same in TDD. None for another number, and in a band
+// for downlinks only.
+std::optional<std::uint32_t> eutraUplinkNumber(std::uint32_t earfcn);
 
 // By channel number, in all band classes or in one of them (3GPP2 C.S0057). Without the classes 11 and 16 and
 // up; class 7 to channel 240.

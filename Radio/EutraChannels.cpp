@@ -1,4 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+#include <algorithm>
+#include <array>
+
 #include "Radio/ChannelRange.h"
 #include "Radio/Channels.h"
 
@@ -90,6 +93,14 @@ constexpr std::array table{
 Carriers eutraCarriers(std::uint32_t earfcn) {
   const Carriers found = carriersIn(table, earfcn, &ChannelRange::downlink);
   return found.empty() ? carriersIn(table, earfcn, &ChannelRange::uplink) : found;
+}
+
+std::optional<std::uint32_t> eutraUplinkNumber(std::uint32_t earfcn) {
+  const auto range =
+      std::ranges::find_if(table, [earfcn](const ChannelRange& one) { return one.downlink.has(earfcn); });
+  if (range == table.end()) return std::nullopt;
+  const std::uint32_t number = range->uplink.first + (earfcn - range->downlink.first);
+  return range->uplink.has(number) ? std::optional(number) : std::nullopt;
 }
 
 }  // namespace kelvasi

@@ -5,8 +5,8 @@
 
 #include "LogGenerator/Daemon/CellRows.h"
 #include "LogGenerator/LogCode.h"
+#include "Radio/Channels.h"
 #include "Simulator/Daemon/PropertyListRecord.h"
-#include "Simulator/Radio/EutraBand.h"
 #include "Simulator/Radio/Reported.h"
 #include "Telvon/CellMonitor.h"
 
@@ -45,8 +45,8 @@ void setUtran(PlistDictionary& entry, const MeasuredCell& measured) {
 void setLte(PlistDictionary& entry, const MeasuredCell& measured) {
   set(entry, kTelvonCellMonitorUARFCN, measured.cell.frequency);
   set(entry, kTelvonCellMonitorPID, measured.cell.code);
-  if (const EutraBand* band = eutraBandOf(measured.cell.frequency))
-    set(entry, kTelvonCellMonitorBandInfo, band->number);
+  for (const Carrier& carrier : eutraCarriers(measured.cell.frequency))
+    set(entry, kTelvonCellMonitorBandInfo, carrier.band.number);
 }
 
 struct Kind {

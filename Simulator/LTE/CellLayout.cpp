@@ -3,9 +3,9 @@
 
 #include <map>
 
+#include "Radio/Channels.h"
 #include "Simulator/Handset/CellLayout.h"
 #include "Simulator/LTE/Layers.h"
-#include "Simulator/Radio/EutraBand.h"
 
 namespace kelvasi::sim::lte {
 
@@ -34,7 +34,7 @@ Cell lteCell(const Cell& neighbour, unsigned site, unsigned layer) {
   cell.locationArea.code = static_cast<std::uint16_t>(neighbour.locationArea.code + trackingAreaOffset);
   cell.id = ((firstENodeB + site) << 8) | (layer % layersOfNetwork + 1);
   cell.frequency = layers[layer].frequency;
-  cell.megahertz = downlinkMegahertz(cell.frequency);
+  cell.megahertz = eutraCarriers(cell.frequency)[0].downlink.megahertz();
   cell.code = identityOf(site, layer);
   cell.site = neighbour.site;
   return cell;

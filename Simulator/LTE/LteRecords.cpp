@@ -12,8 +12,8 @@
 #include "LogGenerator/LTE/ServingCell.h"
 #include "LogGenerator/LTE/ServingCellMeasurement.h"
 #include "LogGenerator/LTE/TransmitAntennas.h"
+#include "Radio/Channels.h"
 #include "Simulator/EntryWriter.h"
-#include "Simulator/Radio/EutraBand.h"
 #include "Simulator/Radio/Reported.h"
 
 namespace kelvasi::sim::lte {
@@ -128,12 +128,12 @@ std::optional<Bytes> servingCellRecord(const World& world) {
   return RecordWriter(servingCell::logCode, servingCell::layout, servingCell::minimumLength)
       .set("physical cell identity", cell.code)
       .set("downlink E-ARFCN", cell.frequency)
-      .set("uplink E-ARFCN", uplinkEarfcn(cell.frequency))
+      .set("uplink E-ARFCN", *eutraUplinkNumber(cell.frequency))
       .set("downlink bandwidth", blocks)
       .set("uplink bandwidth", blocks)
       .set("cell identity", cell.id)
       .set("tracking area code", cell.locationArea.code)
-      .set("frequency band indicator", eutraBandOf(cell.frequency)->number)
+      .set("frequency band indicator", eutraCarriers(cell.frequency)[0].band.number)
       .padTo(servingCell::minimumLength)
       .bytes();
 }

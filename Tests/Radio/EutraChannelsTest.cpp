@@ -103,6 +103,25 @@ TEST(EutraChannels, EveryUplinkNumberLiesWithinItsBand) {
   });
 }
 
+TEST(EutraChannels, TheUplinksNumberBelongsToTheSameCarrier) {
+  for (std::uint32_t number = 0; number < testing::sweepEnd; ++number) {
+    const auto uplink = eutraUplinkNumber(number);
+    if (!uplink) continue;
+    EXPECT_EQ(eutraCarriers(*uplink)[0], eutraCarriers(number)[0]) << number;
+  }
+}
+
+// 3GPP TS 36.101, table 5.7.3-1.
+TEST(EutraChannels, UplinkNumbersTypedByHand) {
+  using Pair = std::pair<std::uint32_t, std::uint32_t>;
+  for (const auto& [downlink, uplink] :
+       {Pair{0, 18000}, Pair{599, 18599}, Pair{1575, 19575}, Pair{3350, 21350}, Pair{6300, 24300},
+        Pair{9770, 27660}, Pair{37750, 37750}, Pair{39150, 39150}, Pair{66436, 131972}})
+    EXPECT_EQ(eutraUplinkNumber(downlink), uplink) << downlink;
+  for (const std::uint32_t number : {4950u, 9660u, 18000u, 67335u, 67336u, 0xFFFFFFFFu})
+    EXPECT_EQ(eutraUplinkNumber(number), std::nullopt) << number;
+}
+
 TEST(EutraChannels, ANumberMeansOneCarrierAtMost) {
   for (std::uint32_t earfcn = 0; earfcn < testing::sweepEnd; ++earfcn)
     ASSERT_LE(eutraCarriers(earfcn).size(), 1U) << earfcn;

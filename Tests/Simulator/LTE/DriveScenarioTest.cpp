@@ -6,10 +6,11 @@
 
 #include <algorithm>
 #include <cmath>
+#include <map>
 #include <set>
 #include <tuple>
 
-#include "Simulator/Radio/EutraBand.h"
+#include "Radio/Channels.h"
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/PlayedScenario.h"
 #include "Tests/Simulator/RivalWatch.h"
@@ -24,6 +25,15 @@ using testing::Contains;
 using testing::Each;
 using testing::IsSupersetOf;
 using testing::Not;
+
+// MHz by resource blocks (3GPP TS 36.101, table 5.6-1).
+const std::map<std::uint8_t, double> bandwidths{{6, 1.4}, {15, 3}, {25, 5}, {50, 10}, {75, 15}, {100, 20}};
+double bandwidthOf(std::uint8_t resourceBlocks) {
+  return bandwidths.at(resourceBlocks);
+}
+
+// The least bandwidth that a band has, MHz (table 5.6.1-1); all of them have 20 MHz.
+const std::map<std::uint16_t, double> leastBandwidths{{3, 1.4}, {7, 5}, {20, 5}};
 
 constexpr int manySteps = 9000;  // half an hour
 constexpr std::array seeds{1, 11, 2024};
@@ -117,12 +127,12 @@ void LteDrive::checkServingCell() {
     ASSERT_EQ(display->number(info, "Physical Cell ID"), cell.code);
     ASSERT_EQ(display->number(info, "Tracking Area Code"), cell.locationArea.code);
     ASSERT_EQ(display->number(info, "Cell Identity"), cell.id);
-    ASSERT_EQ(display->number(info, "Freq Band Indicator"), eutraBandOf(cell.frequency)->number);
+    ASSERT_EQ(display->number(info, "Freq Band Indicator"), eutraCarriers(cell.frequency)[0].band.number);
   }
   ASSERT_EQ(daemon.number(info, "UARFCN"), cell.frequency);
   ASSERT_EQ(baseband.number(info, "Download Frequency"), cell.frequency);
   ASSERT_EQ(baseband.number(info, "Upload Frequency"), cell.frequency + 18000);  // of all FDD bands
-  const double megahertz = megahertzOfBlocks(layerOf(cell).resourceBlocks);
+  const double megahertz = bandwidthOf(layerOf(cell).resourceBlocks);
   ASSERT_EQ(baseband.number(info, "Download Bandwidth"), megahertz);
   ASSERT_EQ(baseband.number(info, "Upload Bandwidth"), megahertz);
   ASSERT_EQ(baseband.number(info, "Num Tx Antennas"), layerOf(cell).antennas);
@@ -324,13 +334,14 @@ TEST(LteDriveSeed, TheSameSeedGivesTheSameMessages) {
 TEST(LteLayers, FitTheirBands) {
   for (const Layer& layer : layers) {
     if (layer.technology != Technology::lte) continue;
-    const EutraBand* band = eutraBandOf(layer.frequency);
-    ASSERT_TRUE(band) << layer.frequency;
-    EXPECT_TRUE(allowsBandwidth(*band, layer.resourceBlocks));
-    const double half = megahertzOfBlocks(layer.resourceBlocks) / 2;
-    const double top = band->downlinkMegahertz + (band->lastDownlink - band->firstDownlink + 1) * 0.1;
-    EXPECT_GE(downlinkMegahertz(layer.frequency) - half, band->downlinkMegahertz - 1e-6);
-    EXPECT_LE(downlinkMegahertz(layer.frequency) + half, top + 1e-6);
+    const Carriers carriers = eutraCarriers(layer.frequency);
+    ASSERT_FALSE(carriers.empty()) << layer.frequency;
+    const Band band = carriers[0].band;
+    const double bandwidth = bandwidthOf(layer.resourceBlocks);
+    EXPECT_GE(bandwidth, leastBandwidths.at(band.number));
+    const auto half = static_cast<std::uint32_t>(bandwidth / 0.1 / 2 + 0.5);  // in numbers
+    for (const std::uint32_t edge : {layer.frequency - half, layer.frequency + half - 1})
+      EXPECT_EQ(eutraCarriers(edge)[0].band, band) << layer.frequency;
   }
 }
 
