@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Platform/Plist/LibplistSerialiser.h"
 
+#include <algorithm>
 #include <memory>
 #include <string_view>
 
@@ -13,25 +14,31 @@ namespace kelvasi {
 
 namespace {
 
-// A peer may pad what it sends to a size that it likes.
-bool isPadding(char character) {
-  return std::string_view("\0 \t\r\n", 5).find(character) != std::string_view::npos;
+std::string_view textOf(std::span<const std::uint8_t> bytes) {
+  return {reinterpret_cast<const char*>(bytes.data()), bytes.size()};
 }
 
-// What ends a binary document may look like padding: it is the longest that will do.
-std::optional<PlistValue> readBinary(std::span<const std::uint8_t> document) {
-  while (true) {
-    if (auto value = readBinaryPlist(document)) return value;
-    if (document.empty() || !isPadding(static_cast<char>(document.back()))) return std::nullopt;
-    document = document.first(document.size() - 1);
+// A peer may pad what it sends to a size that it likes.
+std::string_view withoutPadding(std::string_view document) {
+  const std::size_t last = document.find_last_not_of(std::string_view("\0 \t\r\n", 5));
+  return document.substr(0, last == std::string_view::npos ? 0 : last + 1);
+}
+
+// What ends a document may look like padding, but for the sizes in its trailer, behind which stand 24 bytes:
+// it is the longest that will do.
+std::optional<PlistValue> readBinary(std::span<const std::uint8_t> bytes) {
+  constexpr std::size_t behindSizes = 24;
+  const std::size_t least = withoutPadding(textOf(bytes)).size();
+  for (std::size_t size = std::min(bytes.size(), least + behindSizes); size >= least; --size) {
+    if (auto value = readBinaryPlist(bytes.first(size))) return value;
   }
+  return std::nullopt;
 }
 
 std::optional<PlistValue> readXml(std::string_view document) {
   constexpr std::string_view byteOrderMark = "\xef\xbb\xbf";
   if (document.starts_with(byteOrderMark)) document.remove_prefix(byteOrderMark.size());
-  while (!document.empty() && isPadding(document.back())) document.remove_suffix(1);
-  return readXmlPlist(document);
+  return readXmlPlist(withoutPadding(document));
 }
 
 // A reader would take a bare carriage return for a line feed (XML 1.0, section 2.11).
@@ -52,7 +59,7 @@ Bytes withCarriageReturnsKept(std::string_view text) {
 }  // namespace
 
 std::optional<PlistValue> LibplistSerialiser::parse(std::span<const std::uint8_t> bytes) const {
-  const std::string_view document(reinterpret_cast<const char*>(bytes.data()), bytes.size());
+  const std::string_view document = textOf(bytes);
   return document.starts_with(binaryPlistMagic) ? readBinary(bytes) : readXml(document);
 }
 

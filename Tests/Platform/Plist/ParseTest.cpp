@@ -136,6 +136,20 @@ TEST(Parse, PaddingBehindABinaryDocumentIsForgiven) {
   }
 }
 
+// Nine objects, the first of them the top one, and a table at byte 32: all of the trailer looks like padding,
+// but for the sizes.
+TEST(Parse, PaddingIsToldFromATrailerThatLooksLikeIt) {
+  const std::string document = "bplist00\xa2\x01\x02\x09\x08"s + std::string(19, '\x09') +  // [true, false]
+                               "\x08\x0b\x0c\x0d\x0e\x0f\x10\x11\x12"s +  // where objects are
+                               "\0\0\0\0\0\0\x01\x01"s +                  // the sizes
+                               "\0\0\0\0\0\0\0\x09\0\0\0\0\0\0\0\0\0\0\0\0\0\0\0\x20"s;
+  for (const std::size_t count : {0u, 1u, 24u, 25u, 100'000u}) {
+    const auto value = parse(bytesOf(document + std::string(count, '\0')));
+    ASSERT_TRUE(value) << count;
+    EXPECT_EQ(canonical(*value), "[true,false,]") << count;
+  }
+}
+
 TEST(Parse, NothingElseBehindADocumentIsForgiven) {
   const std::string document = xmlPlist("<true/>");
   for (const std::string_view rest :
