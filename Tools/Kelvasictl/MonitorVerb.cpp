@@ -53,12 +53,7 @@ class MonitorVerb {
     std::unique_ptr<Timer> statusTimer;
     if (::isatty(STDERR_FILENO) == 1)
       statusTimer = session_.queue().repeat(200ms, [this] { status_.show(session_.model().isConnected()); });
-    try {
-      session_.run();
-    } catch (const ToolError&) {
-      status_.show(true);  // so that the error has a line of its own
-      throw;
-    }
+    session_.run();  // an error that ends it clears the status itself
     status_.show(true);
     if (const LogGenerator* generator = session_.model().logGenerator()) tally.add(generator->intake());
     return exitSuccess;
