@@ -76,11 +76,23 @@ class RowWriter {
   }
   Readings* readings() const { return place_.readings; }
 
-  // A row that holds a list, which is empty now, and its elements, each of them shown as `row` says.
-  void list(std::string_view key, const PlistValue::Array& list) {
-    if (mode_ == Rows::anew) next_ = rows_.rewriteText(key, std::string_view(), next_);
-    rows_.set(key, list);
+  // A row that holds a list, which is empty now, and its elements, each of them shown as `row` says. The
+  // array that stands where the row is expected is used again, as long as nobody else holds it.
+  PlistArray& list(std::string_view key) {
+    const auto* const standing =
+        next_ < rows_.size() ? &rows_.begin()[static_cast<std::ptrdiff_t>(next_)] : nullptr;
+    auto list = standing && standing->first == key ? standing->second.sharedArray() : nullptr;
+    constexpr long rowsAndOurs = 2;
+    if (list.use_count() == rowsAndOurs) {
+      list->removeAll();
+      ++next_;
+    } else {
+      list = PlistArray::make();
+      if (mode_ == Rows::anew) next_ = rows_.rewriteText(key, std::string_view(), next_);
+      rows_.set(key, list);
+    }
     if (place_.readings) place_.readings->add(place_.written(emptyList, 0, key));
+    return *list;
   }
   void element(PlistArray& list, const Row& row, std::int64_t raw) {
     ReadingPlace own = place_;

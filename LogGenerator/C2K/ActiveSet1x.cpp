@@ -38,19 +38,18 @@ struct EnergyScale {
 
 }  // namespace
 
-PilotList activeSet1x(RecordView subPacket, std::int64_t channel, bool isGathered) {
+void gatherActiveSet1x(RecordView subPacket, std::int64_t channel, PilotList& pilots) {
   const EnergyScale scale(subPacket);
   const std::int64_t count = valueOf(subPacket, fieldIn(activeSetLayout, "count"));
   const std::int64_t fingers = valueOf(subPacket, fieldIn(activeSetLayout, "fingers"));
   const std::int64_t reference = valueOf(subPacket, fieldIn(activeSetLayout, "reference PN offset"));
-  PilotList pilots(RadioFamily::cdma, isGathered);
+  pilots.begin(RadioFamily::cdma);
   for (std::size_t place = 0; place < static_cast<std::size_t>(count); ++place) {
     const RecordView pilot = subPacket.from(pilotStride(fingers) * place);
     const std::int64_t offset = valueOf(pilot, fieldIn(pilotLayout, "PN offset"));
     const double ratio = scale.decibels(pilot.u16(pilotEnergyAt(fingers)));
     pilots.add(place, offset, offset == reference ? referenceRow : pilotRow, rawOf(ratio), channel);
   }
-  return pilots;
 }
 
 CellIdentity referenceCell(RecordView subPacket, std::int64_t channel) {

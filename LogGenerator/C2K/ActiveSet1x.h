@@ -20,8 +20,8 @@ inline constexpr std::array activeSet1xRows{
         .scale = decibelScale},
 };
 
-// The list of the active-set sub-packet; without pilots it is empty, never "(none)". `channel` is theirs.
-PilotList activeSet1x(RecordView subPacket, std::int64_t channel, bool isGathered);
+// Makes `pilots` those of the active-set sub-packet. `channel` is theirs.
+void gatherActiveSet1x(RecordView subPacket, std::int64_t channel, PilotList& pilots);
 
 // The cell of the reference pilot; none without pilots.
 CellIdentity referenceCell(RecordView subPacket, std::int64_t channel);

@@ -89,7 +89,7 @@ void C2KLogGenerator::updateFromLog(std::span<const std::uint8_t> data, const Pl
     return count(framed->logCode, isKnownType ? Outcome::notAskedFor : Outcome::unknownLogType,
                  framed->record.bytes());
   const Outcome outcome =
-      record->parse({framed->record, state, lookup, platform().log, sections_, readings()});
+      record->parse({framed->record, state, lookup, platform().log, sections_, pilots_, readings()});
   count(framed->logCode, outcome, framed->record.bytes(), record->versionAt);
   appendRawMessage(framed->record.bytes());
 }

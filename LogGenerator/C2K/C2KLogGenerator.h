@@ -7,6 +7,7 @@
 #pragma once
 
 #include "LogGenerator/C2K/C2KSections.h"
+#include "LogGenerator/C2K/PilotList.h"
 #include "LogGenerator/OrvaneLogGenerator.h"
 #include "Platform/SystemLog.h"
 
@@ -44,6 +45,7 @@ class C2KLogGenerator : public OrvaneLogGenerator {
   PlistValue seen_;  // the display last looked at
   bool isOwn_ = false;
   C2KSections sections_;
+  PilotList pilots_;  // of the record at hand
 };
 
 }  // namespace kelvasi

@@ -12,15 +12,15 @@ void C2KUpdate::write(const Row& row, std::int64_t raw, const CellIdentity& cell
   });
 }
 
-void C2KUpdate::write(const Row& row, const PilotList& pilots) const {
+void C2KUpdate::writePilots(const Row& row) const {
   forEachLeaf(row.key, lookup, [&](PlistDictionary& display, const std::string& key) {
-    display.set(key, pilots.list());
+    const PlistDictionary& shown = pilots.showIn(display, key);
     if (!readings) return;
     const std::size_t before = readings->count();
-    for (Reading reading : pilots.readings()) {
+    pilots.forEachReading(shown, [&](Reading reading) {
       reading.list = key;
       gather(reading, display);
-    }
+    });
     readings->takeChannel(before, readings->servingCells().certain(pilots.family()));
   });
 }

@@ -25,23 +25,23 @@ struct C2KUpdate {
   const PlistDictionary& lookup;
   SystemLog& log;
   const C2KSections& sections;
+  PilotList& pilots;             // for the list of one record
   Readings* readings = nullptr;  // null: nobody listens
 
   // `row` lasts as long as the process.
   void write(const Row& row, std::int64_t raw, const CellIdentity& cell = {}) const;
-  // A list in place of a row; each pilot is on the channel of the cell that serves, where it is among them.
-  void write(const Row& row, const PilotList& pilots) const;
+  // The pilots in place of a row; each is on the channel of the cell that serves, where it is among them.
+  void writePilots(const Row& row) const;
   // Without pilots the row shows what stands in place of a value.
-  void writeOrNone(const Row& row, const PilotList& pilots) const {
+  void writePilotsOrNone(const Row& row) const {
     if (pilots.empty()) return write(row, noValue);
-    write(row, pilots);
+    writePilots(row);
   }
   // Into the extra information of the snapshot; nowhere before the display was built.
   void setExtraInfo(std::string_view key, PlistValue value) const {
     const PlistValue extraInfo = state.get("ExtraInfo");
     if (extraInfo.dictionary()) extraInfo.dictionary()->set(key, std::move(value));
   }
-  bool isGathered() const { return readings != nullptr; }
   unsigned length() const { return static_cast<unsigned>(record.size()); }
 
  private:

@@ -114,7 +114,8 @@ Outcome parseDeviceStatus(const C2KUpdate& update) {
   if (update.readings && serving) update.readings->servingCells().say(logCode, {.cell = serving});
   show(update, *state, stateLayout, stateRows);
   showRadio(update, *radio, isTraffic, serving);
-  update.write(activeSet1xRows.front(), activeSet1x(*activeSet, channel, update.isGathered()));
+  gatherActiveSet1x(*activeSet, channel, update.pilots);
+  update.writePilots(activeSet1xRows.front());  // without pilots an empty list, never "(none)"
   if (!isTraffic) showOldErrorRate(update);
   return Outcome::shown;
 }

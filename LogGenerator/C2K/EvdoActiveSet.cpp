@@ -2,7 +2,6 @@
 #include "LogGenerator/C2K/EvdoActiveSet.h"
 
 #include "LogGenerator/C2K/C2KRecords.h"
-#include "LogGenerator/C2K/PilotList.h"
 #include "LogGenerator/C2K/ValueTexts.h"
 
 namespace kelvasi {
@@ -35,13 +34,13 @@ Outcome parseEvdoActiveSet(const C2KUpdate& update) {
                      update.length(), static_cast<int>(count));
     return Outcome::tooShort;
   }
-  PilotList pilots(RadioFamily::evdo, update.isGathered());
+  update.pilots.begin(RadioFamily::evdo);
   for (std::size_t place = 0; place < count; ++place) {
     const RecordView pilot = update.record.from(firstPilot + pilotSize * place);
-    pilots.add(place, valueOf(pilot, fieldIn(pilotLayout, "PN offset")), pilotRow,
-               rawOf(pilot, pilotLayout, pilotRow));
+    update.pilots.add(place, valueOf(pilot, fieldIn(pilotLayout, "PN offset")), pilotRow,
+                      rawOf(pilot, pilotLayout, pilotRow));
   }
-  update.writeOrNone(pilotRow, pilots);
+  update.writePilotsOrNone(pilotRow);
   return Outcome::shown;
 }
 

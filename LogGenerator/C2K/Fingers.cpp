@@ -3,7 +3,6 @@
 
 #include "LogGenerator/C2K/C2KRecords.h"
 #include "LogGenerator/C2K/NoPilot.h"
-#include "LogGenerator/C2K/PilotList.h"
 #include "LogGenerator/C2K/ValueTexts.h"
 
 namespace kelvasi {
@@ -37,14 +36,14 @@ Outcome parseFingers(const C2KUpdate& update) {
                      update.length(), static_cast<int>(count), static_cast<unsigned long>(minimumLength));
     return Outcome::notUnderstood;
   }
-  PilotList pilots(RadioFamily::cdma, update.isGathered());
+  update.pilots.begin(RadioFamily::cdma);
   for (std::size_t place = 0; place < count; ++place) {
     const RecordView finger = update.record.from(firstFinger + fingerSize * place);
     const std::int64_t pilot = valueOf(finger, fieldIn(fingerLayout, "PN offset"));
     if (pilot == noPilot) continue;
-    pilots.add(place, pilot, fingerRow, rawOf(finger, fingerLayout, fingerRow));
+    update.pilots.add(place, pilot, fingerRow, rawOf(finger, fingerLayout, fingerRow));
   }
-  update.writeOrNone(fingerRow, pilots);
+  update.writePilotsOrNone(fingerRow);
   return Outcome::shown;
 }
 

@@ -41,12 +41,11 @@ CCTRCHSIRMeasurement::CCTRCHSIRMeasurement(const Platform& platform) : ListDecod
 
 void CCTRCHSIRMeasurement::addEntry(RecordView record, std::size_t place) {
   const RecordView channel = entry(record, place);
-  const auto ratios = PlistArray::make();
   RowWriter row = addRows();
   show(channel, compositeLayout, rows, row);
-  row.list(ratioRows.front().key, ratios);
+  PlistArray& ratios = row.list(ratioRows.front().key);
   for (std::size_t timeslot = 0; timeslot < channelMeasurement::timeslots; ++timeslot)
-    row.element(*ratios, ratioRows.front(), channelMeasurement::ratioOf(channel, timeslot));
+    row.element(ratios, ratioRows.front(), channelMeasurement::ratioOf(channel, timeslot));
 }
 
 }  // namespace kelvasi

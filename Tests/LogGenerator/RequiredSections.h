@@ -23,7 +23,7 @@ struct RequiredLength {
 };
 
 // To be specialised for each class index: its technology, its template's name, its sections and the least
-// lengths of its records, and the codes whose records show nothing by themselves, or allocate each time.
+// lengths of its records, and the codes whose records show nothing by themselves.
 template <typename Index>
 struct Required;
 

@@ -106,7 +106,7 @@ TEST(RowWriter, WritingAnewTakesNoOrderFromBefore) {
     RowWriter writer(rows, {}, Rows::anew);
     writer.write(rowA, 1);
     writer.write(rowC, 4);
-    writer.list("b", PlistArray::make());
+    writer.list("b");
     writer.write(rowD, 5);
   }
   EXPECT_EQ(test::asText(std::make_shared<PlistDictionary>(rows)), "a=1\nc=4\nb=\nd=5\n");

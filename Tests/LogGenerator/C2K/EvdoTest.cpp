@@ -120,6 +120,15 @@ TEST(EvdoActiveSet, ShowsEachPilotByPlaceAndOffset) {
   EXPECT_EQ(fixture.text("kActiveSetPilots"), "_sorted=_sorted\n0;300=+0.00 dB\n1;12=-3.01 dB\n");
 }
 
+TEST(EvdoActiveSet, AListThatSomebodyHoldsStaysAsItIs) {
+  C2KFixture fixture({"kActiveSetPilots"});
+  fixture.take(record(0x12B6, "0000 01 00000000 0000000000 2C01 0002", 37));
+  const PlistValue held = fixture.shown("kActiveSetPilots");
+  fixture.take(record(0x12B6, "0000 01 00000000 0000000000 0C00 0001", 37));
+  EXPECT_EQ(test::asText(held), "_sorted=_sorted\n0;300=+0.00 dB\n");
+  EXPECT_EQ(fixture.text("kActiveSetPilots"), "_sorted=_sorted\n0;12=-3.01 dB\n");
+}
+
 TEST(EvdoActiveSet, WithoutPilotsShowsNone) {
   C2KFixture fixture({"kActiveSetPilots"});
   fixture.take(record(0x12B6, "", 25));

@@ -49,8 +49,6 @@ struct Required<Orvane_GSMClassIndex> {
 
   // Kept for the next measurements.
   static inline const std::vector<LogCode> showNothing{0x51FF};
-
-  static inline const std::vector<LogCode> allocate{};
 };
 
 }  // namespace kelvasi::test

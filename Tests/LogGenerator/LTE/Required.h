@@ -32,8 +32,6 @@ struct Required<LTEClassIndex> {
                                                           {0xB17F, 33}, {0xB180, 21}, {0xB186, 21}};
 
   static inline const std::vector<LogCode> showNothing{};
-
-  static inline const std::vector<LogCode> allocate{};
 };
 
 }  // namespace kelvasi::test

@@ -64,6 +64,15 @@ TEST(CCTRCHSIRMeasurement, ShowsEachCompositeChannelWithItsSixTimeslots) {
   EXPECT_EQ(section.text(), "[CCTRCH ID=3\nTSNUM=4\nSIR=[10][20][30][40][50][255]\n]");
 }
 
+TEST(CCTRCHSIRMeasurement, RatiosThatSomebodyHoldsStayAsTheyAre) {
+  auto section = Sir::list();
+  section.take(typical());
+  const PlistValue held = section.section.array()->at(0).dictionary()->get("SIR");
+  section.take(channels("00 0010 00", 289, "03 04 01 02 03 04 05 06"));
+  EXPECT_EQ(test::asText(held), "[10][20][30][40][50][255]");
+  EXPECT_EQ(section.text(), "[CCTRCH ID=3\nTSNUM=4\nSIR=[1][2][3][4][5][6]\n]");
+}
+
 TEST(CCTRCHSIRMeasurement, BeginsAtByte289WithoutTransportChannels) {
   auto section = Sir::list();
   section.take(channels("00 0020 00", 289, "01 02 03 04 05 06 07 08  09 0A 0B 0C 0D 0E 0F 10"));

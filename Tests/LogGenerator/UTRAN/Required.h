@@ -29,9 +29,6 @@ struct Required<UTRANClassIndex> {
 
   // Its section stays empty.
   static inline const std::vector<LogCode> showNothing{0xD00E};
-
-  // The list in each of its entries is made anew.
-  static inline const std::vector<LogCode> allocate{0xD00C};
 };
 
 }  // namespace kelvasi::test
