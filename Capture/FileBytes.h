@@ -5,7 +5,7 @@
 #include <string>
 
 #include "Capture/ByteSource.h"
-#include "Platform/Posix/FileDescriptor.h"
+#include "Platform/Posix/InputFile.h"
 
 namespace kelvasi {
 
@@ -16,13 +16,11 @@ class FileBytes : public ByteSource {
 
   std::ptrdiff_t read(std::span<std::uint8_t> block) override;
 
-  const std::string& name() const { return name_; }
-  std::uint64_t position() const { return position_; }
+  const std::string& name() const { return file_.name(); }
+  std::uint64_t position() const { return file_.position(); }
 
  private:
-  std::string name_;
-  FileDescriptor file_;
-  std::uint64_t position_ = 0;
+  InputFile file_;
 };
 
 }  // namespace kelvasi

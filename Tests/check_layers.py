@@ -18,6 +18,11 @@ HOUSE = ["Plist", "Platform", "Radio", "Telvon", "Dlf", "LogGenerator", "Model",
 TECHNOLOGIES = {"GSM", "LTE", "UTRAN", "C2K", "ObjectStream"}
 MIRRORS = ["Tests", "Bench"]
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
+# What opens a descriptor, by the header that declares it and by name.
+OPENING_HEADERS = {"fcntl.h", "fstream", "sys/socket.h", "sys/eventfd.h", "sys/signalfd.h", "sys/timerfd.h", "sys/epoll.h",
+                   "sys/inotify.h", "QFile", "QSaveFile", "QTemporaryFile", "QLocalSocket", "QLocalServer"}
+OPENING = re.compile(r"\b(fopen|fdopen|freopen|tmpfile|mko?stemp|openat2?|popen|pipe2?|dup[23]?|opendir|gzd?open|"
+                     r"pcap_(?:open_(?:offline|live)|create|dump_open)\w*)\s*\(")
 LICENCE = "SPDX-License-Identifier: Apache-2.0"
 STANDARD = re.compile(r"^[a-z_]+$")  # <vector>, <cstdint>; neither <syslog.h> nor <QTimer>
 
@@ -52,6 +57,18 @@ def faults_of_direction(path: pathlib.Path):
                 yield f'{place}: "{name}" stands above {path.parts[0]}/'
         elif not may_use_libraries(path):
             yield f'{place}: "{name}" is not written from the root'
+
+
+def faults_of_opening(path: pathlib.Path):
+    if path.parts[0] not in ("Capture", "Tools"):
+        return
+    for place, _, name in includes(path):
+        if name in OPENING_HEADERS:
+            yield f"{place}: <{name}> opens descriptors, which is the platform's to do"
+    for number, line in enumerate((ROOT / path).read_text().splitlines(), start=1):
+        match = OPENING.search(line)
+        if match:
+            yield f"{path}:{number}: {match[1]}() opens a descriptor, which is the platform's to do"
 
 
 # What several technologies need lies in a room of its own, as Daemon/ does.
@@ -109,7 +126,7 @@ def sources(folders):
 
 def main() -> int:
     house = list(sources(HOUSE))
-    found = [fault for path in house for fault in faults_of_direction(path)]
+    found = [fault for path in house for check in (faults_of_direction, faults_of_opening) for fault in check(path)]
     for path in [*house, *sources(MIRRORS)]:
         found += [*faults_of_technology(path), *faults_of_licence(path)]
     found += faults_of_circle([*house, *sources(MIRRORS)])

@@ -1,12 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasi/Script.h"
 
-#include <fcntl.h>
-#include <unistd.h>
-
 #include <QCoreApplication>
 #include <array>
-#include <cerrno>
 #include <chrono>
 #include <cstdio>
 #include <system_error>
@@ -26,24 +22,19 @@ constexpr auto patience = 60s;  // for one command
 
 Script::Script(const std::string& path) {
   if (path.empty()) return;
-  file_ = path == "-" ? ::dup(STDIN_FILENO) : ::open(path.c_str(), O_RDONLY | O_CLOEXEC);
-  if (file_ < 0) throw std::system_error(errno, std::generic_category(), path);
-  more_ = std::make_unique<QSocketNotifier>(file_, QSocketNotifier::Read);
+  file_.emplace(path);
+  if (file_->error()) throw std::system_error(file_->error(), path);
+  more_ = std::make_unique<QSocketNotifier>(file_->descriptor(), QSocketNotifier::Read);
   QObject::connect(more_.get(), &QSocketNotifier::activated, [this] { readMore(); });
   QObject::connect(&turn_, &QTimer::timeout, [this] { advance(); });
   turn_.start(turnTime);
 }
 
-Script::~Script() {
-  more_.reset();
-  if (file_ >= 0) ::close(file_);
-}
-
 void Script::readMore() {
-  std::array<char, 4096> buffer;
-  const ssize_t count = ::read(file_, buffer.data(), buffer.size());
+  std::array<std::uint8_t, 4096> buffer;
+  const std::ptrdiff_t count = file_->read(buffer);
   if (count > 0) {
-    unread_.append(buffer.data(), count);
+    unread_.append(reinterpret_cast<const char*>(buffer.data()), count);
   } else {
     isAtEnd_ = true;
     more_->setEnabled(false);

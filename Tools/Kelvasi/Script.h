@@ -7,8 +7,10 @@
 #include <QSocketNotifier>
 #include <QTimer>
 #include <memory>
+#include <optional>
 #include <string>
 
+#include "Platform/Posix/InputFile.h"
 #include "Tools/Kelvasi/ScriptCommands.h"
 
 namespace kelvasi {
@@ -19,9 +21,6 @@ class Script {
   // loop ends when the script has ended or a command failed. Throws std::system_error when the file cannot be
   // opened.
   explicit Script(const std::string& path);
-  ~Script();
-  Script(const Script&) = delete;
-  Script& operator=(const Script&) = delete;
 
   // Whether a command failed; which, the standard error was told.
   bool hasFailed() const { return hasFailed_; }
@@ -34,7 +33,7 @@ class Script {
   void fail(const std::string& why);
   void end();
 
-  int file_ = -1;
+  std::optional<InputFile> file_;
   std::unique_ptr<QSocketNotifier> more_;
   QByteArray unread_;
   bool isAtEnd_ = false;

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/Spool.h"
 
-#include <array>
 #include <cerrno>
 #include <system_error>
 
@@ -23,21 +22,14 @@ void Spool::add(std::string_view text) {
 }
 
 void Spool::moveToFile() {
-  if (!file_) file_.reset(std::tmpfile());
-  if (!file_ || std::fwrite(text_.data(), 1, text_.size(), file_.get()) != text_.size()) fail();
+  if (!file_) file_.emplace();
+  if (!file_->append(text_)) fail();
   text_.clear();
 }
 
 void Spool::giveTo(const std::function<void(std::string_view text)>& print) {
-  if (file_) {
-    if (std::fflush(file_.get()) != 0) fail();
-    std::rewind(file_.get());
-    std::array<char, 65536> piece;
-    while (const std::size_t size = std::fread(piece.data(), 1, piece.size(), file_.get()))
-      print({piece.data(), size});
-    if (std::ferror(file_.get()) != 0) fail();
-    file_.reset();
-  }
+  if (file_ && !file_->giveTo(print)) fail();
+  file_.reset();
   print(text_);
   text_.clear();
 }

@@ -2,11 +2,12 @@
 // Text that has to wait for its turn. What is more than a megabyte waits in a file without a name.
 #pragma once
 
-#include <cstdio>
 #include <functional>
-#include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
+
+#include "Platform/Posix/TemporaryFile.h"
 
 namespace kelvasi {
 
@@ -18,15 +19,12 @@ class Spool {
   void giveTo(const std::function<void(std::string_view text)>& print);
 
  private:
-  struct Close {
-    void operator()(std::FILE* file) const { std::fclose(file); }
-  };
   static constexpr std::size_t mostInMemory = std::size_t{1} << 20;
 
   void moveToFile();
 
   std::string text_;
-  std::unique_ptr<std::FILE, Close> file_;
+  std::optional<TemporaryFile> file_;
 };
 
 }  // namespace kelvasi

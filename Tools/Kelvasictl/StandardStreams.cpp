@@ -1,16 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/StandardStreams.h"
 
-#include <fcntl.h>
 #include <unistd.h>
 
-#include <array>
 #include <cerrno>
-#include <csignal>
-#include <cstdlib>
 #include <string>
 #include <system_error>
-#include <utility>
 
 #include "Platform/Posix/FileDescriptor.h"
 #include "Tools/Kelvasictl/ToolError.h"
@@ -24,17 +19,6 @@ bool write(int stream, std::string_view text) {
 }
 
 }  // namespace
-
-void secureStandardStreams() {
-  constexpr std::array uses{std::pair{STDIN_FILENO, O_WRONLY}, std::pair{STDOUT_FILENO, O_RDONLY},
-                            std::pair{STDERR_FILENO, O_WRONLY}};
-  // The lowest free number is taken, so each one lands where it is missing.
-  for (const auto& [stream, mode] : uses) {
-    if (::fcntl(stream, F_GETFD) < 0 && ::open("/dev/null", mode) != stream) std::abort();
-  }
-  std::signal(SIGPIPE, SIG_IGN);
-  std::signal(SIGXFSZ, SIG_IGN);
-}
 
 void printOut(std::string_view text) {
   if (!write(STDOUT_FILENO, text))

@@ -6,11 +6,6 @@
 
 namespace kelvasi {
 
-// To be called first. A standard stream that the tool was started without is occupied, so that no file takes
-// its number; using it fails. Writing into a pipe that nobody reads, or past the size that a file may have,
-// fails too, instead of ending the process.
-void secureStandardStreams();
-
 // Hands `text` to the system. Throws ToolError when that fails.
 void printOut(std::string_view text);
 

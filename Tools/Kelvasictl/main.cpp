@@ -5,6 +5,7 @@
 #include <memory>
 #include <vector>
 
+#include "Platform/Posix/StandardDescriptors.h"
 #include "Radio/Quantity.h"
 #include "Telvon/TechnologyName.h"
 #include "Tools/CommandLine.h"
@@ -93,7 +94,7 @@ int run(int argumentCount, char** arguments, MessageTally& tally) {
 
 // NOLINTNEXTLINE(bugprone-exception-escape): the terminate handler tells of what is no ToolError
 int main(int argumentCount, char** arguments) {
-  kelvasi::secureStandardStreams();
+  kelvasi::secureStandardDescriptors();
   kelvasi::MessageTally tally;
   int status = kelvasi::exitFault;
   try {
