@@ -33,7 +33,7 @@ class BadCaptures(KelvasictlTest):
     def test_the_captures_fault_is_named_even_where_a_later_step_fails_too(self):
         empty = self.write("empty.pcap", b"")
         for result, pieces in ((self.decode(empty, "--format", "plist"), ("empty.pcap: byte 0: ", "no display")),
-                               (self.decode(empty, "--dlf", "/nonexistent/x"), ("empty.pcap: byte 0: ", "/nonexistent/x"))):
+                               (self.decode(empty, "--dlf", self.path("missing/x")), ("empty.pcap: byte 0: ", "missing/x"))):
             said = result.stderr.decode().splitlines()
             self.assertEqual((len(said), result.returncode), (2, 1), said)
             for line, piece in zip(said, pieces):
