@@ -13,7 +13,7 @@ import unittest
 import jsonschema
 from live_support import DAEMON, PATIENCE, LiveTest
 from readings_fold import Fold
-from support import CAPTURES, START, TEMPLATES, KelvasictlTest, pcap, record
+from support import CAPTURES, GMM_REGISTERED, START, TEMPLATES, KelvasictlTest, pcap, record
 
 TECHNOLOGIES = ("IFX", "Orvane_GSM", "Orvane_CDMA", "Orvane_LTE", "Orvane_UTRAN2")
 SCHEMA = json.loads((CAPTURES.parent.parent / "Docs" / "readings.schema.json").read_text())
@@ -291,6 +291,18 @@ class Live(LiveTest, ReadingsTest):
                                    resources=CAPTURES.parent.parent / "Resources")
         self.assertEqual(readings.stdout.readline().decode().strip().split(","), KEYS)
         self.assertIn(",Orvane_GSM,", readings.stdout.readline().decode())
+        self.assertEqual(self.end(readings)[0], 0)
+
+    def test_messages_of_another_technology_find_no_section_and_that_is_said(self):
+        daemon = self.start_daemon("--replay", self.write("lte.pcap", pcap(Lines.MEASURED)), technology="Orvane_LTE")
+        readings = self.start_live("readings", "--live", "--select", "rsrp")
+        self.assertEqual(json.loads(readings.stdout.readline())["technology"], "Orvane_LTE")
+        daemon.kill()
+        daemon.wait()
+        self.start_daemon("--replay", self.write("gsm.pcap", pcap(GMM_REGISTERED)), technology="Orvane_GSM")
+        said = readings.stderr.readline().decode()
+        self.assertEqual(said, "kelvasictl: the daemon's technology has changed; its messages find no section until "
+                               "kelvasictl is started anew\n")
         self.assertEqual(self.end(readings)[0], 0)
 
     def test_it_ends_after_the_seconds(self):

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/LiveRun.h"
 
+#include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
 
 namespace kelvasi {
@@ -13,9 +14,8 @@ constexpr auto timeBetweenLooks = 250ms;
 
 }  // namespace
 
-// The tree is asked for so that the generator lets the messages of the last tick go.
 LiveRun::LiveRun(const LiveOptions& options, LiveUse use)
-    : use_(std::move(use)), session_(options, [this] { session_.model().topLevelNodes(); }) {
+    : use_(std::move(use)), session_(options, [this] { update(); }) {
   session_.model().gatherReadings([this](const Readings& readings, const Intake& intake) {
     endAtFault([&] { take(readings, intake); });
   });
@@ -27,6 +27,14 @@ void LiveRun::run() {
   });
   session_.run();
   finish();
+}
+
+// The tree is asked for so that the generator lets the messages of the last tick go.
+void LiveRun::update() {
+  session_.model().topLevelNodes();
+  if (session_.hasBegunToShowAnother())
+    complain(
+        "the daemon's technology has changed; its messages find no section until kelvasictl is started anew");
 }
 
 void LiveRun::take(const Readings& readings, const Intake& intake) {

@@ -32,6 +32,7 @@ class LiveRun {
  private:
   void take(const Readings& readings, const Intake& intake);
   void finish();
+  void update();
   template <typename Action>
   void endAtFault(Action action);
 

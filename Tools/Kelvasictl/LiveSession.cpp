@@ -2,6 +2,7 @@
 #include "Tools/Kelvasictl/LiveSession.h"
 
 #include <CLI/CLI.hpp>
+#include <utility>
 
 #include "Platform/Qt/RuntimeDirectory.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
@@ -58,6 +59,11 @@ void LiveSession::run() {
   if (error_) throw ToolError(*error_);
   const bool timeIsOver = signal == 0 && !hasEnded_;
   if (timeIsOver && !model_.logGenerator()) throw ToolError("nothing came from " + aDaemonThere());
+}
+
+bool LiveSession::hasBegunToShowAnother() {
+  const bool wasAnother = std::exchange(showsAnother_, model_.showsAnotherTechnology());
+  return showsAnother_ && !wasAnother;
 }
 
 void LiveSession::end(std::optional<std::string> error) {

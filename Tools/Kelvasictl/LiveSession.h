@@ -32,6 +32,9 @@ class LiveSession {
   MainQueue& queue() { return queue_; }
   const Clock& clock() const { return surroundings_.clock; }
 
+  // Whether the tree, since this was asked last, has become one that a generator of another technology left.
+  bool hasBegunToShowAnother();
+
   // Connects and runs until SIGINT, SIGTERM, SIGHUP, the stated time or end(). What the sockets hold by a
   // signal or by the end of that time is still taken in. Says once where it waits when the first attempt
   // reaches no daemon. Throws ToolError with what end() was given, and when the time has passed without a
@@ -52,6 +55,7 @@ class LiveSession {
   QtTelephonyDaemon daemon_;
   KelvasiModel model_;
   bool hasEnded_ = false;  // by end()
+  bool showsAnother_ = false;
   std::optional<std::string> error_;
 };
 

@@ -78,17 +78,14 @@ class MonitorVerb {
     }
   }
 
-  // Once each time that it becomes so.
   void tellWhoseDisplayItIs() {
-    const bool wasAnother = std::exchange(showsAnother_, session_.model().showsAnotherTechnology());
-    if (showsAnother_ && !wasAnother)
+    if (session_.hasBegunToShowAnother())
       complain(
           "the daemon's technology has changed; the display stays the one before until monitor is started "
           "anew");
   }
 
   const MonitorOptions& options_;
-  bool showsAnother_ = false;
   MonitorView view_;
   ConnectionStatus status_;
   LiveSession session_;
