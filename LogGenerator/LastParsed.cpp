@@ -7,10 +7,11 @@ namespace kelvasi {
 
 std::optional<PlistValue> LastParsed::parse(std::span<const std::uint8_t> bytes) const {
   if (!hasParsed_ || !std::ranges::equal(bytes, bytes_)) {
-    parsed_ = serialiser_.parse(bytes);
+    serialiser_.parseOver(parsed_, bytes);
     bytes_.assign(bytes.begin(), bytes.end());
     hasParsed_ = true;
   }
+  if (parsed_.isAbsent()) return std::nullopt;
   return parsed_;
 }
 

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Remembers what the last bytes parsed gave, so that the decoders that read one record parse it once.
 //
-// What it hands out is shared: readers may pass parts of it on, and change none of it. For one thread.
+// What it hands out is shared: readers may pass parts of it on, and change none of it. What they have let go
+// of by the next record is written over. For one thread.
 #pragma once
 
 #include "Platform/PlistSerialiser.h"
@@ -25,7 +26,7 @@ class LastParsed : public PlistSerialiser {
   const PlistSerialiser& serialiser_;
   mutable bool hasParsed_ = false;
   mutable Bytes bytes_;
-  mutable std::optional<PlistValue> parsed_;
+  mutable PlistValue parsed_;  // absent: no property list
 };
 
 }  // namespace kelvasi

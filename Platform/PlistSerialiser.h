@@ -17,6 +17,12 @@ class PlistSerialiser {
   // Parses an XML or binary property list. Nothing when the bytes are not one, or are larger or nested deeper
   // than the implementation accepts.
   virtual std::optional<PlistValue> parse(std::span<const std::uint8_t> bytes) const = 0;
+  // The same, written over a value of any kind: what nobody else holds of it may be used again, so that
+  // documents of one shape need no new memory. False when the bytes are none; the value is then absent.
+  virtual bool parseOver(PlistValue& value, std::span<const std::uint8_t> bytes) const {
+    value = parse(bytes).value_or(PlistValue());
+    return !value.isAbsent();
+  }
   // An XML property list, format version 1.0. Nothing when the value, or one inside it, is absent.
   virtual std::optional<Bytes> serialiseXml(const PlistValue& value) const = 0;
   // The same as a binary property list, format version 00.

@@ -82,6 +82,15 @@ std::size_t PlistDictionary::rewriteText(std::string_view key, DeferredText text
   return rewriteAnyText(key, text, place);
 }
 
+PlistValue& PlistDictionary::rewrite(std::string_view key, std::size_t& place) {
+  if (place < size() && entries_[place].first == key) return entries_[place++].second;
+  truncate(place);
+  const std::size_t before = placeOf(key);
+  if (before < size()) return entries_[before].second;
+  place = append(key, {});
+  return entries_.back().second;
+}
+
 void PlistDictionary::truncate(std::size_t place) {
   if (place >= size()) return;
   entries_.erase(entries_.begin() + static_cast<std::ptrdiff_t>(place), entries_.end());
@@ -97,8 +106,8 @@ std::size_t PlistDictionary::placeOf(std::string_view key) const {
   return static_cast<std::size_t>(found - entries_.begin());
 }
 
-std::size_t PlistDictionary::append(std::string_view key, PlistValue value) {
-  entries_.emplace_back(std::string(key), std::move(value));
+std::size_t PlistDictionary::append(std::string_view key, PlistValue&& value) {
+  entries_.emplace_back(key, std::move(value));
   if (!index_.empty()) {
     index_.emplace(std::string(key), size() - 1);
   } else if (size() == indexedFrom) {
@@ -119,6 +128,11 @@ PlistValue::Array PlistArray::make(std::initializer_list<PlistValue> elements) {
 
 void PlistArray::append(PlistValue value) {
   elements_.push_back(std::move(value));
+}
+
+PlistValue& PlistArray::rewrite(std::size_t place) {
+  if (place == size()) elements_.emplace_back();
+  return elements_.at(place);
 }
 
 void PlistArray::removeFirst(std::size_t count) {

@@ -34,6 +34,8 @@ class PlistDictionary {
   // The absent value when there is no such key.
   PlistValue get(std::string_view key) const;
 
+  // Makes room for so many entries at once.
+  void reserve(std::size_t count) { entries_.reserve(count); }
   // An absent value removes the key.
   void set(std::string_view key, PlistValue value);
   bool remove(std::string_view key);
@@ -49,6 +51,9 @@ class PlistDictionary {
   // it first.
   std::size_t rewriteText(std::string_view key, std::string_view text, std::size_t place);
   std::size_t rewriteText(std::string_view key, DeferredText text, std::size_t place);
+  // The same for a value of any kind, for the caller to write at once over what stands there; an absent one
+  // where the key is new. `place` becomes the next one, unless the key stands before it already.
+  PlistValue& rewrite(std::string_view key, std::size_t& place);
   // Drops the entries from `place` on.
   void truncate(std::size_t place);
 
@@ -58,7 +63,7 @@ class PlistDictionary {
   template <typename Text>
   std::size_t rewriteAnyText(std::string_view key, Text text, std::size_t place);
   std::size_t placeOf(std::string_view key) const;
-  std::size_t append(std::string_view key, PlistValue value);
+  std::size_t append(std::string_view key, PlistValue&& value);
   void rebuildIndex();
 
   struct Hash {
@@ -83,7 +88,10 @@ class PlistArray {
   auto end() const { return elements_.end(); }
   const PlistValue& at(std::size_t place) const { return elements_.at(place); }
 
+  void reserve(std::size_t count) { elements_.reserve(count); }
   void append(PlistValue value);
+  // The element at `place`, at most size(), for the caller to write at once over what stands there.
+  PlistValue& rewrite(std::size_t place);
   void removeFirst(std::size_t count);
   void removeAll() { elements_.clear(); }
   void truncate(std::size_t size);

@@ -87,6 +87,9 @@ class PlistValue {
   Dictionary sharedDictionary() const;
   Array sharedArray() const;
 
+  // Whether others hold this container, too.
+  bool isShared() const;
+
   // The same value, its outermost container copied; nested containers stay shared. Data needs no copy: it
   // never changes.
   PlistValue shallowCopy() const;

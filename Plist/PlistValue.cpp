@@ -42,6 +42,12 @@ PlistValue::Array PlistValue::sharedArray() const {
   return array ? *array : nullptr;
 }
 
+bool PlistValue::isShared() const {
+  if (const auto* dictionary = std::get_if<Dictionary>(&value_)) return dictionary->use_count() > 1;
+  const auto* array = std::get_if<Array>(&value_);
+  return array && array->use_count() > 1;
+}
+
 PlistValue PlistValue::shallowCopy() const {
   if (const auto* entries = dictionary()) return std::make_shared<PlistDictionary>(*entries);
   if (const auto* elements = array()) return std::make_shared<PlistArray>(*elements);

@@ -35,10 +35,10 @@ std::optional<PlistValue> readBinary(std::span<const std::uint8_t> bytes) {
   return std::nullopt;
 }
 
-std::optional<PlistValue> readXml(std::string_view document) {
+bool readXml(std::string_view document, PlistValue& value) {
   constexpr std::string_view byteOrderMark = "\xef\xbb\xbf";
   if (document.starts_with(byteOrderMark)) document.remove_prefix(byteOrderMark.size());
-  return readXmlPlist(withoutPadding(document));
+  return readXmlPlist(withoutPadding(document), value);
 }
 
 // A reader would take a bare carriage return for a line feed (XML 1.0, section 2.11).
@@ -59,8 +59,19 @@ Bytes withCarriageReturnsKept(std::string_view text) {
 }  // namespace
 
 std::optional<PlistValue> LibplistSerialiser::parse(std::span<const std::uint8_t> bytes) const {
+  PlistValue value;
+  if (!parseOver(value, bytes)) return std::nullopt;
+  return value;
+}
+
+bool LibplistSerialiser::parseOver(PlistValue& value, std::span<const std::uint8_t> bytes) const {
   const std::string_view document = textOf(bytes);
-  return document.starts_with(binaryPlistMagic) ? readBinary(bytes) : readXml(document);
+  if (document.starts_with(binaryPlistMagic)) {
+    value = readBinary(bytes).value_or(PlistValue());
+  } else if (!readXml(document, value)) {
+    value = {};
+  }
+  return !value.isAbsent();
 }
 
 std::optional<Bytes> LibplistSerialiser::serialiseXml(const PlistValue& value) const {

@@ -28,6 +28,7 @@ namespace kelvasi {
 class LibplistSerialiser : public PlistSerialiser {
  public:
   std::optional<PlistValue> parse(std::span<const std::uint8_t> bytes) const override;
+  bool parseOver(PlistValue& value, std::span<const std::uint8_t> bytes) const override;
   std::optional<Bytes> serialiseXml(const PlistValue& value) const override;
   std::optional<Bytes> serialiseBinary(const PlistValue& value) const override;
 };

@@ -2,6 +2,7 @@
 #include "Platform/Plist/Utf8.h"
 
 #include <algorithm>
+#include <array>
 #include <cstdint>
 #include <cstring>
 
@@ -36,23 +37,26 @@ Utf8Character read(std::string_view text, const Form& form) {
   return {code, form.length};
 }
 
-// Eight characters at once: whether all are ASCII and none is NUL. A byte of `less` has its highest bit set
-// where the character is NUL or no ASCII; behind a NUL others may have, too.
-bool isAsciiWord(const char* characters) {
+// Of so many characters at once whether all are ASCII and none is NUL. A byte of `less` has its highest bit
+// set where the character is NUL or no ASCII; behind a NUL others may have, too.
+template <std::size_t count>
+bool isAscii(const char* characters) {
   constexpr std::uint64_t highest = 0x8080808080808080;
   constexpr std::uint64_t ones = 0x0101010101010101;
-  std::uint64_t word = 0;
-  std::memcpy(&word, characters, sizeof word);
-  const std::uint64_t less = word - ones;
-  return ((less | word) & highest) == 0;
+  std::array<std::uint64_t, count / sizeof(std::uint64_t)> words;
+  std::memcpy(words.data(), characters, sizeof words);
+  std::uint64_t marks = 0;
+  for (const std::uint64_t word : words) marks |= (word - ones) | word;
+  return (marks & highest) == 0;
 }
 
 // Most texts are nothing else, and need no closer look.
 std::size_t asciiPrefix(std::string_view text) {
-  std::size_t words = 0;
-  while (words + 8 <= text.size() && isAsciiWord(text.data() + words)) words += 8;
+  std::size_t size = 0;
+  while (size + 64 <= text.size() && isAscii<64>(text.data() + size)) size += 64;
+  while (size + 8 <= text.size() && isAscii<8>(text.data() + size)) size += 8;
   const auto isOther = [](unsigned char byte) { return byte == 0 || byte >= 0x80; };
-  return static_cast<std::size_t>(std::ranges::find_if(text.substr(words), isOther) - text.begin());
+  return static_cast<std::size_t>(std::ranges::find_if(text.substr(size), isOther) - text.begin());
 }
 
 }  // namespace

@@ -8,9 +8,15 @@ namespace kelvasi {
 
 namespace {
 
+bool isEvenCount(std::string_view text, char character) {
+  bool isEven = true;
+  for (auto at = text.find(character); at != text.npos; at = text.find(character, at + 1)) isEven = !isEven;
+  return isEven;
+}
+
 // Otherwise readers may differ on where the declaration ends.
 bool hasClosedQuotes(std::string_view text) {
-  return std::ranges::count(text, '"') % 2 == 0 && std::ranges::count(text, '\'') % 2 == 0;
+  return isEvenCount(text, '"') && isEvenCount(text, '\'');
 }
 
 }  // namespace
@@ -25,7 +31,8 @@ bool isPlainComment(std::string_view text) {
 }
 
 bool isPlainDoctype(std::string_view text) {
-  return text.find_first_of("[<>") == std::string_view::npos && hasClosedQuotes(text);
+  const auto has = [&](char character) { return text.find(character) != std::string_view::npos; };
+  return !has('[') && !has('<') && !has('>') && hasClosedQuotes(text);
 }
 
 bool isPlainEncoding(std::string_view name) {

@@ -17,27 +17,15 @@ namespace {
 
 using pugi::xml_node;
 
-bool isNothing(std::string_view text) {
-  return trimmed(text).empty();
+bool isNothing(const char* text) {
+  return *text == '\0' || trimmed(text).empty();
 }
 
-std::optional<PlistValue> flag(std::string_view text, bool value) {
-  if (!isNothing(text)) return std::nullopt;
+template <bool value>
+std::optional<PlistValue> flag(std::string_view text) {
+  if (!trimmed(text).empty()) return std::nullopt;
   return PlistValue(value);
 }
-
-struct ScalarRule {
-  std::string_view name;
-  std::optional<PlistValue> (*read)(std::string_view text);
-};
-constexpr std::array scalarRules{
-    ScalarRule{"integer", xmlInteger},
-    ScalarRule{"real", xmlReal},
-    ScalarRule{"date", xmlDate},
-    ScalarRule{"data", xmlData},
-    ScalarRule{"true", [](std::string_view text) { return flag(text, true); }},
-    ScalarRule{"false", [](std::string_view text) { return flag(text, false); }},
-};
 
 // Comments and white space may stand between elements.
 bool isBetween(const xml_node& node) {
@@ -47,78 +35,129 @@ bool isBetween(const xml_node& node) {
 
 // The first node from this one on that counts; null where none does.
 xml_node counting(xml_node node) {
-  while (node && isBetween(node)) node = node.next_sibling();
+  while (node && node.type() != pugi::node_element && isBetween(node)) node = node.next_sibling();
   return node;
+}
+
+std::size_t childCount(const xml_node& node) {
+  std::size_t count = 0;
+  for (xml_node child = node.first_child(); child; child = child.next_sibling()) ++count;
+  return count;
 }
 
 bool isElement(const xml_node& node, std::string_view name) {
   return node.type() == pugi::node_element && node.name() == name && !node.first_attribute();
 }
 
+// What an element's text holds before its first child is the element's own value.
+//
+// Values are written over those that stand there: containers that nobody else holds and the room of strings
+// are used again. Each function gives false for what is no value, and then leaves whatever it has written.
 class Reader {
  public:
-  // `level` counts the containers around the value. Absent for what is no value.
-  PlistValue value(const xml_node& node, int level);
+  // Without `hasReferences` no text has any.
+  explicit Reader(bool hasReferences) : hasReferences_(hasReferences) {}
+
+  // `level` counts the containers around the value.
+  bool read(const xml_node& node, int level, PlistValue& value);
 
  private:
-  PlistValue dictionary(const xml_node& node, int level);
-  PlistValue array(const xml_node& node, int level);
+  struct Element {
+    std::string_view name;
+    bool (Reader::*read)(const xml_node& node, int level, PlistValue& value);
+  };
+
+  bool dictionary(const xml_node& node, int level, PlistValue& value);
+  bool array(const xml_node& node, int level, PlistValue& value);
+  bool string(const xml_node& node, int level, PlistValue& value);
+  template <std::optional<PlistValue> (*readText)(std::string_view text)>
+  bool scalar(const xml_node& node, int level, PlistValue& value);
+
   // The text of a string or key: that of its one piece where it needs no change, else put together in
   // `whole`.
-  static std::optional<std::string_view> textOf(const xml_node& node, std::string& whole);
-  static PlistValue scalar(const xml_node& node);
+  std::optional<std::string_view> textOf(const xml_node& node, std::string& whole) const;
 
+  bool hasReferences_;
   Allowance allowance_{plistLimits::values, 0};
 };
 
-PlistValue Reader::value(const xml_node& node, int level) {
-  if (node.type() != pugi::node_element || node.first_attribute() || !allowance_.takeValues(1)) return {};
-  const std::string_view name = node.name();
-  const bool isDictionary = name == "dict";
-  if (isDictionary || name == "array") {
-    if (level == plistLimits::levels) return {};
-    return isDictionary ? dictionary(node, level + 1) : array(node, level + 1);
-  }
-  if (name != "string") return scalar(node);
-  std::string whole;
-  const auto text = textOf(node, whole);
-  return text ? PlistValue(*text) : PlistValue();
+bool Reader::read(const xml_node& node, int level, PlistValue& value) {
+  static constexpr std::array<Element, 9> elements{{
+      {"string", &Reader::string},
+      {"integer", &Reader::scalar<xmlInteger>},
+      {"dict", &Reader::dictionary},
+      {"array", &Reader::array},
+      {"real", &Reader::scalar<xmlReal>},
+      {"true", &Reader::scalar<flag<true>>},
+      {"false", &Reader::scalar<flag<false>>},
+      {"date", &Reader::scalar<xmlDate>},
+      {"data", &Reader::scalar<xmlData>},
+  }};
+  if (node.type() != pugi::node_element || node.first_attribute() || !allowance_.takeValues(1)) return false;
+  const auto element = std::ranges::find(elements, std::string_view(node.name()), &Element::name);
+  return element != elements.end() && (this->*element->read)(node, level, value);
 }
 
-PlistValue Reader::dictionary(const xml_node& node, int level) {
-  const auto entries = PlistDictionary::make();
+bool Reader::dictionary(const xml_node& node, int level, PlistValue& value) {
+  if (level == plistLimits::levels || !isNothing(node.value())) return false;
+  if (!value.dictionary() || value.isShared()) {
+    value = PlistDictionary::make();
+    value.dictionary()->reserve(std::min(childCount(node) / 2, plistLimits::dictionaryEntries));
+  }
+  PlistDictionary& entries = *value.dictionary();
   std::string whole;
+  std::size_t place = 0;
   std::size_t count = 0;
   for (xml_node key = counting(node.first_child()); key; key = counting(key.next_sibling())) {
-    if (++count > plistLimits::dictionaryEntries || !isElement(key, "key")) return {};
+    if (++count > plistLimits::dictionaryEntries || !isElement(key, "key")) return false;
     const auto name = textOf(key, whole);
-    if (!allowance_.takeValues(1) || !name) return {};
+    if (!allowance_.takeValues(1) || !name) return false;
     key = counting(key.next_sibling());
-    PlistValue entry = value(key, level);
-    if (entry.isAbsent()) return {};
-    entries->set(*name, std::move(entry));
+    if (!read(key, level + 1, entries.rewrite(*name, place))) return false;
   }
-  return entries;
+  entries.truncate(place);
+  return true;
 }
 
-PlistValue Reader::array(const xml_node& node, int level) {
-  const auto elements = PlistArray::make();
+bool Reader::array(const xml_node& node, int level, PlistValue& value) {
+  if (level == plistLimits::levels || !isNothing(node.value())) return false;
+  if (!value.array() || value.isShared()) {
+    value = PlistArray::make();
+    value.array()->reserve(std::min(childCount(node), plistLimits::values));
+  }
+  PlistArray& elements = *value.array();
+  std::size_t place = 0;
   for (xml_node child = counting(node.first_child()); child; child = counting(child.next_sibling())) {
-    PlistValue element = value(child, level);
-    if (element.isAbsent()) return {};
-    elements->append(std::move(element));
+    if (!read(child, level + 1, elements.rewrite(place))) return false;
+    ++place;
   }
-  return elements;
+  elements.truncate(place);
+  return true;
 }
 
-std::optional<std::string_view> Reader::textOf(const xml_node& node, std::string& whole) {
-  const xml_node first = node.first_child();
-  if (first.type() == pugi::node_pcdata && !first.next_sibling()) {
-    const std::string_view text = first.value();
-    if (text.find('&') == std::string_view::npos) return text;
-  }
+bool Reader::string(const xml_node& node, int, PlistValue& value) {
+  std::string whole;
+  const auto text = textOf(node, whole);
+  if (text) value.set(*text);
+  return text.has_value();
+}
+
+// Of one piece, unlike a text.
+template <std::optional<PlistValue> (*readText)(std::string_view text)>
+bool Reader::scalar(const xml_node& node, int, PlistValue& value) {
+  if (node.first_child()) return false;
+  auto scalar = readText(node.value());
+  if (scalar) value = std::move(*scalar);
+  return scalar.has_value();
+}
+
+std::optional<std::string_view> Reader::textOf(const xml_node& node, std::string& whole) const {
+  const xml_node rest = node.first_child();
+  const std::string_view text = node.value();
+  if (!rest && (!hasReferences_ || text.find('&') == std::string_view::npos)) return text;
   whole.clear();
-  for (xml_node piece = first; piece; piece = piece.next_sibling()) {
+  if (!appendXmlText(whole, text)) return std::nullopt;
+  for (xml_node piece = rest; piece; piece = piece.next_sibling()) {
     if (piece.type() == pugi::node_cdata) {
       whole += piece.value();
     } else if (piece.type() == pugi::node_comment) {
@@ -128,15 +167,6 @@ std::optional<std::string_view> Reader::textOf(const xml_node& node, std::string
     }
   }
   return whole;
-}
-
-// Of one piece, unlike a text.
-PlistValue Reader::scalar(const xml_node& node) {
-  const auto rule = std::ranges::find(scalarRules, std::string_view(node.name()), &ScalarRule::name);
-  const xml_node content = node.first_child();
-  const bool isWhole = !content || (content.type() == pugi::node_pcdata && !content.next_sibling());
-  if (rule == scalarRules.end() || !isWhole) return {};
-  return rule->read(content.value()).value_or(PlistValue());
 }
 
 bool isPlainProlog(const xml_node& node) {
@@ -159,13 +189,13 @@ bool isPlistElement(const xml_node& node) {
 }
 
 // The value of a document that holds one plist element with one value and nothing else.
-PlistValue valueOf(const pugi::xml_document& document) {
+bool readDocument(const pugi::xml_document& document, bool hasReferences, PlistValue& value) {
   xml_node root = counting(document.first_child());
   while (isPlainProlog(root)) root = counting(root.next_sibling());
-  if (!isPlistElement(root) || counting(root.next_sibling())) return {};
+  if (!isPlistElement(root) || !isNothing(root.value()) || counting(root.next_sibling())) return false;
   const xml_node top = counting(root.first_child());
-  if (!top || counting(top.next_sibling())) return {};
-  return Reader().value(top, 0);
+  if (!top || counting(top.next_sibling())) return false;
+  return Reader(hasReferences).read(top, 0, value);
 }
 
 // Two pieces of markup a value, and some around them: what the parser's memory is bounded by. Small documents
@@ -190,19 +220,24 @@ bool mayHavePieces(std::string_view document) {
 // stands alone, and need not be kept elsewhere.
 unsigned parseOptions(std::string_view document) {
   constexpr unsigned always = pugi::parse_cdata | pugi::parse_comments | pugi::parse_pi |
-                              pugi::parse_declaration | pugi::parse_doctype | pugi::parse_fragment;
+                              pugi::parse_declaration | pugi::parse_doctype | pugi::parse_fragment |
+                              pugi::parse_embed_pcdata;
   return always | (mayHavePieces(document) ? pugi::parse_ws_pcdata : pugi::parse_ws_pcdata_single);
 }
 
 }  // namespace
 
-std::optional<PlistValue> readXmlPlist(std::string_view document) {
-  if (!isWithinBounds(document) || !isCleanUtf8(document)) return std::nullopt;
+bool readXmlPlist(std::string_view document, PlistValue& value) {
+  if (!isWithinBounds(document) || !isCleanUtf8(document)) return false;
   pugi::xml_document parsed;
   if (!parsed.load_buffer(document.data(), document.size(), parseOptions(document), pugi::encoding_utf8))
-    return std::nullopt;
-  PlistValue value = valueOf(parsed);
-  if (value.isAbsent()) return std::nullopt;
+    return false;
+  return readDocument(parsed, document.find('&') != std::string_view::npos, value);
+}
+
+std::optional<PlistValue> readXmlPlist(std::string_view document) {
+  PlistValue value;
+  if (!readXmlPlist(document, value)) return std::nullopt;
   return value;
 }
 

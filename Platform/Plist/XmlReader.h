@@ -13,5 +13,7 @@ namespace kelvasi {
 // of its own, or holds something that readers differ on. While it is read it takes at most some ten times its
 // size in memory.
 std::optional<PlistValue> readXmlPlist(std::string_view document);
+// The same, written over a value as PlistSerialiser::parseOver does.
+bool readXmlPlist(std::string_view document, PlistValue& value);
 
 }  // namespace kelvasi

@@ -15,7 +15,9 @@ namespace kelvasi {
 
 namespace {
 
-constexpr std::string_view white = " \t\r\n";
+bool isWhite(char character) {
+  return character == ' ' || character == '\t' || character == '\r' || character == '\n';
+}
 
 bool isDigit(char character) {
   return character >= '0' && character <= '9';
@@ -89,9 +91,9 @@ std::optional<unsigned> base64Digit(char character) {
 }  // namespace
 
 std::string_view trimmed(std::string_view text) {
-  const std::size_t first = text.find_first_not_of(white);
-  if (first == std::string_view::npos) return {};
-  return text.substr(first, text.find_last_not_of(white) - first + 1);
+  while (!text.empty() && isWhite(text.front())) text.remove_prefix(1);
+  while (!text.empty() && isWhite(text.back())) text.remove_suffix(1);
+  return text;
 }
 
 std::optional<PlistValue> xmlInteger(std::string_view text) {
@@ -100,7 +102,8 @@ std::optional<PlistValue> xmlInteger(std::string_view text) {
   const bool hexadecimal = text.starts_with("0x") || text.starts_with("0X");
   if (hexadecimal) text.remove_prefix(2);
   if (!hexadecimal && text.size() > 1 && text.front() == '0') return std::nullopt;
-  const auto magnitude = wholeNumber<std::uint64_t>(text, hexadecimal ? 16 : 10);
+  const auto magnitude =
+      hexadecimal ? wholeNumber<std::uint64_t>(text, 16) : wholeNumber<std::uint64_t>(text, 10);
   if (!magnitude || (negative && *magnitude > std::uint64_t{1} << 63)) return std::nullopt;
   return negative ? PlistValue(static_cast<std::int64_t>(-*magnitude)) : PlistValue(*magnitude);
 }
@@ -137,7 +140,7 @@ std::optional<PlistValue> xmlData(std::string_view text) {
   std::size_t padding = 0;
   unsigned group = 0;
   for (const char character : text) {
-    if (white.find(character) != std::string_view::npos) continue;
+    if (isWhite(character)) continue;
     const auto digit = base64Digit(character);
     if (character == '=' ? ++padding > 2 : !digit || padding != 0) return std::nullopt;
     group = group << 6 | digit.value_or(0);

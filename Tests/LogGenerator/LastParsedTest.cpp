@@ -51,6 +51,26 @@ TEST(LastParsed, RemembersThatBytesDidNotParse) {
   EXPECT_TRUE(lastParsed.parse(hex("01")));
 }
 
+// Each document is the last one's array, written over.
+struct OverwritingSerialiser : CountingSerialiser {
+  bool parseOver(PlistValue& value, std::span<const std::uint8_t> bytes) const override {
+    if (!value.array() || value.isShared()) value = PlistArray::make();
+    value.array()->rewrite(0) = bytes.size();
+    return true;
+  }
+};
+
+TEST(LastParsed, WritesOverWhatNobodyHolds) {
+  const OverwritingSerialiser serialiser;
+  const LastParsed lastParsed(serialiser);
+  const PlistArray* first = lastParsed.parse(hex("01"))->array();
+  const auto second = lastParsed.parse(hex("01 02"));
+  EXPECT_EQ(second->array(), first);
+  const auto third = lastParsed.parse(hex("01 02 03"));
+  EXPECT_EQ(*second, PlistValue(PlistArray::make({2})));
+  EXPECT_EQ(*third, PlistValue(PlistArray::make({3})));
+}
+
 TEST(LastParsed, SerialisesThroughWhatItWasGiven) {
   const CountingSerialiser serialiser;
   EXPECT_EQ(LastParsed(serialiser).serialiseXml("text"), hex("AB"));
