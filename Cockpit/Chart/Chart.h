@@ -60,6 +60,10 @@ struct ChartPicture {
   std::vector<std::string> differences;  // the second less the first, one a line: "+3 dB"
   std::string why;                       // where nothing is to be drawn: "No values in this time"
 
+  // 0 for `from`, 1 for `to`.
+  double placeOf(Arrival time) const {
+    return static_cast<double>((time - from).count()) / static_cast<double>((to - from).count());
+  }
   // 0 for `least`, 1 for `most`.
   double heightOf(double value) const { return (value - least) / (most - least); }
 };

@@ -4,21 +4,16 @@
 #include <algorithm>
 #include <cmath>
 
+#include "Cockpit/Chart/ChartCursors.h"
 #include "Cockpit/Chart/LineSource.h"
 
 namespace kelvasi::cockpit {
 
 namespace {
 
-using namespace std::chrono_literals;
 using survey::Spread;
 
 constexpr std::size_t mostMarks = 200;
-
-double placeIn(Arrival time, const ChartPicture& picture) {
-  return static_cast<double>((time - picture.from).count()) /
-         static_cast<double>((picture.to - picture.from).count());
-}
 
 // What is newest in the picture.
 std::string newestText(const LineSource& source, const std::vector<Spread>& points, const TextStyle& style) {
@@ -87,64 +82,13 @@ void addMarks(ChartPicture& picture, const View& view, std::span<const MarkLine>
     if (!isIn(event.time, picture)) continue;
     const bool isChange = event.kind == survey::EventKind::cellChange;
     picture.marks.push_back({isChange ? ChartMark::Kind::cellChange : ChartMark::Kind::event,
-                             placeIn(event.time, picture), event.time, wordsOf(event)});
+                             picture.placeOf(event.time), event.time, wordsOf(event)});
   }
   for (const MarkLine& mark : marks) {
     if (isIn(mark.time, picture))
-      picture.marks.push_back({ChartMark::Kind::mark, placeIn(mark.time, picture), mark.time, mark.note});
+      picture.marks.push_back({ChartMark::Kind::mark, picture.placeOf(mark.time), mark.time, mark.note});
   }
   std::ranges::stable_sort(picture.marks, {}, &ChartMark::time);
-}
-
-// The second that the moment is in; where nothing came in it, the newest that counts as live.
-std::optional<double> valueAt(const LineSource& source, Arrival time) {
-  const Arrival second = std::chrono::floor<std::chrono::seconds>(time);
-  const auto now = pointsOf(source.series, second, second + 1s, 1);
-  if (now.front().count > 0) return now.front().mean;
-  const auto before = pointsOf(source.series, second - 3s, second, 3);
-  const auto last =
-      std::find_if(before.rbegin(), before.rend(), [](const Spread& each) { return each.count > 0; });
-  return last == before.rend() ? std::nullopt : std::optional<double>(last->mean);
-}
-
-ChartCursor cursorAt(Arrival time, const std::vector<LineSource>& sources, const ChartPicture& picture,
-                     const TextStyle& style) {
-  ChartCursor cursor;
-  cursor.time = time;
-  cursor.place = placeIn(time, picture);
-  cursor.timeText = clockText(time, style);
-  for (const LineSource& source : sources) {
-    const auto value = valueAt(source, time);
-    cursor.values.push_back({value ? valueText(source, *value, style) : "no value", value});
-  }
-  return cursor;
-}
-
-std::string betweenText(Arrival time) {
-  const auto seconds = std::chrono::round<std::chrono::seconds>(std::chrono::abs(time)).count();
-  if (seconds < 60) return std::to_string(seconds) + " s";
-  const std::string rest = seconds % 60 == 0 ? "" : " " + std::to_string(seconds % 60) + " s";
-  if (seconds < 3600) return std::to_string(seconds / 60) + " min" + rest;
-  return std::to_string(seconds / 3600) + " h " + std::to_string(seconds / 60 % 60) + " min" + rest;
-}
-
-void addCursors(ChartPicture& picture, const Chart& chart, const std::vector<LineSource>& sources,
-                const TextStyle& style) {
-  for (const auto& time : chart.cursors()) {
-    if (time) picture.cursors.push_back(cursorAt(*time, sources, picture, style));
-  }
-  if (picture.cursors.size() < 2) return;
-  const auto& [first, second] = std::pair(picture.cursors[0], picture.cursors[1]);
-  picture.cursorTime = betweenText(second.time - first.time);
-  for (std::size_t line = 0; line < sources.size(); ++line) {
-    std::string text;
-    if (first.values[line].value && second.values[line].value) {
-      const double difference = *second.values[line].value - *first.values[line].value;
-      text = valueText(sources[line], difference, style);
-      if (difference > 0) text.insert(0, 1, '+');
-    }
-    picture.differences.push_back(std::move(text));
-  }
 }
 
 std::string commonUnit(const std::vector<ChartLine>& lines) {

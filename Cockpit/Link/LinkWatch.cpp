@@ -69,14 +69,14 @@ Link LinkWatch::at(Arrival now, const TextStyle& style) const {
   link.messages = earlierMessages_ + messages_;
   link.notShown = link.messages - earlierShown_ - shown_;
   link.counters = countersText(link.messages, link.notShown);
-  addWords(link, style);
+  addWords(link, now, style);
   return link;
 }
 
-void LinkWatch::addWords(Link& link, const TextStyle& style) const {
+void LinkWatch::addWords(Link& link, Arrival now, const TextStyle& style) const {
   const std::string age = link.age ? durationText(*link.age) : std::string();
   const std::string because = report_.reason.empty() ? "" : ": " + report_.reason;
-  const std::string moment = link.lastMessage ? clockText(*link.lastMessage, style) : "the beginning";
+  const std::string moment = clockText(now, style);
   switch (link.state) {
     case LinkState::nothingYet:
       link.words = "nothing received yet";

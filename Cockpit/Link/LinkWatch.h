@@ -20,7 +20,7 @@ class LinkWatch {
 
  private:
   LinkState stateAt(Arrival now) const;
-  void addWords(Link& link, const TextStyle& style) const;
+  void addWords(Link& link, Arrival now, const TextStyle& style) const;
 
   LinkReport report_;
   std::optional<Arrival> lastMessage_;

@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "Tests/Cockpit/Fed.h"
+#include "Tests/Support/AllocationCounter.h"
 
 namespace kelvasi::cockpit {
 namespace {
@@ -76,6 +77,19 @@ TEST(Cockpit, TheLastThreeEventsTheNewestFirst) {
 
 TEST(Cockpit, SeriesOfADayAreInThirtyTwoMegabytes) {
   EXPECT_LE(Cockpit().bytes(), 32U * 1000 * 1000);
+}
+
+// What nobody looks at costs no text.
+TEST(Cockpit, TakingAMessageAllocatesNothing) {
+  Fed fed;
+  Message message = served(0s, cell404, -95);
+  message.neighbour(cell362, quantity::rsrp, -105).plain(quantity::txPower, 5);
+  const Readings& readings = message;
+  fed.cockpit.take(readings, fed.intake);
+  EXPECT_EQ(allocationsDuring([&] {
+              for (int turn = 0; turn < 100; ++turn) fed.cockpit.take(readings, fed.intake);
+            }),
+            0U);
 }
 
 TEST(Cockpit, AlarmsComeAndGo) {

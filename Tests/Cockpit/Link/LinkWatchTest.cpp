@@ -78,11 +78,11 @@ TEST_F(LinkWatchTest, HeldAndRecorded) {
   arrive(0s);
   watch_.hear({.source = LinkReport::Source::held});
   EXPECT_EQ(at(41s).state, LinkState::held);
-  EXPECT_EQ(at(41s).words, "held at 12:00:00");
+  EXPECT_EQ(at(41s).words, "held at 12:00:41");
   watch_.hear({.source = LinkReport::Source::file});
   EXPECT_EQ(at(41s).state, LinkState::file);
-  EXPECT_EQ(at(41s).words, "recorded 12:00:00");
-  EXPECT_EQ(at(41s).sentence, "A recorded drive, at 12:00:00.");
+  EXPECT_EQ(at(41s).words, "recorded 12:00:41");
+  EXPECT_EQ(at(41s).sentence, "A recorded drive, at 12:00:41.");
 }
 
 TEST_F(LinkWatchTest, CountsWhatIsNotShown) {
