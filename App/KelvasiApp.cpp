@@ -125,6 +125,19 @@ std::vector<std::string> KelvasiApp::openBranches() const {
   return names;
 }
 
+std::optional<std::size_t> KelvasiApp::openPath(const std::string& nodePath) {
+  navController_->popToViewController(*navController_->viewControllers().front(), false);
+  for (;;) {
+    KelvasiPaneController& pane = asPane(navController_->topViewController());
+    const auto row = pane.rowTowards(nodePath);
+    if (!row || !pane.openRow(*row)) return row;
+  }
+}
+
+std::string KelvasiApp::pathOfRow(std::size_t row) const {
+  return asPane(navController_->topViewController()).pathOfRow(row);
+}
+
 void KelvasiApp::openKeptBranches() {
   if (!model_->topLevelNodes()) return;
   const auto names = std::exchange(branchesToOpen_, {});

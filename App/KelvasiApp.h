@@ -63,6 +63,13 @@ class KelvasiApp : public Application,
   // Opens these with the first rows, as far as they are there and unless the user was quicker.
   void reopenBranches(std::vector<std::string> names) { branchesToOpen_ = std::move(names); }
 
+  // Opens the panes that lead to a node of the display tree, from the root on. The row of the last pane that
+  // is the node, or leads to it; nothing where the way ends before.
+  std::optional<std::size_t> openPath(const std::string& nodePath);
+  // The path of the node that a row of the pane on top is.
+  std::string pathOfRow(std::size_t row) const;
+
+  KelvasiModel* model() const { return model_.get(); }
   NavigationStack* navController() const { return navController_.get(); }
   bool unsetRSSI() const { return unsetRSSI_; }
 

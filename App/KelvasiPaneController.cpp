@@ -119,6 +119,27 @@ bool KelvasiPaneController::openBranchNamed(std::string_view name) {
   return child != children.end();
 }
 
+bool KelvasiPaneController::openRow(std::size_t row) {
+  const NodeRef child = nodes_->childNodes()->at(row);
+  if (child->childNodes()) openBranch(child, false);
+  return child->childNodes() != nullptr;
+}
+
+std::string KelvasiPaneController::pathOfRow(std::size_t row) const {
+  return pathByAppending(keyPath_, childAt({0, row}).displayName());
+}
+
+std::optional<std::size_t> KelvasiPaneController::rowTowards(std::string_view nodePath) const {
+  if (!nodes_ || !nodes_->childNodes()) return std::nullopt;
+  for (std::size_t row = 0; row < nodes_->childNodes()->size(); ++row) {
+    const std::string path = pathOfRow(row);
+    const bool isBefore =
+        nodePath.size() > path.size() && nodePath.starts_with(path) && nodePath[path.size()] == '/';
+    if (nodePath == path || isBefore) return row;
+  }
+  return std::nullopt;
+}
+
 void KelvasiPaneController::openBranch(const NodeRef& child, bool animated) {
   auto pane = std::make_unique<KelvasiPaneController>(ui_, shell_, child,
                                                       pathByAppending(keyPath_, child->displayName()));

@@ -26,6 +26,11 @@ class KelvasiPaneController : public TableViewController {
   void reloadWithNode(NodeRef node);
   // As a tap on its row does, without animation. False when there is no such branch.
   bool openBranchNamed(std::string_view name);
+  // The same for a row. False for a leaf.
+  bool openRow(std::size_t row);
+  // The row that is the node of this path, or leads to it.
+  std::optional<std::size_t> rowTowards(std::string_view nodePath) const;
+  std::string pathOfRow(std::size_t row) const;
   const std::string& path() const { return keyPath_; }
   void viewWillDisappear(bool animated) override;
 

@@ -99,7 +99,9 @@ void CellWidget::paintEvent(QPaintEvent*) {
   painter.setBrush(ground());
   painter.setPen(palette().color(QPalette::Text));
   painter.translate(content_.area.x, 0);
+  if (opens()) painter.setClipRect(qtRect({0, 0, content_.area.width, content_.area.height}));
   content_.group.paint(painter);
+  painter.setClipping(false);
   painter.translate(-content_.area.x, 0);
   paintAccessory(painter);
   paintLine(painter);

@@ -85,6 +85,7 @@ void QtNavigationStack::swapPage(Change change) {
 
 void QtNavigationStack::showBars() {
   widget_->bar().show(shown_->title(), backTitle());
+  widget_->updateFoot();
   widget_->toolbar().setItems(shown_->toolbarItems());
 }
 

@@ -5,8 +5,11 @@
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QVBoxLayout>
+#include <algorithm>
 
+#include "Platform/QtWidgets/BarButton.h"
 #include "Platform/QtWidgets/NavigationBar.h"
+#include "Platform/QtWidgets/TableWidget.h"
 #include "Platform/QtWidgets/Toolbar.h"
 
 namespace kelvasi {
@@ -45,6 +48,7 @@ StackWidget::StackWidget(std::function<void()> goBack)
   layout->addWidget(bar_);
   layout->addWidget(content_, 1);
   layout->addWidget(toolbar_);
+  content_->installEventFilter(this);
 }
 
 void StackWidget::showPage(QWidget& page) {
@@ -58,7 +62,33 @@ void StackWidget::showPage(QWidget& page) {
 
 void StackWidget::placePage() {
   if (layout()) layout()->activate();
-  if (page_) page_->setGeometry(content_->rect());
+  const QRect all = content_->rect();
+  const int high = heightOfFoot();
+  if (page_) page_->setGeometry(all.adjusted(0, 0, 0, -high));
+  if (!foot_) return;
+  foot_->setGeometry(all.left(), all.bottom() + 1 - high, all.width(), high);
+  foot_->setVisible(high > 0);
+}
+
+int StackWidget::heightOfFoot() const {
+  const auto* const table = dynamic_cast<TableWidget*>(page_.data());
+  if (!foot_ || !table || table->rows() == 0 || !bar_->backButton().isHidden()) return 0;
+  const int left = content_->height() - table->sizeHint().height();
+  return left < foot_->minimumSizeHint().height() ? 0 : std::min(left, foot_->sizeHint().height());
+}
+
+void StackWidget::setFoot(QWidget* foot) {
+  if (foot_ == foot) return placePage();
+  if (foot_) foot_->hide();
+  foot_ = foot;
+  if (foot) foot->setParent(content_);
+  placePage();
+}
+
+// A page that has other rows leaves another room.
+bool StackWidget::eventFilter(QObject* watched, QEvent* event) {
+  if (watched == content_ && event->type() == QEvent::LayoutRequest) placePage();
+  return QWidget::eventFilter(watched, event);
 }
 
 QRect StackWidget::slidingArea() const {

@@ -21,6 +21,10 @@ class StackWidget : public QWidget {
   Toolbar& toolbar() const { return *toolbar_; }
   // Shows `page` instead of the one before, which is hidden. Does not own it.
   void showPage(QWidget& page);
+  // Shown below the rows of the root page while these leave it the room it needs at least; null for none.
+  void setFoot(QWidget* foot);
+  // To be called when the page or its rows are others.
+  void updateFoot() { placePage(); }
   // Where bar and page are.
   QRect slidingArea() const;
 
@@ -29,15 +33,18 @@ class StackWidget : public QWidget {
   void mousePressEvent(QMouseEvent* event) override;
   void resizeEvent(QResizeEvent* event) override;
   bool event(QEvent* event) override;
+  bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
   void placePage();
+  int heightOfFoot() const;
 
   std::function<void()> goBack_;
   NavigationBar* bar_;  // children
   QWidget* content_;
   Toolbar* toolbar_;
   QPointer<QWidget> page_;
+  QPointer<QWidget> foot_;
 };
 
 }  // namespace kelvasi

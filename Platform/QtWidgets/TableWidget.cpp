@@ -17,6 +17,7 @@ namespace kelvasi {
 namespace {
 
 constexpr int deselectionTime = 300;
+constexpr int holdTime = 500;  // milliseconds
 
 CellWidget& widgetOf(const TableViewCell& cell) {
   return dynamic_cast<CellWidget&>(cell.body());
@@ -44,6 +45,13 @@ TableWidget::TableWidget(QWidget* parent)
   setFocusPolicy(Qt::StrongFocus);
   viewport()->setBackgroundRole(QPalette::Base);
   setUpScroller(*viewport());
+  hold_.setSingleShot(true);
+  hold_.setInterval(holdTime);
+  connect(&hold_, &QTimer::timeout, this, [this] {
+    const auto row = pressed_;
+    press(std::nullopt);
+    if (row) askMore(*row);
+  });
   fade_.setDuration(deselectionTime);
   fade_.setStartValue(1.0);
   fade_.setEndValue(0.0);
@@ -70,9 +78,11 @@ void TableWidget::reloadData() {
 void TableWidget::reloadNow() {
   needsReload_ = false;
   if (rows_ == 0) viewport()->update();
+  const std::size_t before = rows_;
   rows_ = source_ ? source_->tableViewNumberOfRowsInSection(*this, 0) : 0;
   if (selected_ && *selected_ >= rows_) selected_.reset();
   if (keyboard_ && *keyboard_ >= rows_) keyboard_ = rows_ > 0 ? std::optional(rows_ - 1) : std::nullopt;
+  if (rows_ != before) updateGeometry();
   fitRange();
   cells_.reload(rowsInSight(), [this](std::size_t row) { return askFor(row); });
   placeCells();

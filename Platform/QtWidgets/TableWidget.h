@@ -3,7 +3,9 @@
 #pragma once
 
 #include <QAbstractScrollArea>
+#include <QTimer>
 #include <QVariantAnimation>
+#include <algorithm>
 #include <optional>
 
 #include "Platform/QtWidgets/WidgetView.h"
@@ -38,6 +40,10 @@ class TableWidget : public QAbstractScrollArea, public TableView, public HasWidg
   QWidget& widget() override { return *this; }
   // What a tap on the row does.
   void open(std::size_t row);
+  // Marks the row as the one at which the keyboard is, and brings it into sight.
+  void goTo(std::size_t row) { moveKeyboardTo(std::min(row, rows_ - 1)); }
+  // In points of the viewport.
+  std::optional<std::size_t> rowUnder(const QPoint& place) const { return rowAt(place); }
   // The widget of a row; null when the row is not in sight.
   CellWidget* cellAt(std::size_t row) const;
   // In order from the top.
@@ -89,6 +95,7 @@ class TableWidget : public QAbstractScrollArea, public TableView, public HasWidg
   void press(std::optional<std::size_t> row);
   void moveKeyboardTo(std::size_t row);
   bool moveKeyboard(int key);
+  void askMore(std::size_t row);
   bool scrollSideways(int key);
   void setKeyboardInUse(bool inUse);
 
@@ -105,6 +112,7 @@ class TableWidget : public QAbstractScrollArea, public TableView, public HasWidg
   bool isKeyboardInUse_ = false;         // its row is marked only once it is used
   std::size_t fading_ = 0;               // the row that was deselected
   QVariantAnimation fade_;
+  QTimer hold_;
   ScrollIndicator* indicator_;  // a child
 };
 

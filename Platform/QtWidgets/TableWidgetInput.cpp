@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What fingers, mouse, wheel and keyboard do to a table.
 #include <QAccessible>
+#include <QContextMenuEvent>
+#include <QCoreApplication>
 #include <QFocusEvent>
 #include <QKeyEvent>
 #include <QMouseEvent>
@@ -66,6 +68,11 @@ void TableWidget::scrollTo(const QPointF& position) {
 
 void TableWidget::press(std::optional<std::size_t> row) {
   pressed_ = row;
+  if (row) {
+    hold_.start();
+  } else {
+    hold_.stop();
+  }
   markCells();
 }
 
@@ -86,8 +93,8 @@ void TableWidget::mouseMoveEvent(QMouseEvent* event) {
 
 void TableWidget::mouseReleaseEvent(QMouseEvent* event) {
   if (event->button() != Qt::LeftButton) return;
-  const auto row = std::exchange(pressed_, std::nullopt);
-  markCells();
+  const auto row = pressed_;
+  press(std::nullopt);
   if (row && rowAt(event->position()) == row) open(*row);
 }
 
@@ -104,10 +111,20 @@ void TableWidget::wheelEvent(QWheelEvent* event) {
 
 void TableWidget::keyPressEvent(QKeyEvent* event) {
   const int key = event->key();
-  const bool isOpening = key == Qt::Key_Return || key == Qt::Key_Enter || key == Qt::Key_Space;
+  const bool isOpening = key == Qt::Key_Return || key == Qt::Key_Enter;
   if (isOpening && keyboard_) return open(*keyboard_);
+  if (key == Qt::Key_Space && keyboard_) return askMore(*keyboard_);
   if (event->modifiers().testFlag(Qt::AltModifier)) return event->ignore();
   if (!moveKeyboard(key) && !scrollSideways(key)) event->ignore();
+}
+
+// As a right click on the row does; whoever knows more of rows answers.
+void TableWidget::askMore(std::size_t row) {
+  CellWidget* const cell = cellAt(row);
+  if (!cell) return;
+  const QPoint middle = cell->rect().center();
+  QContextMenuEvent asked(QContextMenuEvent::Keyboard, middle, cell->mapToGlobal(middle));
+  QCoreApplication::sendEvent(window(), &asked);
 }
 
 bool TableWidget::moveKeyboard(int key) {

@@ -37,6 +37,7 @@ void TopWidget::resizeEvent(QResizeEvent* event) {
 }
 
 void TopWidget::keyPressEvent(QKeyEvent* event) {
+  if (keys_ && keys_(*event)) return;
   const bool isControl = event->modifiers() == Qt::ControlModifier;
   if (event->key() == Qt::Key_F11) return isFullScreen() ? showWindowed() : showFilling();
   if (isControl && event->key() == Qt::Key_W) return static_cast<void>(close());

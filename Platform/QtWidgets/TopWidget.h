@@ -4,6 +4,7 @@
 #pragma once
 
 #include <QWidget>
+#include <functional>
 
 namespace kelvasi {
 
@@ -15,6 +16,8 @@ class TopWidget : public QWidget {
   QSize windowedSize() const { return windowedSize_; }
   void setWindowedSize(const QSize& size);
   void showFilling();
+  // Keys that nobody else took go to `keys` first, which says whether it took them.
+  void setKeys(std::function<bool(QKeyEvent& event)> keys) { keys_ = std::move(keys); }
 
  protected:
   void keyPressEvent(QKeyEvent* event) override;
@@ -24,6 +27,7 @@ class TopWidget : public QWidget {
   void showWindowed();
 
   QSize windowedSize_;
+  std::function<bool(QKeyEvent&)> keys_;
 };
 
 }  // namespace kelvasi

@@ -21,6 +21,9 @@
 #include "Platform/QtWidgets/StackWidget.h"
 #include "Platform/QtWidgets/TableWidget.h"
 #include "Platform/QtWidgets/Toolbar.h"
+#include "Tools/Kelvasi/Cockpit/CockpitFront.h"
+#include "Tools/Kelvasi/Cockpit/CockpitPane.h"
+#include "Tools/Kelvasi/Cockpit/SnapshotJson.h"
 
 namespace kelvasi {
 
@@ -79,10 +82,30 @@ QJsonValue noticeState() {
   return QJsonObject{{"message", notice->accessibleName()}, {"path", notice->accessibleDescription()}};
 }
 
+CockpitFront* cockpitFront() {
+  for (QObject* const child : window()->children())
+    if (auto* const front = dynamic_cast<CockpitFront*>(child)) return front;
+  return nullptr;
+}
+
+// What it shows where, and what it knows, as Cockpit/ says it.
+QJsonValue cockpitState() {
+  CockpitFront* const front = cockpitFront();
+  if (!front) return QJsonValue::Null;
+  QJsonObject state = jsonOf(cockpit::plistOf(front->snapshot())).toObject();
+  const CockpitPage* const page = front->shownPage();
+  state.insert("place", front->placeName());
+  state.insert("page", page ? QJsonValue(page->title()) : QJsonValue::Null);
+  state.insert("texts", page ? QJsonArray::fromStringList(page->texts()) : QJsonArray());
+  return state;
+}
+
 // Those of the alert or, without one, of the save view or, without that, of the panes.
 std::vector<QAbstractButton*> usableButtons() {
   const QWidget* in = findInWindow<AlertLayer>();
   if (!in) in = findInWindow<ModalLayer>();
+  const auto* const pane = findInWindow<CockpitPane>();
+  if (!in && pane && pane->isCovering()) in = pane;
   if (!in) in = window();
   std::vector<QAbstractButton*> usable;
   for (QAbstractButton* const button : in->findChildren<QAbstractButton*>()) {
@@ -147,7 +170,8 @@ QJsonObject shownState() {
           {"buttons", buttonTexts()},
           {"saveView", saveViewState()},
           {"alert", alertState()},
-          {"notice", noticeState()}};
+          {"notice", noticeState()},
+          {"cockpit", cockpitState()}};
 }
 
 bool isAtRoot() {

@@ -11,6 +11,8 @@ namespace {
 const QString sizeKey = QStringLiteral("Window/Size");
 const QString fillsKey = QStringLiteral("Window/FillsScreen");
 const QString branchesKey = QStringLiteral("Panes/Open");
+const QString pinsKey = QStringLiteral("Cockpit/Pins");
+const QString alarmsKey = QStringLiteral("Cockpit/Alarms");
 const QString appearanceKey = QStringLiteral("Appearance/Scheme");
 constexpr QSize smallest(240, 320);
 constexpr QSize largest(16384, 16384);
@@ -27,6 +29,18 @@ std::optional<ColourScheme> scheme(const QString& name) {
   return std::nullopt;
 }
 
+std::vector<std::string> texts(const QSettings& settings, const QString& key) {
+  std::vector<std::string> texts;
+  for (const QString& text : settings.value(key).toStringList()) texts.push_back(text.toStdString());
+  return texts;
+}
+
+QStringList listOf(const std::vector<std::string>& texts) {
+  QStringList list;
+  for (const std::string& text : texts) list.append(QString::fromStdString(text));
+  return list;
+}
+
 }  // namespace
 
 ViewerMemory readMemory(const std::string& file) {
@@ -35,9 +49,12 @@ ViewerMemory readMemory(const std::string& file) {
   ViewerMemory memory{.windowSize = windowSize(settings),
                       .fillsScreen = settings.value(fillsKey).toBool(),
                       .branches = {},
-                      .colourScheme = scheme(settings.value(appearanceKey).toString())};
-  for (const QString& name : settings.value(branchesKey).toStringList())
-    memory.branches.push_back(name.toStdString());
+                      .colourScheme = scheme(settings.value(appearanceKey).toString()),
+                      .pins = {},
+                      .alarms = {}};
+  memory.branches = texts(settings, branchesKey);
+  memory.pins = texts(settings, pinsKey);
+  memory.alarms = texts(settings, alarmsKey);
   return memory;
 }
 
@@ -46,9 +63,9 @@ void writeMemory(const std::string& file, const ViewerMemory& memory) {
   QSettings settings(QString::fromStdString(file), QSettings::IniFormat);
   if (memory.windowSize) settings.setValue(sizeKey, *memory.windowSize);
   settings.setValue(fillsKey, memory.fillsScreen);
-  QStringList branches;
-  for (const std::string& name : memory.branches) branches.append(QString::fromStdString(name));
-  settings.setValue(branchesKey, branches);
+  settings.setValue(branchesKey, listOf(memory.branches));
+  settings.setValue(pinsKey, listOf(memory.pins));
+  settings.setValue(alarmsKey, listOf(memory.alarms));
   settings.remove(appearanceKey);
   if (memory.colourScheme)
     settings.setValue(appearanceKey, *memory.colourScheme == ColourScheme::dark ? "dark" : "light");

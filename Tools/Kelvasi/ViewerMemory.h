@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the viewer remembers from run to run, in an INI file: the window's size and whether it fills the
-// screen, the panes that were open, and the appearance that was asked for.
+// screen, the panes that were open, the appearance that was asked for, and the cockpit's pins and alarms.
 #pragma once
 
 #include <QSize>
@@ -17,6 +17,8 @@ struct ViewerMemory {
   bool fillsScreen = false;
   std::vector<std::string> branches;  // names, from the root's child on
   std::optional<ColourScheme> colourScheme;
+  std::vector<std::string> pins;
+  std::vector<std::string> alarms;  // rules
 };
 
 // What the file does not hold, or holds in a form that makes no sense, is as it is in a new memory.

@@ -23,6 +23,7 @@
 #include "Platform/QtWidgets/QtUserInterface.h"
 #include "Platform/RateLimitedLog.h"
 #include "Tools/CommandLine.h"
+#include "Tools/Kelvasi/Cockpit/CockpitFront.h"
 #include "Tools/Kelvasi/Options.h"
 #include "Tools/Kelvasi/Script.h"
 #include "Tools/Kelvasi/TemplateNotice.h"
@@ -67,16 +68,26 @@ bool run(QtApplicationFramework& framework, const ViewerOptions& options) {
                                       application = made.get();
                                       return made;
                                     }}};
+  QPointer<CockpitFront> front;
   QObject::connect(qApp, &QCoreApplication::aboutToQuit, [&] {
     memory.branches = application->openBranches();
     if (const TopWidget* const window = ui.window()) {
       memory.windowSize = window->windowedSize();
       memory.fillsScreen = window->isFullScreen() && !options.fullScreen;
     }
+    if (front) {
+      memory.pins = front->cockpit().pinKeys();
+      memory.alarms = front->cockpit().alarmRules();
+    }
     writeMemory(memoryPath, memory);
   });
   const Script script(options.script);
-  queue.post([&] { noticeMissingTemplates(resources, ui); });  // when the window is there
+  queue.post([&] {  // when the window is there
+    front = new CockpitFront(*ui.window(), *application, clock);
+    front->cockpit().restorePins(memory.pins);
+    for (const std::string& rule : memory.alarms) front->cockpit().addAlarm(rule);
+    noticeMissingTemplates(resources, ui);
+  });
   framework.run(classes, "KelvasiApp", "KelvasiApp");
   return !script.hasFailed();
 }

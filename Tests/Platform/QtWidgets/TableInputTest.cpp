@@ -5,6 +5,7 @@
 #include <QWheelEvent>
 
 #include <QAbstractButton>
+#include <QContextMenuEvent>
 
 #include "Platform/QtWidgets/Toolbar.h"
 #include "Tests/Platform/QtWidgets/QtFixture.h"
@@ -86,15 +87,42 @@ TEST_F(TableInputTest, PageKeysMoveByAScreenfulLessARow) {
   EXPECT_EQ(markedRow(pane), 0U);
 }
 
-TEST_F(TableInputTest, EnterAndSpaceOpenTheMarkedRow) {
+TEST_F(TableInputTest, EnterOpensTheMarkedRow) {
   const RowsController& pane = showRows(5);
   key(Qt::Key_Down);
   key(Qt::Key_Return);
   key(Qt::Key_Down);
   key(Qt::Key_Enter);
+  EXPECT_THAT(pane.opened, ElementsAre(0, 1));
+}
+
+// Whoever knows more of a row takes it from the window.
+class AskedPlaces : public QObject {
+ public:
+  std::vector<QPoint> places;
+
+ protected:
+  bool eventFilter(QObject* watched, QEvent* event) override {
+    if (event->type() != QEvent::ContextMenu) return QObject::eventFilter(watched, event);
+    places.push_back(dynamic_cast<QContextMenuEvent&>(*event).globalPos());
+    return true;
+  }
+};
+
+TEST_F(TableInputTest, SpaceAndAHoldAskForMoreOfTheRowAndOpenNothing) {
+  const RowsController& pane = showRows(5);
+  AskedPlaces asked;
+  windowWidget().installEventFilter(&asked);
+  key(Qt::Key_Down);
   key(Qt::Key_Down);
   key(Qt::Key_Space);
-  EXPECT_THAT(pane.opened, ElementsAre(0, 1, 2));
+  const QPoint row(100, 60);
+  QTest::mousePress(tableOf(pane).viewport(), Qt::LeftButton, Qt::NoModifier, row);
+  ASSERT_TRUE(QTest::qWaitFor([&] { return asked.places.size() == 2; }, 60'000));
+  QTest::mouseRelease(tableOf(pane).viewport(), Qt::LeftButton, Qt::NoModifier, row);
+  for (const QPoint& place : asked.places)
+    EXPECT_EQ(tableOf(pane).rowUnder(tableOf(pane).viewport()->mapFromGlobal(place)), 1U);
+  EXPECT_THAT(pane.opened, ElementsAre());
 }
 
 TEST_F(TableInputTest, TheFirstTabGoesToTheRowsAndTheNextOnLeavesThem) {

@@ -1,0 +1,297 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "Tools/Kelvasi/Cockpit/CockpitFront.h"
+
+#include <QBoxLayout>
+#include <QContextMenuEvent>
+#include <QKeyEvent>
+#include <algorithm>
+#include <chrono>
+
+#include "Platform/QtWidgets/CellWidget.h"
+#include "Platform/QtWidgets/Layer.h"
+#include "Platform/QtWidgets/StackWidget.h"
+#include "Platform/QtWidgets/TableWidget.h"
+#include "Platform/QtWidgets/TopWidget.h"
+#include "Tools/Kelvasi/Cockpit/CockpitCard.h"
+#include "Tools/Kelvasi/Cockpit/CockpitPane.h"
+#include "Tools/OperatorFile.h"
+
+namespace kelvasi {
+
+namespace {
+
+using namespace std::chrono_literals;
+
+constexpr auto tickTime = 1s;
+constexpr int wide = 900;       // points, from which panes and cockpit stand beside each other
+constexpr int sideways = 560;   // the same, where the window is wider than high
+constexpr int paneWidth = 390;  // of the panes in a wide window
+constexpr int narrowPane = 320;
+constexpr int widestCockpit = 440;
+
+// The cockpit over all of the window.
+class CockpitLayer : public Layer {
+ public:
+  CockpitLayer(QWidget& window, QWidget& itsContent) : Layer(window), content_(itsContent) {
+    content_.setParent(this);
+    content_.setGeometry(rect());
+    content_.show();
+    show();
+    raise();
+  }
+
+ protected:
+  void resizeEvent(QResizeEvent*) override { content_.setGeometry(rect()); }
+
+ private:
+  QWidget& content_;
+};
+
+cockpit::CockpitSetUp setUp(const Clock& clock) {
+  cockpit::CockpitSetUp setUp;
+  setUp.style.minus = "\u2212";
+  setUp.style.eastOfUtc = [&clock](Arrival at) {
+    return std::chrono::seconds(clock.localZone({std::chrono::duration<double>(at).count()}).secondsFromGmt);
+  };
+  setUp.operators = loadOperators().operators;
+  return setUp;
+}
+
+StackWidget& stackOf(const QWidget& window) {
+  for (QWidget* const child : window.findChildren<QWidget*>())
+    if (auto* const stack = dynamic_cast<StackWidget*>(child)) return *stack;
+  throw std::logic_error("a window without panes");
+}
+
+bool isCovered(const QWidget& window, const QWidget* except) {
+  return std::ranges::any_of(window.children(), [except](QObject* child) {
+    const auto* const layer = dynamic_cast<Layer*>(child);
+    return layer && layer != except && !layer->isHidden();
+  });
+}
+
+}  // namespace
+
+CockpitFront::CockpitFront(TopWidget& window, KelvasiApp& app, const Clock& clock)
+    : QObject(&window),
+      window_(window),
+      app_(app),
+      clock_(clock),
+      cockpit_(std::make_unique<cockpit::Cockpit>(setUp(clock))),
+      pages_(std::make_unique<CockpitPages>(*cockpit_, *this)),
+      card_(new CockpitCard([this] { return snapshot(); }, [this] { open(); })),
+      pane_(new CockpitPane([this] { close(); })),
+      side_(new CockpitPane({})) {
+  pane_->setParent(&window);
+  pane_->hide();
+  pane_->setRoot(pages_->face(*pane_));
+  side_->setParent(&window);
+  side_->hide();
+  side_->setRoot(pages_->chart(*side_, {}));
+  stackOf(window).setFoot(card_);
+  window.setKeys([this](QKeyEvent& event) { return takeKey(event); });
+  window.installEventFilter(this);
+  app.model()->gatherReadings(
+      [this](const Readings& readings, const Intake& intake) { cockpit_->take(readings, intake); });
+  connect(&timer_, &QTimer::timeout, this, [this] { tick(); });
+  timer_.start(tickTime);
+  tellLink();
+  arrange();
+}
+
+CockpitFront::~CockpitFront() = default;
+
+Arrival CockpitFront::now() const {
+  return arrivalAt(clock_.now());
+}
+
+void CockpitFront::tick() {
+  if (!app_.model()) return;
+  tellLink();
+  cockpit_->pass(now());
+  refresh();
+}
+
+void CockpitFront::tellLink() {
+  const KelvasiModel& model = *app_.model();
+  if (!model.showsAnotherTechnology()) technologyOfPanes_ = model.technology();
+  cockpit_->hear({.source = cockpit::LinkReport::Source::daemon,
+                  .isConnected = model.isConnected(),
+                  .reason = model.isConnected() ? "" : "the daemon has not answered",
+                  .technology = model.technology(),
+                  .panes = model.showsAnotherTechnology() ? technologyOfPanes_ : ""});
+}
+
+void CockpitFront::refresh() {
+  card_->refresh();
+  pane_->refresh();
+  side_->refresh();
+}
+
+const char* CockpitFront::placeName() const {
+  if (layer_) return "full";
+  if (pane_->isVisible()) return "beside";
+  return card_->isVisible() ? "card" : "none";
+}
+
+const CockpitPage* CockpitFront::shownPage() const {
+  return pane_->isVisible() ? &pane_->top() : nullptr;
+}
+
+bool CockpitFront::eventFilter(QObject* watched, QEvent* event) {
+  if (watched == &window_ && event->type() == QEvent::Resize) arrange();
+  if (watched == &window_ && event->type() == QEvent::ContextMenu) {
+    auto& menu = dynamic_cast<QContextMenuEvent&>(*event);
+    return askMore(menu.globalPos());
+  }
+  return QObject::eventFilter(watched, event);
+}
+
+// Beside the panes where there is room for both.
+void CockpitFront::arrange() {
+  if (layer_) return;
+  auto* const layout = qobject_cast<QBoxLayout*>(window_.layout());
+  QWidget& panes = *layout->itemAt(0)->widget();
+  const int width = window_.width();
+  const bool isSideways = width >= sideways && width > window_.height();
+  const bool isBeside = width >= wide || isSideways;
+  layout->setDirection(QBoxLayout::LeftToRight);
+  layout->setSpacing(isBeside ? 1 : 0);
+  if (isBeside) {
+    panes.setFixedWidth(width < wide ? width / 2 : width < 3 * paneWidth ? narrowPane : paneWidth);
+    layout->addWidget(pane_, 1);
+    pane_->setCovering(false);
+    pane_->show();
+    pane_->refresh();
+  } else {
+    panes.setMinimumWidth(0);
+    panes.setMaximumWidth(QWIDGETSIZE_MAX);
+    layout->removeWidget(pane_);
+    pane_->hide();
+  }
+  arrangeChart(width >= wide);
+  stackOf(window_).setFoot(isBeside ? nullptr : card_);
+}
+
+void CockpitFront::arrangeChart(bool isBeside) {
+  auto* const layout = qobject_cast<QBoxLayout*>(window_.layout());
+  pane_->setMaximumWidth(isBeside ? widestCockpit : QWIDGETSIZE_MAX);
+  if (isBeside) {
+    layout->addWidget(side_, 1);
+  } else {
+    layout->removeWidget(side_);
+  }
+  side_->setVisible(isBeside);
+  side_->refresh();
+}
+
+void CockpitFront::open() {
+  if (pane_->isVisible()) return pane_->top().firstFocus().setFocus();
+  layer_ = new CockpitLayer(window_, *pane_);
+  pane_->setCovering(true);
+  pane_->refresh();
+  pane_->top().firstFocus().setFocus();
+}
+
+void CockpitFront::close() {
+  if (!layer_) return;
+  pane_->goToRoot();
+  pane_->hide();
+  pane_->setParent(&window_);
+  Layer* const gone = layer_;
+  layer_ = nullptr;
+  delete gone;  // NOLINT(cppcoreguidelines-owning-memory): the window's child
+  arrange();
+  refresh();
+}
+
+void CockpitFront::openPane(const std::string& nodePath) {
+  close();
+  if (!layer_ && pane_->isVisible()) pane_->goToRoot();
+  const auto row = app_.openPath(nodePath);
+  for (QWidget* const child : window_.findChildren<QWidget*>()) {
+    auto* const table = dynamic_cast<TableWidget*>(child);
+    if (!table || !table->isVisible()) continue;
+    table->setFocus(Qt::OtherFocusReason);
+    if (row) table->goTo(*row);
+    return;
+  }
+}
+
+CockpitPane& CockpitFront::pageHolder() {
+  open();
+  return *pane_;
+}
+
+bool CockpitFront::takeKey(QKeyEvent& event) {
+  if (isCovered(window_, layer_)) return false;
+  if ((event.modifiers() & ~(Qt::ShiftModifier | Qt::KeypadModifier)) != 0) return false;
+  switch (event.key()) {
+    case Qt::Key_O:
+      if (layer_) {
+        close();
+      } else {
+        open();
+      }
+      return true;
+    case Qt::Key_Slash:
+      pages_->openSearch(pageHolder());
+      return true;
+    case Qt::Key_Question:
+      pages_->openKeys(pageHolder());
+      return true;
+    case Qt::Key_G:
+      if (!side_->isVisible()) pages_->openChart(pageHolder(), {});
+      if (side_->isVisible()) side_->top().setFocus();
+      return true;
+    case Qt::Key_A:
+      pages_->openAlarms(pageHolder());
+      return true;
+    case Qt::Key_Asterisk:
+      return pinRow();
+    case Qt::Key_E:
+      pages_->openEvents(pageHolder());
+      return true;
+    case Qt::Key_M:
+      pages_->openNote(pageHolder());
+      return true;
+    default:
+      return false;
+  }
+}
+
+// Of the row under a place of the screen.
+bool CockpitFront::askMore(const QPoint& place) {
+  if (isCovered(window_, nullptr)) return false;
+  for (QWidget* at = window_.childAt(window_.mapFromGlobal(place)); at; at = at->parentWidget()) {
+    auto* const table = dynamic_cast<TableWidget*>(at);
+    if (!table) continue;
+    const auto row = table->rowUnder(table->viewport()->mapFromGlobal(place));
+    return row && openSheetOf(*table, *row);
+  }
+  return false;
+}
+
+// Of the row at which the keyboard is.
+bool CockpitFront::pinRow() {
+  for (QWidget* const child : window_.findChildren<QWidget*>()) {
+    auto* const table = dynamic_cast<TableWidget*>(child);
+    const CellWidget* const cell = table && table->isVisible() ? table->cellAtKeyboard() : nullptr;
+    if (!cell) continue;
+    const auto path = cockpit_->rowPath(app_.pathOfRow(cell->row()));
+    if (path) pages_->togglePin(*path);
+    refresh();
+    return path.has_value();
+  }
+  return false;
+}
+
+bool CockpitFront::openSheetOf(TableWidget& table, std::size_t row) {
+  const CellWidget* const cell = table.cellAt(row);
+  if (!cell) return false;
+  const auto path = cockpit_->rowPath(app_.pathOfRow(row));
+  if (path) pages_->openSheet(pageHolder(), *path);
+  return path.has_value();
+}
+
+}  // namespace kelvasi

@@ -1,0 +1,74 @@
+// SPDX-License-Identifier: Apache-2.0
+// The cockpit in the viewer's window: feeds it, gives it the room that there is and takes its keys.
+//   on a phone        a card below the root pane's rows; O fills the window
+//   held sideways     panes and cockpit beside each other
+//   from 900 points   panes, cockpit and charts beside each other
+#pragma once
+
+#include <QJsonObject>
+#include <QPointer>
+#include <QTimer>
+#include <QWidget>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "App/KelvasiApp.h"
+#include "Cockpit/Cockpit.h"
+#include "Platform/Clock.h"
+#include "Tools/Kelvasi/Cockpit/CockpitPages.h"
+
+namespace kelvasi {
+
+class CockpitCard;
+class CockpitPane;
+class Layer;
+class TopWidget;
+
+// A child of the window, which it outlives in nothing.
+class CockpitFront : public QObject, public CockpitPages::Host {
+ public:
+  CockpitFront(TopWidget& window, KelvasiApp& app, const Clock& clock);
+  ~CockpitFront() override;
+
+  cockpit::Cockpit& cockpit() { return *cockpit_; }
+  // What is shown of it where: "card", "full", "beside" or "none".
+  const char* placeName() const;
+  // The page on top; null where only the card or nothing is shown.
+  const CockpitPage* shownPage() const;
+  cockpit::Snapshot snapshot() { return cockpit_->at(now()); }
+
+ protected:
+  bool eventFilter(QObject* watched, QEvent* event) override;
+
+ private:
+  Arrival now() const override;
+  void openPane(const std::string& nodePath) override;
+
+  void tick();
+  void tellLink();
+  void refresh();
+  void arrange();
+  void arrangeChart(bool isBeside);
+  bool pinRow();
+  void open();
+  void close();
+  CockpitPane& pageHolder();
+  bool takeKey(QKeyEvent& event);
+  bool askMore(const QPoint& place);
+  bool openSheetOf(class TableWidget& table, std::size_t row);
+
+  TopWidget& window_;
+  KelvasiApp& app_;
+  const Clock& clock_;
+  std::unique_ptr<cockpit::Cockpit> cockpit_;
+  std::unique_ptr<CockpitPages> pages_;
+  CockpitCard* card_;  // children of the window
+  CockpitPane* pane_;
+  CockpitPane* side_;  // the chart beside the cockpit
+  QPointer<Layer> layer_;
+  std::string technologyOfPanes_;
+  QTimer timer_;
+};
+
+}  // namespace kelvasi
