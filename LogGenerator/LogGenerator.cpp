@@ -2,7 +2,6 @@
 #include "LogGenerator/LogGenerator.h"
 
 #include <array>
-#include <bit>
 #include <utility>
 
 #include "LogGenerator/Exceptions.h"
@@ -16,29 +15,18 @@ namespace {
 
 constexpr std::size_t historyLimit = 5;
 
-// The texts of a moment are made when somebody looks, as an entry is seldom looked at.
-std::string dateText(const void*, std::int64_t moment) {
-  return description(PlistDate{std::bit_cast<double>(moment)});
-}
-
-std::string snapshotText(const void*, std::int64_t moment) {
-  return "Snapshot (" + dateText(nullptr, moment) + ")";
-}
-
-PlistValue historyEntry(const PlistDictionary& state, PlistDate date) {
-  const auto moment = std::bit_cast<std::int64_t>(date.secondsSince1970);
-  std::array entries{
+PlistValue historyEntry(const PlistDictionary& state, const std::string& date) {
+  const std::array entries{
       std::pair{"DisplayState", state.get("DisplayState").shallowCopy()},
       std::pair{"Display", state.get("Display").shallowCopy()},
       std::pair{"ExtraInfo", state.get("ExtraInfo").shallowCopy()},
-      std::pair{"Date", PlistValue(DeferredText{dateText, nullptr, moment})},
-      std::pair{"Description", PlistValue(DeferredText{snapshotText, nullptr, moment})},
+      std::pair{"Date", PlistValue(date)},
+      std::pair{"Description", PlistValue("Snapshot (" + date + ")")},
   };
   const auto entry = PlistDictionary::make();
-  entry->reserve(entries.size());
-  for (auto& [key, value] : entries) {
+  for (const auto& [key, value] : entries) {
     if (value.isAbsent()) break;
-    entry->set(key, std::move(value));
+    entry->set(key, value);
   }
   return entry;
 }
@@ -75,7 +63,7 @@ void LogGenerator::updateHistoryInState(PlistDictionary& state, const Clock& clo
   if (!state.get("History").array()) state.set("History", PlistArray::make());
   PlistArray& history = *state.get("History").array();
   if (history.size() >= historyLimit) history.removeFirst(history.size() - (historyLimit - 1));
-  history.append(historyEntry(state, clock.now()));
+  history.append(historyEntry(state, description(clock.now())));
 }
 
 }  // namespace kelvasi

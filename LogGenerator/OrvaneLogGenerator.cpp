@@ -41,9 +41,7 @@ void OrvaneLogGenerator::appendRawMessage(std::span<const std::uint8_t> message)
 }
 
 void OrvaneLogGenerator::moveRawMessagesInto(PlistDictionary& state) {
-  const std::size_t expected = binData_.size();  // intervals are much alike
   state.set("DisplayState", std::exchange(binData_, {}));
-  binData_.reserve(expected);
 }
 
 }  // namespace kelvasi

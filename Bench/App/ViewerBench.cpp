@@ -39,6 +39,7 @@ struct NoSave : SaveShell {
   bool allowSaveButton() const override { return true; }
   void showSaveView() override {}
   void closeSaveView() override {}
+  void keepDescription(std::string) override {}
 };
 
 // The path of the branch with the most rows.
