@@ -15,8 +15,8 @@ bool isWindowStill();
 
 // The top pane under "title", "back" (empty at the root), "status", "busy" and "rows", the
 // texts of the buttons that can be used under "buttons", the save view under "saveView" and the alert under
-// "alert", and what a notice says of a file under "notice" (each null where there is none). A row is the list
-// of its texts; only rows in sight are listed.
+// "alert", what the cockpit knows and shows under "cockpit", and what a notice says of a file under "notice"
+// (each null where there is none). A row is the list of its texts; only rows in sight are listed.
 QJsonObject shownState();
 QString shownStatus();
 // Whether there is no way back.
