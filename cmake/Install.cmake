@@ -3,24 +3,37 @@
 set(RESOURCES ${PROJECT_SOURCE_DIR}/Resources)
 
 install(TARGETS kelvasi kelvasictl telvon-sim)
-install(DIRECTORY ${RESOURCES}/ DESTINATION ${CMAKE_INSTALL_DATADIR}/kelvasi FILES_MATCHING PATTERN "*.plist")
+install(DIRECTORY ${RESOURCES}/ DESTINATION ${CMAKE_INSTALL_DATADIR}/kelvasi FILES_MATCHING PATTERN "*.plist"
+        PATTERN systemd EXCLUDE)
 
-# kelvasi_installed(DIRECTORY FILE...): files of the source tree, with what the configuration knows where they end in .in.
+# kelvasi_installed(DIRECTORY FILE...): files of the source tree. One whose name ends in .in is told where the programs are,
+# which is known when it is installed.
 function(kelvasi_installed DIRECTORY)
   foreach(FILE ${ARGN})
     cmake_path(GET FILE FILENAME NAME)
     if(NAME MATCHES "\\.in$")
       string(REGEX REPLACE "\\.in$" "" NAME ${NAME})
-      configure_file(${FILE} ${PROJECT_BINARY_DIR}/Installed/${NAME} @ONLY)
-      set(FILE ${PROJECT_BINARY_DIR}/Installed/${NAME})
+      set(TOLD ${PROJECT_BINARY_DIR}/Installed/${NAME})
+      install(CODE "set(BINDIR \"${CMAKE_INSTALL_BINDIR}\")
+        cmake_path(ABSOLUTE_PATH BINDIR BASE_DIRECTORY \"\${CMAKE_INSTALL_PREFIX}\")
+        configure_file(\"${FILE}\" \"${TOLD}\" @ONLY)")
+      set(FILE ${TOLD})
     endif()
     install(FILES ${FILE} DESTINATION ${DIRECTORY})
   endforeach()
 endfunction()
 
+# Beside a viewer in /usr these are where desktops and systemd look.
 set(NAME org.kelvasi.Kelvasi)
-kelvasi_installed(${CMAKE_INSTALL_DATADIR}/applications ${RESOURCES}/${NAME}.desktop)
-kelvasi_installed(${CMAKE_INSTALL_DATADIR}/icons/hicolor/scalable/apps ${RESOURCES}/${NAME}.svg)
+set(SHARE ${CMAKE_INSTALL_DATADIR})
+kelvasi_installed(${SHARE}/applications ${RESOURCES}/${NAME}.desktop)
+kelvasi_installed(${SHARE}/icons/hicolor/scalable/apps ${RESOURCES}/${NAME}.svg)
+kelvasi_installed(${SHARE}/icons/hicolor/symbolic/apps ${RESOURCES}/${NAME}-symbolic.svg)
+kelvasi_installed(${SHARE}/metainfo ${RESOURCES}/${NAME}.metainfo.xml)
+install(FILES ${RESOURCES}/${NAME}.mime.xml DESTINATION ${SHARE}/mime/packages RENAME ${NAME}.xml)
+foreach(UNIT telvon-sim kelvasi-record kelvasi-kiosk)
+  kelvasi_installed(lib/systemd/user ${RESOURCES}/systemd/${UNIT}.service.in)
+endforeach()
 
 file(GLOB NOTICES CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/Notices/*)
 install(FILES ${PROJECT_SOURCE_DIR}/LICENSES/Apache-2.0.txt DESTINATION ${CMAKE_INSTALL_DOCDIR} RENAME LICENSE)

@@ -19,8 +19,11 @@ SOURCES = pathlib.Path(os.environ["SOURCES"])
 
 PROGRAMS = {"bin/kelvasi", "bin/kelvasictl", "bin/telvon-sim"}
 TEMPLATES = {f"share/kelvasi/{name}" for name in ("C2KTemplate.plist", "LTE.plist", "Orvane_GSM.plist", "UTRAN.plist")}
-DESKTOP = {"share/applications/org.kelvasi.Kelvasi.desktop",
-           "share/icons/hicolor/scalable/apps/org.kelvasi.Kelvasi.svg"}
+DESKTOP = {f"share/{name}" for name in (
+    "applications/org.kelvasi.Kelvasi.desktop", "icons/hicolor/scalable/apps/org.kelvasi.Kelvasi.svg",
+    "icons/hicolor/symbolic/apps/org.kelvasi.Kelvasi-symbolic.svg", "metainfo/org.kelvasi.Kelvasi.metainfo.xml",
+    "mime/packages/org.kelvasi.Kelvasi.xml")}
+UNITS = {f"lib/systemd/user/{name}.service" for name in ("kelvasi-kiosk", "kelvasi-record", "telvon-sim")}
 DOCUMENTS = {f"share/doc/kelvasi/{name}" for name in (
     "LICENSE", "CHANGELOG.md", "Notices/README.md", "Notices/LICENSE.CLI11", "Notices/LICENSE.LGPL-2.1",
     "Notices/LICENSE.nlohmann-json")}
@@ -67,7 +70,7 @@ class Installed(LiveTest):
 
     def test_the_programs_and_what_they_need_are_there(self):
         files = {str(path.relative_to(self.prefix)) for path in self.prefix.rglob("*") if path.is_file()}
-        self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | DOCUMENTS)
+        self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | UNITS | DOCUMENTS)
 
     def test_all_of_it_is_taken_away_again_and_nothing_else(self):
         with tempfile.TemporaryDirectory() as root:
