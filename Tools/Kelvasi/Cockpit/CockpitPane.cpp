@@ -9,6 +9,7 @@ namespace kelvasi {
 
 CockpitPane::CockpitPane(std::function<void()> leave)
     : leave_(std::move(leave)), bar_(new NavigationBar(this, [this] { goBack(); })) {
+  setAttribute(Qt::WA_DeleteOnClose);  // goes with the window
   setAutoFillBackground(true);
   setBackgroundRole(QPalette::Base);
 }
