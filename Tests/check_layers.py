@@ -3,8 +3,8 @@
 """Checks the one rule of direction: a folder includes only what stands below it.
 
 Also that no headers include each other in a circle, that one technology includes nothing of another, that headers
-other than the C++ standard library's are included only where the platform, captures or tools are, that every test is
-built, and that every source names its licence.
+other than the C++ standard library's are included only where the platform, captures or tools are, that what is costly
+to compile is included by few, that every test is built, and that every source names its licence.
 """
 
 import pathlib
@@ -23,6 +23,8 @@ OPENING_HEADERS = {"fcntl.h", "fstream", "sys/socket.h", "sys/eventfd.h", "sys/s
                    "sys/inotify.h", "QFile", "QSaveFile", "QTemporaryFile", "QLocalSocket", "QLocalServer"}
 OPENING = re.compile(r"\b(fopen|fdopen|freopen|tmpfile|mko?stemp|openat2?|popen|pipe2?|dup[23]?|opendir|gzd?open|"
                      r"pcap_(?:open_(?:offline|live)|create|dump_open)\w*)\s*\(")
+# Headers that cost seconds in every source, and who alone may include them.
+COSTLY = {"CLI/CLI.hpp": {"Tools/CommandLine.cpp", "Tools/OptionSet.cpp", "Tools/OptionTable.h"}}
 LICENCE = "SPDX-License-Identifier: Apache-2.0"
 STANDARD = re.compile(r"^[a-z_]+$")  # <vector>, <cstdint>; neither <syslog.h> nor <QTimer>
 
@@ -69,6 +71,12 @@ def faults_of_opening(path: pathlib.Path):
         match = OPENING.search(line)
         if match:
             yield f"{path}:{number}: {match[1]}() opens a descriptor, which is the platform's to do"
+
+
+def faults_of_cost(path: pathlib.Path):
+    for place, _, name in includes(path):
+        if str(path) not in COSTLY.get(name, {str(path)}):
+            yield f"{place}: <{name}> takes seconds to compile; {', '.join(sorted(COSTLY[name]))} stand for it"
 
 
 # What several technologies need lies in a room of its own, as Daemon/ does.
@@ -128,7 +136,7 @@ def main() -> int:
     house = list(sources(HOUSE))
     found = [fault for path in house for check in (faults_of_direction, faults_of_opening) for fault in check(path)]
     for path in [*house, *sources(MIRRORS)]:
-        found += [*faults_of_technology(path), *faults_of_licence(path)]
+        found += [*faults_of_technology(path), *faults_of_cost(path), *faults_of_licence(path)]
     found += faults_of_circle([*house, *sources(MIRRORS)])
     found += tests_not_built()
     for fault in found:

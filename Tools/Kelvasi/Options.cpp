@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasi/Options.h"
 
-#include <CLI/CLI.hpp>
 #include <cstdlib>
 #include <filesystem>
 #include <stdexcept>
@@ -27,12 +26,11 @@ std::optional<std::filesystem::path> stateDirectory() {
 
 }  // namespace
 
-void declareOptions(CLI::App& app, ViewerOptions& options) {
-  app.add_flag("--fullscreen", options.fullScreen,
-               "fill the screen; a window of 390 by 844 points otherwise");
-  app.add_flag("--log-stderr", options.logsToStderr,
-               R"(system-log lines go to the standard error, as "<N>text", instead of to syslog)");
-  app.add_option_function<std::string>(
+void declareOptions(OptionSet app, ViewerOptions& options) {
+  app.addFlag("--fullscreen", options.fullScreen, "fill the screen; a window of 390 by 844 points otherwise");
+  app.addFlag("--log-stderr", options.logsToStderr,
+              R"(system-log lines go to the standard error, as "<N>text", instead of to syslog)");
+  app.addReader<std::string>(
          "--appearance",
          [&options](const std::string& name) {
            options.followsDesktop = name == "desktop";
@@ -40,19 +38,18 @@ void declareOptions(CLI::App& app, ViewerOptions& options) {
            if (name == "light") options.colourScheme = ColourScheme::light;
          },
          "remembered for the next start; the desktop's unless stated")
-      ->type_name("SCHEME")
-      ->transform(CLI::IsMember({"dark", "light", "desktop"}, CLI::ignore_case));
-  app.add_option("--text-scale", options.textScale,
-                 "how large texts are, 1 for as usual; the desktop's text size unless stated")
-      ->type_name("FACTOR")
-      ->check(CLI::Range(0.5, 3.0));
-  app.add_option("--memory", options.memory,
-                 "remember window, panes and appearance in this file; a script remembers nothing without it")
-      ->type_name("FILE");
-  app.add_option(
-         "--script", options.script,
-         "lead the window through the commands of a file (Docs/viewer-script.md); - is the standard input")
-      ->type_name("FILE");
+      .type("SCHEME")
+      .oneOfInAnyCase({"dark", "light", "desktop"});
+  app.add("--text-scale", options.textScale,
+          "how large texts are, 1 for as usual; the desktop's text size unless stated")
+      .type("FACTOR")
+      .between(0.5, 3, "from 0.5 to 3");
+  app.add("--memory", options.memory,
+          "remember window, panes and appearance in this file; a script remembers nothing without it")
+      .type("FILE");
+  app.add("--script", options.script,
+          "lead the window through the commands of a file (Docs/viewer-script.md); - is the standard input")
+      .type("FILE");
 }
 
 bool hasDisplay() {

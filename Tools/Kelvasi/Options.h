@@ -6,10 +6,7 @@
 #include <string>
 
 #include "Platform/QtWidgets/Palettes.h"
-
-namespace CLI {
-class App;
-}
+#include "Tools/OptionSet.h"
 
 namespace kelvasi {
 
@@ -23,7 +20,7 @@ struct ViewerOptions {
   std::string script;  // the name of a file; "-" for the standard input, empty for none
 };
 
-void declareOptions(CLI::App& app, ViewerOptions& options);
+void declareOptions(OptionSet app, ViewerOptions& options);
 
 // Whether a display is named, or Qt is told to do without one (QT_QPA_PLATFORM).
 bool hasDisplay();

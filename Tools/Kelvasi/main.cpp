@@ -106,7 +106,7 @@ int main(int argumentCount, char** arguments) {
   kelvasi::keepLargeBlocksApart();
   kelvasi::CommandLine commandLine("kelvasi", "Shows what the cellular modem is doing right now.");
   kelvasi::ViewerOptions options;
-  kelvasi::declareOptions(commandLine.app(), options);
+  kelvasi::declareOptions(commandLine.options(), options);
   if (const auto status = commandLine.parse(argumentCount, arguments)) return *status;
   if (!kelvasi::hasDisplay()) {
     std::fprintf(stderr, "kelvasi: there is no display (neither WAYLAND_DISPLAY nor DISPLAY is set)\n");

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl alarms: watches captures or a live link by rules, and runs a program for each alarm.
-#include <CLI/CLI.hpp>
 #include <atomic>
 #include <variant>
 
@@ -11,7 +10,6 @@
 #include "Tools/Kelvasictl/SurveyRun.h"
 #include "Tools/Kelvasictl/ToolError.h"
 #include "Tools/Kelvasictl/Verb.h"
-#include "Tools/NumberCheck.h"
 
 namespace kelvasi {
 
@@ -113,28 +111,27 @@ std::string checkRule(const std::string& text) {
 
 }  // namespace
 
-Action declareAlarms(CLI::App& verb) {
+Action declareAlarms(OptionSet verb) {
   const auto options = std::make_shared<AlarmsOptions>();
-  verb.add_option("--rule", options->rules, "what is an alarm, see below; may be given again")
-      ->type_name("RULE")
-      ->allow_extra_args(false)
-      ->required()
-      ->check(CLI::Validator(checkRule, ""));
-  auto* command =
-      verb.add_option("--run", options->command, "run this program for each alarm, without a shell")
-          ->type_name("COMMAND");
-  verb.add_option("--argument", options->arguments, "an argument of the program; may be given again")
-      ->type_name("TEXT")
-      ->allow_extra_args(false)
-      ->needs(command);
-  verb.add_option("--run-every", options->runEvery,
-                  "run it at most once in so many seconds, by the alarms' own time; otherwise 10")
-      ->type_name("N")
-      ->check(numberBetween(0, 1e9, "from 0 to 1000000000"))
-      ->needs(command);
+  verb.add("--rule", options->rules, "what is an alarm, see below; may be given again")
+      .type("RULE")
+      .oneValueEach()
+      .required()
+      .check(checkRule);
+  Option command =
+      verb.add("--run", options->command, "run this program for each alarm, without a shell").type("COMMAND");
+  verb.add("--argument", options->arguments, "an argument of the program; may be given again")
+      .type("TEXT")
+      .oneValueEach()
+      .needs(command);
+  verb.add("--run-every", options->runEvery,
+           "run it at most once in so many seconds, by the alarms' own time; otherwise 10")
+      .type("N")
+      .between(0, 1e9, "from 0 to 1000000000")
+      .needs(command);
   options->survey.addTo(verb);
-  options->survey.addJobsTo(verb)->excludes(command);
-  verb.footer(footer);
+  options->survey.addJobsTo(verb).excludes(command);
+  verb.setFooter(footer);
   return [options](MessageTally& tally) { return AlarmsVerb(*options).run(tally); };
 }
 

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl cells: the cells of captures or of a live link.
-#include <CLI/CLI.hpp>
 
 #include "Tools/Kelvasictl/CellRecords.h"
 #include "Tools/Kelvasictl/MessageTally.h"
@@ -41,11 +40,11 @@ int run(const SurveyOptions& options, MessageTally& tally) {
 
 }  // namespace
 
-Action declareCells(CLI::App& verb) {
+Action declareCells(OptionSet verb) {
   const auto options = std::make_shared<SurveyOptions>();
   options->addTo(verb);
   options->addJobsTo(verb);
-  verb.footer(footer);
+  verb.setFooter(footer);
   return [options](MessageTally& tally) { return run(*options, tally); };
 }
 

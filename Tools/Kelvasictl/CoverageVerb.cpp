@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl coverage: what became of the messages of captures or of a live link.
-#include <CLI/CLI.hpp>
 
 #include "Tools/Kelvasictl/CoverageRecords.h"
 #include "Tools/Kelvasictl/MessageTally.h"
@@ -39,11 +38,11 @@ int run(const SurveyOptions& options, MessageTally& tally) {
 
 }  // namespace
 
-Action declareCoverage(CLI::App& verb) {
+Action declareCoverage(OptionSet verb) {
   const auto options = std::make_shared<SurveyOptions>();
   options->addTo(verb);
   options->addJobsTo(verb);
-  verb.footer(footer);
+  verb.setFooter(footer);
   return [options](MessageTally& tally) { return run(*options, tally); };
 }
 

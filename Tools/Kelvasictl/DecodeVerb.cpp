@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl decode: captures in, the display out.
-#include <CLI/CLI.hpp>
 #include <array>
 #include <filesystem>
 #include <system_error>
@@ -157,7 +156,7 @@ bool isSameFile(const std::string& capture, const std::string& output) {
 
 void refuseInput(const DecodeOptions& options, const char* option, const std::string& output) {
   for (const std::string& capture : options.captures) {
-    if (isSameFile(capture, output)) throw CLI::ValidationError(option, output + " is an input too");
+    if (isSameFile(capture, output)) throw WrongUsage(option, output + " is an input too");
   }
 }
 
@@ -166,36 +165,35 @@ std::string named(const std::string& file) {
   return file.empty() ? "the file's name is empty" : "";
 }
 
-void addOptions(CLI::App& verb, DecodeOptions& options) {
+void addOptions(OptionSet verb, DecodeOptions& options) {
   addTechnology(verb, options.technology);
-  verb.add_option("--format", options.format, "json (the default), tree (path TAB value), or plist")
-      ->type_name("FORMAT")
-      ->check(CLI::IsMember({"json", "tree", "plist"}));
-  verb.add_flag("--every-tick", options.everyTick,
-                R"(a JSON line {"time": ..., "display": ...} for each display tick)");
-  verb.add_option("--dlf", options.dlf, "also write the DLF file that a snapshot would hold")
-      ->type_name("FILE")
-      ->check(named);
-  verb.add_option("--snapshot", options.snapshot, "also write a snapshot")->type_name("FILE")->check(named);
-  verb.add_option("--description", options.description, "the snapshot's description")->type_name("TEXT");
-  verb.add_flag("--start-command", options.startCommand,
-                "print the command that starts the stream, as a property list, and end");
-  verb.add_option("CAPTURE", options.captures,
-                  "pcap, pcapng or DLF files or snapshots, in order; - is the standard input");
+  verb.add("--format", options.format, "json (the default), tree (path TAB value), or plist")
+      .type("FORMAT")
+      .oneOf({"json", "tree", "plist"});
+  verb.addFlag("--every-tick", options.everyTick,
+               R"(a JSON line {"time": ..., "display": ...} for each display tick)");
+  verb.add("--dlf", options.dlf, "also write the DLF file that a snapshot would hold")
+      .type("FILE")
+      .check(named);
+  verb.add("--snapshot", options.snapshot, "also write a snapshot").type("FILE").check(named);
+  verb.add("--description", options.description, "the snapshot's description").type("TEXT");
+  verb.addFlag("--start-command", options.startCommand,
+               "print the command that starts the stream, as a property list, and end");
+  verb.add("CAPTURE", options.captures,
+           "pcap, pcapng or DLF files or snapshots, in order; - is the standard input");
   options.surroundings.addTo(verb);
 }
 
 }  // namespace
 
-Action declareDecode(CLI::App& verb) {
+Action declareDecode(OptionSet verb) {
   const auto options = std::make_shared<DecodeOptions>();
   addOptions(verb, *options);
-  verb.callback([options] {
-    if (!options->startCommand && options->captures.empty()) throw CLI::RequiredError("CAPTURE");
+  verb.setCheck([options] {
+    if (!options->startCommand && options->captures.empty()) throw WrongUsage::missing("CAPTURE");
     if (options->startCommand && options->technology.empty())
-      throw CLI::ValidationError("--start-command", "needs --technology");
-    if (options->everyTick && options->format != "json")
-      throw CLI::ValidationError("--every-tick", "gives JSON only");
+      throw WrongUsage("--start-command", "needs --technology");
+    if (options->everyTick && options->format != "json") throw WrongUsage("--every-tick", "gives JSON only");
     refuseInput(*options, "--dlf", options->dlf);
     refuseInput(*options, "--snapshot", options->snapshot);
   });

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl events: what happened in captures or on a live link.
-#include <CLI/CLI.hpp>
 
 #include "Tools/Kelvasictl/EventRecords.h"
 #include "Tools/Kelvasictl/MessageTally.h"
@@ -37,11 +36,11 @@ int run(const SurveyOptions& options, MessageTally& tally) {
 
 }  // namespace
 
-Action declareEvents(CLI::App& verb) {
+Action declareEvents(OptionSet verb) {
   const auto options = std::make_shared<SurveyOptions>();
   options->addTo(verb);
   options->addJobsTo(verb);
-  verb.footer(footer);
+  verb.setFooter(footer);
   return [options](MessageTally& tally) { return run(*options, tally); };
 }
 

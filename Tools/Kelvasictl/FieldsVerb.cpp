@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl fields: every row of every technology, and what stands behind it.
-#include <CLI/CLI.hpp>
 
 #include "LogGenerator/LogGenerator.h"
 #include "Telvon/TechnologyName.h"
@@ -37,12 +36,12 @@ int run(const FieldsOptions& options) {
 
 }  // namespace
 
-Action declareFields(CLI::App& verb) {
+Action declareFields(OptionSet verb) {
   const auto options = std::make_shared<FieldsOptions>();
   addTechnology(verb, options->technology, "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2 only");
-  verb.add_option("--format", options->format, "json (the default) or markdown")
-      ->type_name("FORMAT")
-      ->check(CLI::IsMember({"json", "markdown"}));
+  verb.add("--format", options->format, "json (the default) or markdown")
+      .type("FORMAT")
+      .oneOf({"json", "markdown"});
   options->surroundings.addTo(verb);
   return [options](MessageTally&) { return run(*options); };
 }

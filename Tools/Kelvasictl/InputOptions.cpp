@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/InputOptions.h"
 
-#include <CLI/CLI.hpp>
-
 #include "Tools/Kelvasictl/TechnologyOption.h"
 
 namespace kelvasi {
@@ -16,29 +14,28 @@ std::string checkJobs(const std::string& text) {
 }
 
 void check(const InputOptions& options) {
-  if (!options.isLive && options.captures.empty()) throw CLI::RequiredError("CAPTURE or --live");
-  if (!options.isLive && options.live.seconds) throw CLI::ValidationError("--seconds", "needs --live");
+  if (!options.isLive && options.captures.empty()) throw WrongUsage::missing("CAPTURE or --live");
+  if (!options.isLive && options.live.seconds) throw WrongUsage("--seconds", "needs --live");
   if (!options.isLive) return;
-  if (!options.captures.empty()) throw CLI::ValidationError("--live", "takes no CAPTURE");
-  if (options.jobs) throw CLI::ValidationError("--jobs", "is for captures, not for --live");
-  if (!options.technology.empty())
-    throw CLI::ValidationError("--technology", "is told by the daemon with --live");
+  if (!options.captures.empty()) throw WrongUsage("--live", "takes no CAPTURE");
+  if (options.jobs) throw WrongUsage("--jobs", "is for captures, not for --live");
+  if (!options.technology.empty()) throw WrongUsage("--technology", "is told by the daemon with --live");
 }
 
 }  // namespace
 
-void InputOptions::addTo(CLI::App& verb, const std::string& severalCaptures) {
-  verb.add_option("CAPTURE", captures,
-                  "pcap, pcapng or DLF files or snapshots, gzip'd or zstd'd too; - is the standard input. " +
-                      severalCaptures);
+void InputOptions::addTo(OptionSet verb, const std::string& severalCaptures) {
+  verb.add("CAPTURE", captures,
+           "pcap, pcapng or DLF files or snapshots, gzip'd or zstd'd too; - is the standard input. " +
+               severalCaptures);
   addTechnology(verb, technology);
-  verb.add_flag("--live", isLive, "listen to a telephony daemon instead of reading captures");
+  verb.addFlag("--live", isLive, "listen to a telephony daemon instead of reading captures");
   live.addTo(verb);
-  verb.callback([this] { check(*this); });
+  verb.setCheck([this] { check(*this); });
 }
 
-CLI::Option* InputOptions::addJobsTo(CLI::App& verb, const std::string& help) {
-  return verb.add_option("--jobs", jobs, help)->type_name("N")->check(CLI::Validator(checkJobs, ""));
+Option InputOptions::addJobsTo(OptionSet verb, const std::string& help) {
+  return verb.add("--jobs", jobs, help).type("N").check(checkJobs);
 }
 
 }  // namespace kelvasi

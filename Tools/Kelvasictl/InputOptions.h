@@ -8,11 +8,6 @@
 
 #include "Tools/Kelvasictl/LiveSession.h"
 
-namespace CLI {
-class App;
-class Option;
-}  // namespace CLI
-
 namespace kelvasi {
 
 struct InputOptions {
@@ -23,8 +18,8 @@ struct InputOptions {
   LiveOptions live;
 
   // `severalCaptures` ends the help of CAPTURE: what becomes of several of them.
-  void addTo(CLI::App& verb, const std::string& severalCaptures);
-  CLI::Option* addJobsTo(CLI::App& verb, const std::string& help);
+  void addTo(OptionSet verb, const std::string& severalCaptures);
+  Option addJobsTo(OptionSet verb, const std::string& help);
 };
 
 }  // namespace kelvasi

@@ -1,13 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/LiveSession.h"
 
-#include <CLI/CLI.hpp>
 #include <utility>
 
 #include "Platform/Qt/RuntimeDirectory.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/ToolError.h"
-#include "Tools/NumberCheck.h"
 
 namespace kelvasi {
 
@@ -27,10 +25,10 @@ std::string aDaemonThere() {
 
 }  // namespace
 
-void LiveOptions::addTo(CLI::App& verb) {
-  verb.add_option("--seconds", seconds, "end after so many seconds; otherwise at SIGINT, SIGTERM or SIGHUP")
-      ->type_name("N")
-      ->check(numberBetween(0, 1e9, "from 0 to 1000000000"));
+void LiveOptions::addTo(OptionSet verb) {
+  verb.add("--seconds", seconds, "end after so many seconds; otherwise at SIGINT, SIGTERM or SIGHUP")
+      .type("N")
+      .between(0, 1e9, "from 0 to 1000000000");
   surroundings.addTo(verb);
 }
 

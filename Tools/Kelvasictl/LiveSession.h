@@ -20,7 +20,7 @@ struct LiveOptions {
   std::optional<double> seconds;  // nothing: until a signal
   SurroundingsOptions surroundings;
 
-  void addTo(CLI::App& verb);
+  void addTo(OptionSet verb);
 };
 
 class LiveSession {

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/LogCodeOptions.h"
 
-#include <CLI/CLI.hpp>
 #include <charconv>
 #include <optional>
 #include <string_view>
@@ -51,19 +50,18 @@ std::string checkRange(const std::string& text) {
 
 }  // namespace
 
-void LogCodeOptions::addTo(CLI::App& verb) {
-  verb.add_option(
-          "--code", codes,
-          "also ask for this log code, decimal or with 0x; may be given again. From 0xFF0000 on, codes "
-          "are those of the daemon's own records")
-      ->type_name("N")
-      ->allow_extra_args(false)
-      ->check(CLI::Validator(checkCode, ""));
-  verb.add_option("--all-codes", ranges,
-                  "also ask for all log codes of a range such as 0xB000-0xB1FF; may be given again")
-      ->type_name("FROM-TO")
-      ->allow_extra_args(false)
-      ->check(CLI::Validator(checkRange, ""));
+void LogCodeOptions::addTo(OptionSet verb) {
+  verb.add("--code", codes,
+           "also ask for this log code, decimal or with 0x; may be given again. From 0xFF0000 on, codes "
+           "are those of the daemon's own records")
+      .type("N")
+      .oneValueEach()
+      .check(checkCode);
+  verb.add("--all-codes", ranges,
+           "also ask for all log codes of a range such as 0xB000-0xB1FF; may be given again")
+      .type("FROM-TO")
+      .oneValueEach()
+      .check(checkRange);
 }
 
 std::vector<LogCode> LogCodeOptions::all() const {

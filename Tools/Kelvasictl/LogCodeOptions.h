@@ -6,10 +6,7 @@
 #include <vector>
 
 #include "LogGenerator/LogCode.h"
-
-namespace CLI {
-class App;
-}
+#include "Tools/OptionSet.h"
 
 namespace kelvasi {
 
@@ -17,7 +14,7 @@ struct LogCodeOptions {
   std::vector<std::string> codes;
   std::vector<std::string> ranges;
 
-  void addTo(CLI::App& verb);
+  void addTo(OptionSet verb);
   // Of options that were accepted, in their order.
   std::vector<LogCode> all() const;
 };

@@ -2,7 +2,6 @@
 // kelvasictl monitor: the display of a live link, at every update.
 #include <unistd.h>
 
-#include <CLI/CLI.hpp>
 #include <utility>
 
 #include "Platform/Clock.h"
@@ -93,15 +92,14 @@ class MonitorVerb {
 
 }  // namespace
 
-Action declareMonitor(CLI::App& verb) {
+Action declareMonitor(OptionSet verb) {
   const auto options = std::make_shared<MonitorOptions>();
-  verb.add_option(
-          "--format", options->format,
-          "tree (the default): path TAB value, redrawn on a terminal, \"---\" between updates elsewhere; "
-          "or json: a line {\"time\": ..., \"display\": ...}")
-      ->type_name("FORMAT")
-      ->check(CLI::IsMember({"tree", "json"}));
-  verb.add_flag("--once", options->once, "end after the first update");
+  verb.add("--format", options->format,
+           "tree (the default): path TAB value, redrawn on a terminal, \"---\" between updates elsewhere; "
+           "or json: a line {\"time\": ..., \"display\": ...}")
+      .type("FORMAT")
+      .oneOf({"tree", "json"});
+  verb.addFlag("--once", options->once, "end after the first update");
   options->live.addTo(verb);
   return [options](MessageTally& tally) { return MonitorVerb(*options).run(tally); };
 }

@@ -3,7 +3,6 @@
 
 #include <fnmatch.h>
 
-#include <CLI/CLI.hpp>
 #include <algorithm>
 #include <charconv>
 #include <cmath>
@@ -91,15 +90,15 @@ std::optional<Arrival> momentOfSeconds(const std::string& text) {
   return std::chrono::round<Arrival>(std::chrono::duration<double>(seconds));
 }
 
-void addMoment(CLI::App& verb, const char* name, const char* help, std::optional<Arrival>& moment) {
-  verb.add_option_function<std::string>(
+void addMoment(OptionSet verb, const char* name, const char* help, std::optional<Arrival>& moment) {
+  verb.addReader<std::string>(
           name,
           [name, &moment](const std::string& text) {
             moment = momentOf(text);
-            if (!moment) throw CLI::ValidationError(name, "\"" + text + "\" is no time");
+            if (!moment) throw WrongUsage(name, "\"" + text + "\" is no time");
           },
           help)
-      ->type_name("T");
+      .type("T");
 }
 
 }  // namespace
@@ -109,11 +108,10 @@ std::optional<Arrival> momentOf(const std::string& text) {
   return date ? date : momentOfSeconds(text);
 }
 
-void ReadingChoice::addTo(CLI::App& verb) {
-  verb.add_option("--select", globs_,
-                  "only readings whose path, section/row or quantity fits; with * ? and [...]")
-      ->type_name("GLOB")
-      ->allow_extra_args(false);
+void ReadingChoice::addTo(OptionSet verb) {
+  verb.add("--select", globs_, "only readings whose path, section/row or quantity fits; with * ? and [...]")
+      .type("GLOB")
+      .oneValueEach();
   addMoment(verb, "--from", "only messages from then on, as 2024-03-05T14:07:09Z or seconds since 1970",
             from_);
   addMoment(verb, "--to", "only messages up to then", to_);

@@ -7,16 +7,13 @@
 #include <vector>
 
 #include "LogGenerator/Readings.h"
-
-namespace CLI {
-class App;
-}
+#include "Tools/OptionSet.h"
 
 namespace kelvasi {
 
 class ReadingChoice {
  public:
-  void addTo(CLI::App& verb);
+  void addTo(OptionSet verb);
 
   // Of messages before `from` and after `to` none is.
   bool takesMessageAt(Arrival arrival) const {

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/ReadingPrinter.h"
 
-#include <CLI/CLI.hpp>
 #include <utility>
 
 #include "Telvon/TechnologyName.h"
@@ -14,12 +13,10 @@ constexpr std::size_t mostWaiting = std::size_t{1} << 16;
 
 }  // namespace
 
-void ReadingWish::addTo(CLI::App& verb) {
-  verb.add_option("--format", format, "ndjson (the default) or csv")
-      ->type_name("FORMAT")
-      ->check(CLI::IsMember({"ndjson", "csv"}));
+void ReadingWish::addTo(OptionSet verb) {
+  verb.add("--format", format, "ndjson (the default) or csv").type("FORMAT").oneOf({"ndjson", "csv"});
   choice.addTo(verb);
-  verb.add_flag("--changes", onlyChanges, "no line for a row that is written again as it stands");
+  verb.addFlag("--changes", onlyChanges, "no line for a row that is written again as it stands");
 }
 
 ReadingPrinter::ReadingPrinter(const ReadingWish& wish, Print print)

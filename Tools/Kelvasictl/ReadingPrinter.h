@@ -17,7 +17,7 @@ struct ReadingWish {
   std::string format = "ndjson";  // or "csv"
   bool onlyChanges = false;
 
-  void addTo(CLI::App& verb);
+  void addTo(OptionSet verb);
   ReadingLines lines() const {
     return ReadingLines(format == "csv" ? ReadingLines::Format::csv : ReadingLines::Format::ndjson);
   }

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl readings: every row that a message wrote or removed, a line each (Docs/readings.md).
-#include <CLI/CLI.hpp>
 #include <vector>
 
 #include "Tools/Kelvasictl/InputOptions.h"
@@ -79,13 +78,13 @@ int run(const ReadingsOptions& options, MessageTally& tally) {
 
 }  // namespace
 
-Action declareReadings(CLI::App& verb) {
+Action declareReadings(OptionSet verb) {
   const auto options = std::make_shared<ReadingsOptions>();
   options->input.addTo(verb, "Several are one run, in order, unless --jobs is given");
   options->input.addJobsTo(verb,
                            "each capture a run of its own, so many side by side; the output in their order");
   options->wish.addTo(verb);
-  verb.footer(footer);
+  verb.setFooter(footer);
   return [options](MessageTally& tally) { return run(*options, tally); };
 }
 

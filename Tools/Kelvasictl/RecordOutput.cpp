@@ -3,7 +3,6 @@
 
 #include <unistd.h>
 
-#include <CLI/CLI.hpp>
 #include <algorithm>
 #include <array>
 #include <cstdio>
@@ -105,11 +104,10 @@ std::string RecordOutput::tableLine(const Json& record) const {
   return line + "\n";
 }
 
-void FormatOption::addTo(CLI::App& verb) {
-  verb.add_option("--format", name,
-                  "table, ndjson or csv; otherwise a table on a terminal and NDJSON elsewhere")
-      ->type_name("FORMAT")
-      ->check(CLI::IsMember({"table", "ndjson", "csv"}));
+void FormatOption::addTo(OptionSet verb) {
+  verb.add("--format", name, "table, ndjson or csv; otherwise a table on a terminal and NDJSON elsewhere")
+      .type("FORMAT")
+      .oneOf({"table", "ndjson", "csv"});
 }
 
 RecordOutput::Format FormatOption::format() const {

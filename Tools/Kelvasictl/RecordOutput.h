@@ -9,9 +9,7 @@
 #include <string>
 #include <string_view>
 
-namespace CLI {
-class App;
-}
+#include "Tools/OptionSet.h"
 
 namespace kelvasi {
 
@@ -50,7 +48,7 @@ class RecordOutput {
 struct FormatOption {
   std::string name;
 
-  void addTo(CLI::App& verb);
+  void addTo(OptionSet verb);
   // Unless one was named, a table on a terminal and NDJSON elsewhere.
   RecordOutput::Format format() const;
 };

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl record: a live link to a capture.
-#include <CLI/CLI.hpp>
 
 #include "Capture/PcapWriter.h"
 #include "LogGenerator/Arrival.h"
@@ -87,12 +86,11 @@ class RecordVerb {
 
 }  // namespace
 
-Action declareRecord(CLI::App& verb) {
+Action declareRecord(OptionSet verb) {
   const auto options = std::make_shared<RecordOptions>();
-  verb.add_option("FILE", options->file, "the pcap file, which is created; - is the standard output")
-      ->required();
+  verb.add("FILE", options->file, "the pcap file, which is created; - is the standard output").required();
   options->logCodes.addTo(verb);
-  verb.add_flag("--force", options->force, "replace a file that is there, once the first message has come");
+  verb.addFlag("--force", options->force, "replace a file that is there, once the first message has come");
   options->live.addTo(verb);
   // Nothing is decoded, so nothing can fail to be shown.
   return [options](MessageTally&) { return RecordVerb(*options).run(); };

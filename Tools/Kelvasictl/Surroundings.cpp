@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/Surroundings.h"
 
-#include <CLI/CLI.hpp>
 #include <filesystem>
 #include <system_error>
 
@@ -36,11 +35,10 @@ std::filesystem::path resourcesDirectory(const SurroundingsOptions& options) {
 
 }  // namespace
 
-void SurroundingsOptions::addTo(CLI::App& verb) {
-  verb.add_option("--resources", resources, "where the display templates are (also KELVASI_RESOURCES)")
-      ->type_name("DIR");
-  verb.add_flag("--log-stderr", logsToStderr,
-                R"(system-log lines go to the standard error, as "<N>text", instead of to syslog)");
+void SurroundingsOptions::addTo(OptionSet verb) {
+  verb.add("--resources", resources, "where the display templates are (also KELVASI_RESOURCES)").type("DIR");
+  verb.addFlag("--log-stderr", logsToStderr,
+               R"(system-log lines go to the standard error, as "<N>text", instead of to syslog)");
 }
 
 Surroundings::Surroundings(const SurroundingsOptions& options, const LogLevel& unasked)

@@ -14,10 +14,7 @@
 #include "Platform/PushedClock.h"
 #include "Platform/SystemLog.h"
 #include "Platform/TraceOutput.h"
-
-namespace CLI {
-class App;
-}
+#include "Tools/OptionSet.h"
 
 namespace kelvasi {
 
@@ -25,7 +22,7 @@ struct SurroundingsOptions {
   std::optional<std::string> resources;
   bool logsToStderr = false;
 
-  void addTo(CLI::App& verb);
+  void addTo(OptionSet verb);
 };
 
 // The system log is syslog, or the standard error, where the traces then go too; otherwise they go nowhere.

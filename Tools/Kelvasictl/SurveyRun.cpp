@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/SurveyRun.h"
 
-#include <CLI/CLI.hpp>
-
 #include "Tools/Kelvasictl/CaptureSurvey.h"
 #include "Tools/Kelvasictl/LiveSurvey.h"
 #include "Tools/Kelvasictl/ToolError.h"
@@ -31,12 +29,12 @@ int surveyCaptures(const SurveyOptions& options, const SurveyUse& use) {
 
 }  // namespace
 
-void SurveyOptions::addTo(CLI::App& verb) {
+void SurveyOptions::addTo(OptionSet verb) {
   InputOptions::addTo(verb, "Each is surveyed by itself");
   format.addTo(verb);
 }
 
-CLI::Option* SurveyOptions::addJobsTo(CLI::App& verb) {
+Option SurveyOptions::addJobsTo(OptionSet verb) {
   return InputOptions::addJobsTo(verb, "so many captures side by side; the output stays in their order");
 }
 

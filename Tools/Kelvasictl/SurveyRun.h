@@ -10,18 +10,13 @@
 #include "Tools/Kelvasictl/InputOptions.h"
 #include "Tools/Kelvasictl/RecordOutput.h"
 
-namespace CLI {
-class App;
-class Option;
-}  // namespace CLI
-
 namespace kelvasi {
 
 struct SurveyOptions : InputOptions {
   FormatOption format;
 
-  void addTo(CLI::App& verb);
-  CLI::Option* addJobsTo(CLI::App& verb);
+  void addTo(OptionSet verb);
+  Option addJobsTo(OptionSet verb);
 };
 
 // One capture, or a live link as long as its technology is the same. It lasts for a call.

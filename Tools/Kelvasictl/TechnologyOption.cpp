@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/TechnologyOption.h"
 
-#include <CLI/CLI.hpp>
-
 #include "Telvon/TechnologyName.h"
 
 namespace kelvasi {
@@ -18,13 +16,11 @@ std::string readTechnology(std::string& text) {
 
 }  // namespace
 
-void addTechnology(CLI::App& verb, std::string& technology, const std::string& help) {
-  verb.add_option("--technology", technology, help)
-      ->type_name("TECH")
-      ->transform(CLI::Validator(readTechnology, ""));
+void addTechnology(OptionSet verb, std::string& technology, const std::string& help) {
+  verb.add("--technology", technology, help).type("TECH").transform(readTechnology);
 }
 
-void addTechnology(CLI::App& verb, std::string& technology) {
+void addTechnology(OptionSet verb, std::string& technology) {
   addTechnology(verb, technology,
                 "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2; otherwise it is found from the "
                 "messages");

@@ -4,15 +4,13 @@
 
 #include <string>
 
-namespace CLI {
-class App;
-}
+#include "Tools/OptionSet.h"
 
 namespace kelvasi {
 
 // `technology` becomes an identifier, and stays as it is where the option is not given.
-void addTechnology(CLI::App& verb, std::string& technology, const std::string& help);
+void addTechnology(OptionSet verb, std::string& technology, const std::string& help);
 // For a verb that finds the technology of a capture itself.
-void addTechnology(CLI::App& verb, std::string& technology);
+void addTechnology(OptionSet verb, std::string& technology);
 
 }  // namespace kelvasi

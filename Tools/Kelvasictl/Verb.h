@@ -5,9 +5,7 @@
 #include <functional>
 #include <string>
 
-namespace CLI {
-class App;
-}
+#include "Tools/OptionSet.h"
 
 namespace kelvasi {
 
@@ -17,20 +15,20 @@ class MessageTally;
 using Action = std::function<int(MessageTally& tally)>;
 
 // `verb` outlives the action.
-Action declareAlarms(CLI::App& verb);
-Action declareCells(CLI::App& verb);
-Action declareCoverage(CLI::App& verb);
-Action declareDecode(CLI::App& verb);
-Action declareEvents(CLI::App& verb);
-Action declareFields(CLI::App& verb);
-Action declareMonitor(CLI::App& verb);
-Action declareReadings(CLI::App& verb);
-Action declareRecord(CLI::App& verb);
+Action declareAlarms(OptionSet verb);
+Action declareCells(OptionSet verb);
+Action declareCoverage(OptionSet verb);
+Action declareDecode(OptionSet verb);
+Action declareEvents(OptionSet verb);
+Action declareFields(OptionSet verb);
+Action declareMonitor(OptionSet verb);
+Action declareReadings(OptionSet verb);
+Action declareRecord(OptionSet verb);
 
 struct Verb {
   const char* name;
   const char* help;
-  Action (*declare)(CLI::App& verb);
+  Action (*declare)(OptionSet verb);
 };
 
 }  // namespace kelvasi

@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl: wires the verbs to the command line.
 #include <array>
-#include <iostream>
-#include <memory>
 #include <vector>
 
 #include "Platform/Posix/StandardDescriptors.h"
@@ -51,38 +49,19 @@ std::vector<std::string> quantityNames() {
   return names;
 }
 
-// "kelvasictl help VERB" says what "kelvasictl VERB --help" does.
-void declareHelp(CLI::App& app) {
-  CLI::App& help = *app.add_subcommand("help", "explain a verb");
-  const auto asked = std::make_shared<std::string>();
-  std::vector<std::string> names;
-  for (const Verb& verb : verbs) names.emplace_back(verb.name);
-  help.add_option("VERB", *asked, "the verb; otherwise all of them are listed")
-      ->type_name("NAME")
-      ->check(CLI::IsMember(names));
-  app.require_subcommand(0, 1);  // so that the verb asked for is not taken for another one to run
-  help.final_callback([&app, asked] {
-    const std::string& name = app.get_name();
-    std::cout << (asked->empty() ? app.get_formatter()->make_help(&app, name, CLI::AppFormatMode::Normal)
-                                 : app.get_subcommand(*asked)->help(name));
-    throw CLI::Success();
-  });
-}
-
 int run(int argumentCount, char** arguments, MessageTally& tally) {
   CommandLine commandLine("kelvasictl",
                           "Decodes, watches and records the diagnostic stream of a cellular modem.");
-  CLI::App& app = commandLine.app();
   std::vector<Action> actions;
   actions.reserve(verbs.size());
-  for (const Verb& verb : verbs) actions.push_back(verb.declare(*app.add_subcommand(verb.name, verb.help)));
-  declareHelp(app);
+  for (const Verb& verb : verbs) actions.push_back(verb.declare(commandLine.addVerb(verb.name, verb.help)));
+  commandLine.addHelpVerb();
   commandLine.offerWords("TECH", technologyNames());
   commandLine.offerWords("GLOB", quantityNames());
   commandLine.offerWords("RULE", quantityNames());
   if (const auto status = commandLine.parse(argumentCount, arguments)) return *status;
   for (std::size_t place = 0; place < verbs.size(); ++place) {
-    if (app.got_subcommand(verbs[place].name)) return actions[place](tally);
+    if (commandLine.asksFor(verbs[place].name)) return actions[place](tally);
   }
   complain("a subcommand is missing: " + verbNames() + " (try --help)");
   return exitWrongUsage;

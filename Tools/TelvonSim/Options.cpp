@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/TelvonSim/Options.h"
 
-#include <CLI/CLI.hpp>
+#include <algorithm>
 #include <cmath>
+#include <iostream>
 
 #include "Simulator/Commands.h"
 #include "Simulator/ScenarioList.h"
 #include "Telvon/TechnologyName.h"
-#include "Tools/NumberCheck.h"
 
 namespace kelvasi {
 
@@ -35,7 +35,7 @@ std::string listOfScenarios() {
   return text;
 }
 
-// Both take a text apart for CLI11, whose convention is to return what is wrong with it.
+// Both put what is meant in the text's place and return what is wrong with it.
 std::string readTechnology(std::string& text) {
   const auto id = technologyId(text);
   if (!id) return "there is no technology \"" + text + "\"";
@@ -67,74 +67,67 @@ void offerWords(CommandLine& commandLine) {
 
 void declareOptions(CommandLine& commandLine, SimulatorOptions& options) {
   offerWords(commandLine);
-  CLI::App& app = commandLine.app();
-  app.footer(listOfFaults());
-  app.add_option("--technology", options.technology,
-                 "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
-      ->type_name("TECH")
-      ->transform(CLI::Validator(readTechnology, ""))
-      ->required();
-  const auto scenario =
-      app.add_option("--scenario", options.scenario, "what to play; see --list-scenarios")->type_name("NAME");
-  app.add_option("--replay", options.replay,
-                 "play the messages of a capture (pcap, pcapng, DLF) or a snapshot, with its timing")
-      ->type_name("CAPTURE")
-      ->excludes(scenario);
-  app.add_flag("--loop", options.isLooping, "begin the capture again when it has ended")->needs("--replay");
-  app.add_flag("--leave", options.leavesAtEnd,
-               "end when the capture has been played, or the last application has left")
-      ->needs("--replay");
-  app.add_option("--speed", options.speed.factor,
-                 "world seconds per second; \"max\" or 0 is as fast as the applications take it")
-      ->type_name("X")
-      ->transform(CLI::Validator(readSpeed, ""))
-      ->check(numberBetween(0, 1e6, "from 0 to 1000000"));
-  app.add_option("--rate", options.rate, "synthetic load: repeat the scenario's messages, N a second")
-      ->type_name("N")
-      ->check(numberBetween(1e-3, 1e9, "from 0.001 to 1000000000"))
-      ->excludes("--replay");
-  app.add_option("--seed", options.seed, "the same seed gives the same messages")
-      ->type_name("N")
-      ->capture_default_str();
-  app.add_option_function<double>(
+  OptionSet app = commandLine.options();
+  app.setFooter(listOfFaults());
+  app.add("--technology", options.technology, "IFX, Orvane_GSM, Orvane_CDMA, Orvane_LTE or Orvane_UTRAN2")
+      .type("TECH")
+      .transform(readTechnology)
+      .required();
+  const Option scenario =
+      app.add("--scenario", options.scenario, "what to play; see --list-scenarios").type("NAME");
+  const Option replay =
+      app.add("--replay", options.replay,
+              "play the messages of a capture (pcap, pcapng, DLF) or a snapshot, with its timing")
+          .type("CAPTURE")
+          .excludes(scenario);
+  app.addFlag("--loop", options.isLooping, "begin the capture again when it has ended").needs(replay);
+  app.addFlag("--leave", options.leavesAtEnd,
+              "end when the capture has been played, or the last application has left")
+      .needs(replay);
+  app.add("--speed", options.speed.factor,
+          "world seconds per second; \"max\" or 0 is as fast as the applications take it")
+      .type("X")
+      .transform(readSpeed)
+      .between(0, 1e6, "from 0 to 1000000");
+  app.add("--rate", options.rate, "synthetic load: repeat the scenario's messages, N a second")
+      .type("N")
+      .between(1e-3, 1e9, "from 0.001 to 1000000000")
+      .excludes(replay);
+  app.add("--seed", options.seed, "the same seed gives the same messages").type("N").showsDefault();
+  app.addReader<double>(
          "--start-at",
          [&options](double seconds) { options.startAt = std::chrono::seconds(std::llround(seconds)); },
          "begin so many whole seconds after the scenario's beginning")
-      ->type_name("N")
-      ->check(numberBetween(0, 86400, "from 0 to 86400"))
-      ->excludes("--replay");
-  app.add_option("--seconds", options.seconds, "end after so many seconds")
-      ->type_name("N")
-      ->check(numberBetween(0, 1e9, "from 0 to 1000000000"));
-  app.add_option_function<std::vector<std::string>>(
+      .type("N")
+      .between(0, 86400, "from 0 to 86400")
+      .excludes(replay);
+  const Option seconds = app.add("--seconds", options.seconds, "end after so many seconds")
+                             .type("N")
+                             .between(0, 1e9, "from 0 to 1000000000");
+  app.addReader<std::vector<std::string>>(
          "--fault",
          [&options](const std::vector<std::string>& requests) {
            for (const std::string& request : requests) {
              const std::string wrong = options.faults.add(request);
-             if (!wrong.empty()) throw CLI::ValidationError("--fault", wrong);
+             if (!wrong.empty()) throw WrongUsage("--fault", wrong);
            }
          },
          "misbehave; see below")
-      ->type_name("FAULT");
-  const auto write =
-      app.add_option("--write", options.write,
-                     "write what a stream from the start brings into a pcap file, without waiting, and end")
-          ->type_name("FILE")
-          ->excludes("--replay")
-          ->excludes("--seconds");
-  const auto messages = app.add_option("--messages", options.messages, "how many messages go into the file")
-                            ->type_name("N")
-                            ->check(CLI::PositiveNumber)
-                            ->needs(write);
-  write->needs(messages);
-  app.add_flag("--force", options.isForced, "the file may take the place of another")->needs(write);
-  app.add_flag_callback(
-      "--list-scenarios",
-      [] {
-        std::cout << listOfScenarios();
-        throw CLI::Success();
-      },
-      "list the scenarios and end");
+      .type("FAULT");
+  Option write =
+      app.add("--write", options.write,
+              "write what a stream from the start brings into a pcap file, without waiting, and end")
+          .type("FILE")
+          .excludes(replay)
+          .excludes(seconds);
+  const Option messages = app.add("--messages", options.messages, "how many messages go into the file")
+                              .type("N")
+                              .positive()
+                              .needs(write);
+  write.needs(messages);
+  app.addFlag("--force", options.isForced, "the file may take the place of another").needs(write);
+  app.addFlagThatEnds(
+      "--list-scenarios", [] { std::cout << listOfScenarios(); }, "list the scenarios and end");
 }
 
 }  // namespace kelvasi
