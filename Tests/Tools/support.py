@@ -15,6 +15,7 @@ CAPTURES = pathlib.Path(__file__).resolve().parent.parent / "Captures"
 TEMPLATES = CAPTURES / "templates"
 
 USER0 = 147
+OUTPUT_CLOSED = 141  # the status where nobody reads the output any more
 START = 1709647629  # 2024-03-05 14:07:09 UTC
 
 

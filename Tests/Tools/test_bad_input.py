@@ -7,7 +7,7 @@ import struct
 import subprocess
 import unittest
 
-from support import GMM_REGISTERED, MM_IDLE, PROGRAM, START, TEMPLATES, KelvasictlTest, pcap
+from support import GMM_REGISTERED, MM_IDLE, OUTPUT_CLOSED, PROGRAM, START, TEMPLATES, KelvasictlTest, pcap
 
 
 class BadCaptures(KelvasictlTest):
@@ -142,7 +142,7 @@ class BadSurroundings(KelvasictlTest):
         closed = self.decode(capture, capture_output=False, stderr=subprocess.PIPE, preexec_fn=lambda: os.close(1))
         self.assert_fault(closed, "standard output: Bad file descriptor")
 
-    def test_a_reader_that_leaves_is_a_fault_and_no_signal(self):
+    def test_a_reader_that_leaves_ends_it_without_a_word(self):
         for more in ([], ["--every-tick"], ["--start-command"]):
             with self.subTest(more):
                 reading, writing = os.pipe()
@@ -150,7 +150,19 @@ class BadSurroundings(KelvasictlTest):
                 with os.fdopen(writing, "wb") as pipe:
                     result = self.decode(*more, self.write("a.pcap", pcap(MM_IDLE)), capture_output=False,
                                          stdout=pipe, stderr=subprocess.PIPE)
-                self.assert_fault(result, "standard output: Broken pipe")
+                self.assertEqual((result.returncode, result.stderr), (OUTPUT_CLOSED, b""))
+
+    def test_with_several_jobs_too(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        for verb in (["readings"], ["cells"], ["events"], ["coverage"], ["alarms", "--rule", "rsrp < -100"]):
+            with self.subTest(verb):
+                reading, writing = os.pipe()
+                os.close(reading)
+                with os.fdopen(writing, "wb") as pipe:
+                    result = self.run_program(*verb, "--format", "csv", "--technology", "Orvane_GSM", "--jobs", "2",
+                                              capture, capture, capture_output=False, stdout=pipe,
+                                              stderr=subprocess.PIPE)
+                self.assertEqual((result.returncode, result.stderr), (OUTPUT_CLOSED, b""))
 
     def test_without_any_standard_stream_files_stay_whole(self):
         capture = self.write("a.pcap", pcap(MM_IDLE))

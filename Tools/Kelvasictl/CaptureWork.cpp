@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasictl/CaptureWork.h"
 
+#include <atomic>
+
 #include "Tools/Kelvasictl/Spool.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
 #include "Tools/Kelvasictl/WorkInOrder.h"
@@ -15,6 +17,9 @@ struct Piece {
   std::vector<std::string> complaints;
 };
 
+// Ends the work on a capture whose output nobody takes any more.
+struct Abandoned {};
+
 void say(Piece& piece) {
   piece.printed.giveTo(printOut);
   for (const std::string& line : piece.complaints) complain(line);
@@ -25,7 +30,9 @@ void say(Piece& piece) {
 
 void workOnCaptures(const std::vector<std::string>& captures, unsigned jobs, const CaptureWork& work) {
   Progress progress(captures, work.progress);
-  const auto advance = [&progress](std::uint64_t messages, std::uint64_t bytes) {
+  std::atomic<bool> isAbandoned = false;
+  const auto advance = [&](std::uint64_t messages, std::uint64_t bytes) {
+    if (isAbandoned) throw Abandoned();
     progress.add(messages, bytes);
   };
   std::vector<Piece> pieces(captures.size());
@@ -37,8 +44,13 @@ void workOnCaptures(const std::vector<std::string>& captures, unsigned jobs, con
   workInOrder(
       pieces.size(), jobs, [&](std::size_t at) { work.work(at, outputOf(pieces[at])); },
       [&](std::size_t at) {
-        say(pieces[at]);
-        work.deliver(at);
+        try {
+          say(pieces[at]);
+          work.deliver(at);
+        } catch (...) {
+          isAbandoned = true;
+          throw;
+        }
       });
 }
 

@@ -55,8 +55,8 @@ template <typename Action>
 void LiveRun::endAtFault(Action action) {
   try {
     action();
-  } catch (const ToolError& error) {
-    session_.end(error.what());
+  } catch (const ToolError&) {
+    session_.end(std::current_exception());
   }
 }
 

@@ -54,7 +54,7 @@ void LiveSession::run() {
     signal = loop_.run();
   }
   if (!hasEnded_) loop_.drain(drainLimit);
-  if (error_) throw ToolError(*error_);
+  if (error_) std::rethrow_exception(error_);
   const bool timeIsOver = signal == 0 && !hasEnded_;
   if (timeIsOver && !model_.logGenerator()) throw ToolError("nothing came from " + aDaemonThere());
 }
@@ -64,7 +64,7 @@ bool LiveSession::hasBegunToShowAnother() {
   return showsAnother_ && !wasAnother;
 }
 
-void LiveSession::end(std::optional<std::string> error) {
+void LiveSession::end(std::exception_ptr error) {
   hasEnded_ = true;
   if (!error_) error_ = std::move(error);
   loop_.quit();

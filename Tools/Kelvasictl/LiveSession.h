@@ -3,8 +3,8 @@
 #pragma once
 
 #include <chrono>
+#include <exception>
 #include <optional>
-#include <string>
 
 #include "Model/KelvasiModel.h"
 #include "Platform/Qt/QtEventLoop.h"
@@ -37,11 +37,11 @@ class LiveSession {
 
   // Connects and runs until SIGINT, SIGTERM, SIGHUP, the stated time or end(). What the sockets hold by a
   // signal or by the end of that time is still taken in. Says once where it waits when the first attempt
-  // reaches no daemon. Throws ToolError with what end() was given, and when the time has passed without a
+  // reaches no daemon. Throws what end() was given, and ToolError when the time has passed without a
   // daemon that told its technology.
   void run();
   // From within run() only.
-  void end(std::optional<std::string> error = std::nullopt);
+  void end(std::exception_ptr error = nullptr);
 
  private:
   void connect();
@@ -56,7 +56,7 @@ class LiveSession {
   KelvasiModel model_;
   bool hasEnded_ = false;  // by end()
   bool showsAnother_ = false;
-  std::optional<std::string> error_;
+  std::exception_ptr error_;
 };
 
 }  // namespace kelvasi

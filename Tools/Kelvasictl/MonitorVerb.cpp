@@ -72,8 +72,8 @@ class MonitorVerb {
         view_.show(treeText(*root));
       }
       if (options_.once) session_.end();
-    } catch (const ToolError& error) {
-      session_.end(error.what());
+    } catch (const ToolError&) {
+      session_.end(std::current_exception());
     }
   }
 

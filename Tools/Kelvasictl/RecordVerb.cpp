@@ -59,7 +59,8 @@ class RecordVerb {
 
  private:
   void take(std::span<const std::uint8_t> message) {
-    if (!writer_.write(message, arrivalAt(session_.clock().now()))) return session_.end(writer_.error());
+    if (!writer_.write(message, arrivalAt(session_.clock().now())))
+      return session_.end(std::make_exception_ptr(ToolError(*writer_.error())));
     ++count_;
     if (message.size() > PcapWriter::largestPacket) tellCut(message.size());
   }

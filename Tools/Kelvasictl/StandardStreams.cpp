@@ -21,8 +21,9 @@ bool write(int stream, std::string_view text) {
 }  // namespace
 
 void printOut(std::string_view text) {
-  if (!write(STDOUT_FILENO, text))
-    throw ToolError("standard output: " + std::generic_category().message(errno));
+  if (write(STDOUT_FILENO, text)) return;
+  if (errno == EPIPE) throw OutputClosed();
+  throw ToolError("standard output: " + std::generic_category().message(errno));
 }
 
 void complain(std::string_view text) {

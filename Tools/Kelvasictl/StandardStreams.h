@@ -6,7 +6,7 @@
 
 namespace kelvasi {
 
-// Hands `text` to the system. Throws ToolError when that fails.
+// Hands `text` to the system. Throws OutputClosed when nobody reads it any more, ToolError when it fails.
 void printOut(std::string_view text);
 
 // One line on the standard error, after the tool's name.

@@ -14,4 +14,10 @@ class ToolError : public std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
+// The reader of the standard output has gone. Nothing is left to say; the exit status is exitOutputClosed.
+class OutputClosed : public ToolError {
+ public:
+  OutputClosed() : ToolError("the reader of the standard output has gone") {}
+};
+
 }  // namespace kelvasi

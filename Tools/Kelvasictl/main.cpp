@@ -78,6 +78,8 @@ int main(int argumentCount, char** arguments) {
   int status = kelvasi::exitFault;
   try {
     status = kelvasi::run(argumentCount, arguments, tally);
+  } catch (const kelvasi::OutputClosed&) {
+    return kelvasi::exitOutputClosed;
   } catch (const kelvasi::ToolError& error) {
     kelvasi::complain(error.what());
   }
