@@ -4,76 +4,18 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
-#include <cstdio>
-#include <nlohmann/json.hpp>
 #include <vector>
 
+#include "Tools/Kelvasictl/FieldStates.h"
 #include "Tools/Kelvasictl/LogCodeText.h"
 
 namespace kelvasi {
 
 namespace {
 
-using Json = nlohmann::ordered_json;
-
-struct State {
-  std::int64_t value;
-  std::string text;
-};
-
-// The texts that stand for a value, and after them the one that is not a value of the texts.
-std::vector<State> statesOf(const Row& row) {
-  std::vector<State> states;
-  if (!row.reason.empty()) return states;
-  for (std::size_t value = 0; value < row.texts.size(); ++value) {
-    if (row.texts[value] != row.otherwise)
-      states.push_back({static_cast<std::int64_t>(value), std::string(row.texts[value])});
-  }
-  if (row.special) states.push_back({row.special->value, std::string(row.special->text)});
-  return states;
-}
-
-Json orNull(std::string_view text) {
-  return text.empty() ? Json() : Json(text);
-}
-
 std::string numeral(double number) {
   std::array<char, 32> digits;
   return {digits.data(), std::to_chars(digits.data(), digits.data() + digits.size(), number).ptr};
-}
-
-Json quantityJson(const Quantity& quantity) {
-  const bool hasRange = quantity.least < quantity.most;
-  return {{"id", quantity.id},
-          {"unit", orNull(quantity.unit)},
-          {"kind", nameOf(quantity.kind)},
-          {"least", hasRange ? Json(quantity.least) : Json()},
-          {"most", hasRange ? Json(quantity.most) : Json()},
-          {"source", orNull(quantity.source)}};
-}
-
-Json rowJson(const std::string& technology, const CatalogRow& row) {
-  const Quantity& quantity = row.row->quantity;
-  const auto fromField = [&](auto member) { return row.field ? Json((*row.field).*member) : Json(); };
-  Json states = Json::array();
-  for (const State& state : statesOf(*row.row))
-    states.push_back({{"value", state.value}, {"text", state.text}});
-  return {{"technology", technology},
-          {"section", orNull(row.section)},
-          {"list", orNull(row.list)},
-          {"row", row.key},
-          {"code", row.logCode == 0 && row.section.empty() ? Json() : Json(logCodeText(row.logCode))},
-          {"key", orNull(row.source)},
-          {"of", orNull(row.of)},
-          {"byte", fromField(&Field::byte)},
-          {"bit", fromField(&Field::bit)},
-          {"width", fromField(&Field::width)},
-          {"signed", fromField(&Field::isSigned)},
-          {"digits", row.digits == 0 ? Json() : Json(row.digits)},
-          {"quantity", quantity.id},
-          {"unit", orNull(quantity.unit)},
-          {"states", std::move(states)},
-          {"reason", orNull(row.row->reason)}};
 }
 
 // Characters that a table would take for its own.
@@ -101,7 +43,7 @@ std::string placeOf(const CatalogRow& row) {
 
 std::string statesText(const Row& row) {
   std::string text(row.reason);
-  for (const State& state : statesOf(row)) {
+  for (const FieldState& state : statesOf(row)) {
     if (!text.empty()) text += "; ";
     text += std::to_string(state.value) + " " + (state.text.empty() ? "(empty)" : state.text);
   }
@@ -164,15 +106,6 @@ void appendSections(std::string& page, const RowCatalog& catalog) {
 }
 
 }  // namespace
-
-std::string fieldsJson(std::span<const TechnologyFields> fields) {
-  Json document{{"quantities", Json::array()}, {"rows", Json::array()}};
-  for (const Quantity* quantity : quantity::all) document["quantities"].push_back(quantityJson(*quantity));
-  for (const auto& [technology, catalog] : fields) {
-    for (const CatalogRow& row : catalog.rows()) document["rows"].push_back(rowJson(technology, row));
-  }
-  return document.dump(1) + "\n";
-}
 
 std::string fieldsMarkdown(std::span<const TechnologyFields> fields) {
   std::string page(beginning);
