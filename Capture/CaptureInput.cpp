@@ -36,9 +36,8 @@ std::optional<InputMessage> CaptureInput::next() {
 
 void CaptureInput::openNext() {
   capture_.emplace(openCapture(choice_.paths[nextPath_++], plists_), codes_);
-  isFound_ = !choice_.technology;
   technology_ = {};
-  if (isFound_) return findTechnology();
+  if (!choice_.technology) return findTechnology();
   technology_ = technologyId(*choice_.technology).value();
 }
 
@@ -52,7 +51,7 @@ void CaptureInput::findTechnology() {
 
 void CaptureInput::tellWhyNoneWasFound() {
   const TechnologyCount& count = capture_->count();
-  if (count.messages() == 0) return;  // nothing to find it from, and nothing to miss
+  if (count.messages() == 0) return;
   const auto ranking = count.ranking();
   std::string why = "fits " + count.text(ranking) + " alike";
   if (ranking.empty()) why = "its messages (" + std::to_string(count.messages()) + ") tell no technology";
@@ -60,7 +59,9 @@ void CaptureInput::tellWhyNoneWasFound() {
 }
 
 void CaptureInput::endCapture() {
-  for (const std::string& line : capture_->reader().complaints()) tellFault(line);
+  const auto complaints = capture_->reader().complaints();
+  for (const std::string& line : complaints) tellFault(line);
+  if (complaints.empty() && capture_->count().messages() == 0) tell_(ofCapture("holds no messages"));
   if (!technology_.empty()) tellOfOthers();
   advance();
   advancedPosition_ = 0;
@@ -80,8 +81,7 @@ void CaptureInput::tellOfOthers() {
   auto ranking = count.ranking();
   std::string_view taken = technology_;
   const bool fitsOther = !ranking.empty() && count.of(ranking.front()) > count.of(taken);
-  const bool fitsMore = ranking.size() > 1;
-  if (!fitsOther && !(fitsMore && isFound_)) return;
+  if (!fitsOther && ranking.size() <= 1) return;
   if (count.of(taken) == 0) ranking.push_back(taken);
   tell_(ofCapture("fits " + count.text(ranking) + "; taken for " + std::string(shortTechnologyName(taken))));
 }

@@ -42,8 +42,8 @@ class CaptureInput {
   //
   // Told are: what cannot be read, with the place in the file; the technology that was found, by its short
   // name, where it is another than the capture before had; a capture that fits two technologies, or another
-  // than it is taken for, with the counts of messages. A capture of which no technology can be found is
-  // passed over.
+  // than it is taken for, with the counts of messages; one that holds none. A capture of which no technology
+  // can be found is passed over.
   CaptureInput(Choice choice, const PlistSerialiser& plists, Tell tell, Advance advance = {});
 
   // Nothing at the end of the last capture. A message's bytes last until the next call.
@@ -71,7 +71,6 @@ class CaptureInput {
   std::size_t nextPath_ = 0;
   std::optional<ProbedCapture> capture_;
   std::string_view technology_;  // of the capture; empty: none was found
-  bool isFound_ = false;         // and not given
   std::string_view told_;        // the technology that was last told
   bool hasFault_ = false;
   std::uint64_t newMessages_ = 0;       // since the last advance

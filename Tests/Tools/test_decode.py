@@ -52,10 +52,14 @@ class Decode(KelvasictlTest):
 
     def test_a_capture_without_messages_has_no_display(self):
         capture = self.write("a.pcap", pcap())
-        self.assertEqual(self.decode(capture).stdout, b"null\n")
+        said = f"kelvasictl: {capture}: holds no messages\n"
+        result = self.decode(capture)
+        self.assertEqual((result.returncode, result.stdout, result.stderr.decode()), (0, b"null\n", said))
         self.assertEqual(self.decode(capture, "--every-tick").stdout, b"")
         self.assertEqual(self.decode(capture, "--format", "tree").stdout, b"/\t(unknown)\n")
-        self.assert_fault(self.decode(capture, "--format", "plist"), "no display")
+        result = self.decode(capture, "--format", "plist")
+        self.assertEqual((result.returncode, result.stderr.decode()), (
+            1, said + "kelvasictl: there is no display to write as a property list\n"))
 
     def test_without_templates_there_is_no_display(self):
         empty = self.write("a.pcap", pcap(MM_IDLE))

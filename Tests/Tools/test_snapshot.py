@@ -52,9 +52,9 @@ class Dlf(KelvasictlTest):
 
 
 class Snapshot(KelvasictlTest):
-    def snapshot(self, *arguments, **options):
+    def snapshot(self, *arguments, said="", **options):
         result = self.decode("--snapshot", self.path("a.kelvasi"), *arguments, **options)
-        self.assertEqual((result.returncode, result.stderr), (0, b""))
+        self.assertEqual((result.returncode, result.stderr.decode()), (0, said))
         return plistlib.loads(self.read("a.kelvasi"))
 
     def test_holds_a_time_the_save_contents_and_a_description(self):
@@ -88,7 +88,8 @@ class Snapshot(KelvasictlTest):
         self.assertEqual(self.snapshot(self.write("a.pcap", pcap(MM_IDLE)))["Description"], "")
 
     def test_of_nothing_holds_an_empty_history(self):
-        (dlf,) = self.snapshot(self.write("a.pcap", pcap()))["Data"]
+        capture = self.write("a.pcap", pcap())
+        (dlf,) = self.snapshot(capture, said=f"kelvasictl: {capture}: holds no messages\n")["Data"]
         self.assertEqual(len(dlf["DLF"]), 161)
 
     def test_of_cdma_holds_both_readings_of_the_rate_counters(self):

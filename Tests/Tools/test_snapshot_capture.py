@@ -65,8 +65,10 @@ class SnapshotCapture(LiveTest):
         self.assertIn("GMM_DEREGISTERED", display["Process PS"]["MM State"])
 
     def test_of_nothing_is_decoded_to_nothing(self):
-        snapshot, _ = self.save(pcap())
-        self.assertEqual(self.shown(snapshot), b"null\n")
+        self.decode("--snapshot", self.path("a.kelvasi"), self.write("a.pcap", pcap()))
+        result = self.decode(self.path("a.kelvasi"))
+        self.assertEqual((result.returncode, result.stdout), (0, b"null\n"))
+        self.assertEqual(result.stderr.decode(), f"kelvasictl: {self.path('a.kelvasi')}: holds no messages\n")
 
     def test_of_an_object_stream_holds_no_messages(self):
         message = plistlib.dumps({"Serving Cell": {"Channel": "1850"}})
