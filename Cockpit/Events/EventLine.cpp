@@ -40,7 +40,7 @@ std::string ratChangeWords(const Event& event) {
 std::string wordsOf(const Event& event) {
   if (event.kind == EventKind::cellChange) return cellChangeWords(event);
   if (event.kind == EventKind::ratChange) return ratChangeWords(event);
-  const auto cell = cellFromText(event.to);
+  const auto cell = cellFromText(event.reason);
   if (event.kind == EventKind::serviceBack && cell) return "service back: " + fullCellName(*cell);
   return event.text();
 }

@@ -61,7 +61,10 @@ std::string beginningOf(const Event& event) {
 }  // namespace
 
 std::string Event::text() const {
-  return beginningOf(*this) + (from.empty() ? to : from + " to " + to);
+  const std::string beginning = beginningOf(*this);
+  if (kind == EventKind::unknownRecord) return beginning + to + " first seen: " + reason;
+  if (from.empty() && to.empty()) return beginning + reason;
+  return beginning + from + " to " + to;
 }
 
 }  // namespace kelvasi::survey

@@ -15,10 +15,11 @@ namespace kelvasi::survey {
 struct Event {
   Arrival time{0};
   EventKind kind = EventKind::cellChange;
-  CellIdentity cell;                   // the serving cell; of a change the new one
+  CellIdentity cell = {};              // the serving cell; of a change the new one
   const Quantity* quantity = nullptr;  // whose state changed, or who was rejected
-  std::string from;                    // cell, RAT or state; empty where there is none
-  std::string to;                      // likewise; of a reject the cause, of service and link the reason
+  std::string from = {};               // cell, RAT or state; empty where there is none
+  std::string to = {};                 // likewise; of an unknown record its code
+  std::string reason = {};  // why, in words; of a reject the cause, of an unknown record what became of it
 
   // In words: "cell change lte:3350/404 to lte:3350/362"
   std::string text() const;

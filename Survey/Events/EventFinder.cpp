@@ -13,6 +13,7 @@ enum class Meaning : std::uint8_t { state, update, service };
 struct Watched {
   const Quantity* quantity;
   Meaning meaning = Meaning::state;
+  RadioFamily family = RadioFamily::none;  // the air interface, where a handset may have two
 };
 constexpr std::array watched{
     Watched{&quantity::mmState},
@@ -22,9 +23,9 @@ constexpr std::array watched{
     Watched{&quantity::registrationState},
     Watched{&quantity::rrState},
     Watched{&quantity::rrcState},
-    Watched{&quantity::oneXState},
-    Watched{&quantity::evdoState},
-    Watched{&quantity::evdoSession},
+    Watched{&quantity::oneXState, Meaning::state, RadioFamily::cdma},
+    Watched{&quantity::evdoState, Meaning::state, RadioFamily::evdo},
+    Watched{&quantity::evdoSession, Meaning::state, RadioFamily::evdo},
     Watched{&quantity::mmUpdateStatus, Meaning::update},
     Watched{&quantity::gmmUpdateStatus, Meaning::update},
     Watched{&quantity::serviceType, Meaning::service},
@@ -87,16 +88,11 @@ void EventFinder::follow(const Reading& reading, Arrival time) {
   const std::string text = textOf(reading).value_or("");
   if (which->meaning == Meaning::service) followService(raw, text, time);
   if (which->meaning == Meaning::update && raw >= firstRefusal) {
-    give({.time = time,
-          .kind = EventKind::reject,
-          .cell = cell_,
-          .quantity = quantity,
-          .from = {},
-          .to = text});
+    give({.time = time, .kind = EventKind::reject, .cell = cell_, .quantity = quantity, .reason = text});
   } else if (which->meaning == Meaning::state && state.isKnown) {
     give({.time = time,
           .kind = EventKind::stateChange,
-          .cell = cell_,
+          .cell = cellOf(which->family),
           .quantity = quantity,
           .from = state.text,
           .to = text});
@@ -116,31 +112,38 @@ void EventFinder::setService(bool isThere, Arrival time, std::string reason) {
   give({.time = time,
         .kind = isThere ? EventKind::serviceBack : EventKind::serviceLost,
         .cell = cell_,
-        .quantity = nullptr,
-        .from = {},
-        .to = std::move(reason)});
+        .reason = std::move(reason)});
 }
 
 void EventFinder::serve(const SeenCell* from, const SeenCell& to, Arrival time) {
-  cell_ = to.identity;
+  camp(to.identity);
   if (!from) return;
   give({.time = time,
         .kind = EventKind::cellChange,
         .cell = cell_,
-        .quantity = nullptr,
         .from = textOf(from->identity),
         .to = textOf(to.identity)});
   if (from->identity.family == to.identity.family) return;
   give({.time = time,
         .kind = EventKind::ratChange,
         .cell = cell_,
-        .quantity = nullptr,
         .from = std::string(nameOf(from->identity.family)),
         .to = std::string(nameOf(to.identity.family))});
 }
 
-void EventFinder::hearServing(const CellIdentity& cell, Arrival time) {
+void EventFinder::camp(const CellIdentity& cell) {
   cell_ = cell;
+  if (cell.family == RadioFamily::cdma) oneXCell_ = cell;
+  if (cell.family == RadioFamily::evdo) evdoCell_ = cell;
+}
+
+const CellIdentity& EventFinder::cellOf(RadioFamily airInterface) const {
+  if (airInterface == RadioFamily::cdma) return oneXCell_;
+  return airInterface == RadioFamily::evdo ? evdoCell_ : cell_;
+}
+
+void EventFinder::hearServing(const CellIdentity& cell, Arrival time) {
+  camp(cell);
   lastServing_ = time;
   if (!saysService_) setService(true, time, textOf(cell));
 }
@@ -153,22 +156,15 @@ void EventFinder::take(const Intake& intake) {
     give({.time = count.first,
           .kind = EventKind::unknownRecord,
           .cell = cell_,
-          .quantity = nullptr,
-          .from = {},
-          .to = inHex(count.logCode) + " first seen: " + std::string(nameOf(count.outcome)) + ", " +
-                std::to_string(count.lastLength) + " bytes"});
+          .to = inHex(count.logCode),
+          .reason = std::string(nameOf(count.outcome)) + ", " + std::to_string(count.lastLength) + " bytes"});
   }
 }
 
 void EventFinder::lose(Arrival time, std::string reason) {
   if (lostAt_) return;
   lostAt_ = time;
-  give({.time = time,
-        .kind = EventKind::linkLost,
-        .cell = cell_,
-        .quantity = nullptr,
-        .from = {},
-        .to = std::move(reason)});
+  give({.time = time, .kind = EventKind::linkLost, .cell = cell_, .reason = std::move(reason)});
 }
 
 void EventFinder::regain(Arrival time) {
@@ -176,12 +172,7 @@ void EventFinder::regain(Arrival time) {
   const auto away = time - lastMessage_.value_or(*lostAt_);
   lostAt_.reset();
   lastServing_.reset();  // nobody could hear of it
-  give({.time = time,
-        .kind = EventKind::linkBack,
-        .cell = cell_,
-        .quantity = nullptr,
-        .from = {},
-        .to = "after " + inSeconds(away)});
+  give({.time = time, .kind = EventKind::linkBack, .cell = cell_, .reason = "after " + inSeconds(away)});
 }
 
 void EventFinder::give(Event event) {

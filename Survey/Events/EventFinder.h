@@ -55,10 +55,15 @@ class EventFinder {
   void follow(const Reading& reading, Arrival time);
   void followService(std::int64_t raw, const std::string& text, Arrival time);
   void setService(bool isThere, Arrival time, std::string reason);
+  void camp(const CellIdentity& cell);
+  // The serving cell of one of two air interfaces, or the one named last.
+  const CellIdentity& cellOf(RadioFamily airInterface) const;
   void give(Event event);
 
   OnEvent onEvent_;
-  CellIdentity cell_;
+  CellIdentity cell_;  // the serving one that was named last
+  CellIdentity oneXCell_;
+  CellIdentity evdoCell_;
   std::array<State, watchedStates> states_;
   std::optional<bool> hasService_;
   bool saysService_ = false;  // a record says the kind of service

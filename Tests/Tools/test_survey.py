@@ -142,7 +142,7 @@ class Events(Survey):
         path = self.lte((0.0, serving()), (1.0, serving(code=362, cell=77)))
         self.assertEqual(self.records("events", path), [{
             "time": "2024-03-05T14:07:10.000000Z", "technology": "Orvane_LTE", "event": "cell_change",
-            "cell": "lte:3350/362", "quantity": None, "from": "lte:3350/404", "to": "lte:3350/362",
+            "cell": "lte:3350/362", "quantity": None, "from": "lte:3350/404", "to": "lte:3350/362", "reason": None,
             "text": "cell change lte:3350/404 to lte:3350/362"}])
 
     def test_an_unknown_record_and_a_silent_link(self):
@@ -151,6 +151,11 @@ class Events(Survey):
             ("10.000000", "unknown record 0xB193 first seen: not asked for, 20 bytes"),
             ("26.000000", "link lost: no message for 15 s"),
             ("09.000000", "link back: after 58 s")])
+
+    def test_an_unknown_record_has_its_code_and_what_became_of_it(self):
+        event, = self.records("events", self.lte(UNKNOWN, serving()))
+        self.assertEqual({key: event[key] for key in ("event", "from", "to", "reason")}, {
+            "event": "unknown_record", "from": None, "to": "0xB193", "reason": "not asked for, 20 bytes"})
 
     def test_a_table_comes_line_by_line(self):
         path = self.lte((0.0, serving()), (1.0, serving(code=362, cell=77)))

@@ -17,6 +17,7 @@ constexpr std::array columnsOfEvents{
     Column{.key = "quantity"},
     Column{.key = "from"},
     Column{.key = "to"},
+    Column{.key = "reason"},
     Column{.key = "text", .width = 1},
 };
 
@@ -67,6 +68,7 @@ Json eventRecord(const survey::Event& event, std::string_view technology) {
   record["quantity"] = event.quantity ? Json(event.quantity->id) : Json();
   record["from"] = textOrNull(event.from);
   record["to"] = textOrNull(event.to);
+  record["reason"] = textOrNull(event.reason);
   record["text"] = event.text();
   return record;
 }

@@ -15,7 +15,8 @@ constexpr auto footer =
     R"(Events: cell_change and rat_change with from and to; state_change of MM, GMM, RR, RRC, registration, 1x and EV-DO;
 reject with its cause; service_lost and service_back, by the kind of service that the records say, or where they say
 none, by 15 s without a word of a serving cell; link_lost and link_back, by 15 s without a message; unknown_record,
-for each log code that no decoder understands, when it is first seen.)";
+for each log code that no decoder understands, when it is first seen. What is no change has its reason: of a reject
+the cause, of an unknown record, whose code is in "to", what became of it.)";
 
 int run(const SurveyOptions& options, MessageTally& tally) {
   const RecordOutput::Format format = options.format.format();

@@ -15,8 +15,11 @@ using survey::Event;
 using survey::EventKind;
 
 std::string words(EventKind kind, std::string from, std::string to, const Quantity* quantity = nullptr) {
-  return wordsOf(
-      {.kind = kind, .cell = {}, .quantity = quantity, .from = std::move(from), .to = std::move(to)});
+  return wordsOf({.kind = kind, .quantity = quantity, .from = std::move(from), .to = std::move(to)});
+}
+
+std::string because(EventKind kind, std::string reason, const Quantity* quantity = nullptr) {
+  return wordsOf({.kind = kind, .quantity = quantity, .reason = std::move(reason)});
 }
 
 TEST(EventWords, ACellChangeSaysNoMoreThanItHasTo) {
@@ -39,14 +42,14 @@ TEST(EventWords, OfEveryKind) {
   EXPECT_EQ(words(EventKind::ratChange, "umts", "lte"), "RAT change UMTS to LTE");
   EXPECT_EQ(words(EventKind::ratChange, "evdo", "cdma"), "RAT change EV-DO to 1x");
   EXPECT_EQ(words(EventKind::stateChange, "Idle", "Connected", &quantity::rrcState), "RRC Idle to Connected");
-  EXPECT_EQ(words(EventKind::reject, "", "GU3", &quantity::gmmUpdateStatus), "GPRS update rejected: GU3");
-  EXPECT_EQ(words(EventKind::serviceLost, "", "no serving cell for 15 s"),
+  EXPECT_EQ(because(EventKind::reject, "GU3", &quantity::gmmUpdateStatus), "GPRS update rejected: GU3");
+  EXPECT_EQ(because(EventKind::serviceLost, "no serving cell for 15 s"),
             "service lost: no serving cell for 15 s");
-  EXPECT_EQ(words(EventKind::serviceBack, "", "lte:3350/404"), "service back: LTE 3350/404");
-  EXPECT_EQ(words(EventKind::serviceBack, "", "Full service"), "service back: Full service");
-  EXPECT_EQ(words(EventKind::linkLost, "", "no message for 15 s"), "link lost: no message for 15 s");
-  EXPECT_EQ(words(EventKind::linkBack, "", "after 41 s"), "link back: after 41 s");
-  EXPECT_EQ(words(EventKind::unknownRecord, "", "0xB17E first seen: not asked for, 12 bytes"),
+  EXPECT_EQ(because(EventKind::serviceBack, "lte:3350/404"), "service back: LTE 3350/404");
+  EXPECT_EQ(because(EventKind::serviceBack, "Full service"), "service back: Full service");
+  EXPECT_EQ(because(EventKind::linkLost, "no message for 15 s"), "link lost: no message for 15 s");
+  EXPECT_EQ(because(EventKind::linkBack, "after 41 s"), "link back: after 41 s");
+  EXPECT_EQ(wordsOf({.kind = EventKind::unknownRecord, .to = "0xB17E", .reason = "not asked for, 12 bytes"}),
             "unknown record 0xB17E first seen: not asked for, 12 bytes");
 }
 

@@ -158,6 +158,37 @@ TEST(EventFinder, AChangeOfCellAndOfRat) {
                                  "2 cell_change: cell change gsm:62/12 to gsm:66/13"}));
 }
 
+// 1x and EV-DO serve side by side.
+TEST(EventFinder, AStateOfAnAirInterfaceStandsBesideItsCell) {
+  std::vector<std::string> found;
+  EventFinder finder([&](const Event& event) { found.push_back(event.text() + ", " + textOf(event.cell)); });
+  finder.hearServing({RadioFamily::evdo, 242, 344}, noon);
+  finder.take(Message(0s).plain(quantity::evdoState, 0).plain(quantity::oneXState, 6));
+  finder.take(Message(1s).plain(quantity::oneXState, 7));
+  finder.hearServing({RadioFamily::cdma, 283, 284}, noon + 2s);
+  finder.take(Message(2s).plain(quantity::evdoState, 5).plain(quantity::oneXState, 6));
+  EXPECT_EQ(found, (Found{"1x 6 to 7, ", "EV-DO 0 to 5, evdo:242/344", "1x 7 to 6, cdma:283/284"}));
+}
+
+TEST(EventFinder, WhatIsNoChangeHasAReasonAndNoFromAndTo) {
+  std::vector<Event> found;
+  EventFinder finder([&](const Event& event) { found.push_back(event); });
+  finder.take(Message(0s).plain(quantity::serviceType, 0, services));
+  finder.take(Message(0s).plain(quantity::mmUpdateStatus, 2, updates));
+  finder.lose(noon, "gone");
+  Intake intake;
+  intake.count(0xB193, Outcome::notAskedFor, noon, std::vector<std::uint8_t>(20));
+  finder.take(intake);
+  ASSERT_EQ(found.size(), 4u);
+  const std::array<std::string_view, 4> reasons{"NO_SERVICE", "ROAMING_NOT_ALLOWED", "gone",
+                                                "not asked for, 20 bytes"};
+  for (std::size_t at = 0; at < found.size(); ++at) {
+    EXPECT_EQ(found[at].reason, reasons[at]);
+    EXPECT_EQ(found[at].from, "");
+    EXPECT_EQ(found[at].to, at == 3 ? "0xB193" : "");
+  }
+}
+
 TEST(EventFinder, AnUnknownRecordIsNewsOnce) {
   Finder finder;
   Intake intake;
