@@ -15,7 +15,7 @@ constexpr auto footer =
     R"(A record for each log code and each way in which its messages ended, the most frequent first: shown, not asked for
 (no decoder wants the code; "nearest" is the known code beside it), too short, not understood, section missing (from
 the template), unknown log type, not a record, property list refused. With it come first and last arrival, the last
-length, the version byte where the record has one, and the first bytes of the first such message.)";
+length and the last version byte, where the record has one, and the first bytes of the first such message.)";
 
 int run(const SurveyOptions& options, MessageTally& tally) {
   Coverage coverage;
