@@ -54,7 +54,7 @@ void Readings::addEntry(const ReadingSection& section, std::size_t entry, const 
             values_.emplace_back(value), true);
 }
 
-void Readings::addDisplay(const PlistValue& display) {
+void Readings::addDisplay(const PlistValue& display, CellRole (*roleOf)(std::string_view section)) {
   addRemovalOfEverything();
   const PlistDictionary* entries = display.dictionary();
   if (!entries || entries->empty())
@@ -62,6 +62,7 @@ void Readings::addDisplay(const PlistValue& display) {
   for (const auto& [key, value] : *entries) {
     ReadingSection& section = sections_.emplace_back();
     section.name = withoutSortPrefix(key);
+    section.role = roleOf(section.name);
     appendPathStep(section.path, key);
     addLeaves({.section = &section}, {}, key, values_.emplace_back(value), true);
   }

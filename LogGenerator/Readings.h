@@ -45,8 +45,11 @@ class Readings {
   void addValue(const ReadingSection& section, std::string_view row, const PlistValue& value, bool isNew);
   // The same for an entry behind the last one of a section that is a list.
   void addEntry(const ReadingSection& section, std::size_t entry, const PlistValue& value);
-  // A display in place of the whole one before. What stands at its top are its sections.
-  void addDisplay(const PlistValue& display);
+  // A display in place of the whole one before. What stands at its top are its sections, whose names, the
+  // sort prefix left out, tell their role.
+  void addDisplay(
+      const PlistValue& display,
+      CellRole (*roleOf)(std::string_view section) = [](std::string_view) { return CellRole::none; });
 
   // Gives all readings from this one on their cell.
   void identify(std::size_t from, const CellIdentity& cell);

@@ -7,8 +7,16 @@
 
 namespace kelvasi {
 
+namespace {
+
+constexpr bool isNumber(std::int64_t value) {
+  return value >= 0 && value <= std::numeric_limits<std::uint32_t>::max();
+}
+
+}  // namespace
+
 Carriers carriersOf(const CellIdentity& cell) {
-  if (cell.channel < 0 || cell.channel > std::numeric_limits<std::uint32_t>::max()) return {};
+  if (!isNumber(cell.channel)) return {};
   const auto channel = static_cast<std::uint32_t>(cell.channel);
   switch (cell.family) {
     case RadioFamily::none:
@@ -26,6 +34,13 @@ Carriers carriersOf(const CellIdentity& cell) {
       return cdmaCarriers(channel);
   }
   return {};
+}
+
+Carriers carriersOf(const CellIdentity& cell, std::optional<std::int64_t> bandClass) {
+  const bool isCdma = cell.family == RadioFamily::cdma || cell.family == RadioFamily::evdo;
+  if (!isCdma || !bandClass) return carriersOf(cell);
+  if (!isNumber(cell.channel) || !isNumber(*bandClass)) return {};
+  return cdmaCarriers(static_cast<std::uint32_t>(cell.channel), static_cast<std::uint32_t>(*bandClass));
 }
 
 }  // namespace kelvasi

@@ -4,15 +4,9 @@
 #include <map>
 #include <utility>
 
+#include "Survey/Cells/OneOfSeveral.h"
+
 namespace kelvasi::survey {
-
-namespace {
-
-bool isInList(const Reading& reading) {
-  return reading.entry != Reading::notInList || reading.element != Reading::notInList;
-}
-
-}  // namespace
 
 Survey::Survey(SurveySetUp setUp)
     : onEvent_(std::move(setUp.onEvent)),
@@ -48,7 +42,7 @@ void Survey::measured(const SeenCell* cell, const Reading& reading, double value
   const Quantity* quantity = quantityOf(reading);
   if (series_) series_->add({cell ? cell->number : 0, quantity}, now_, static_cast<float>(value));
   // Alarms are about the handset where it is: its serving cell, and what is of no cell at all.
-  if (cell ? !cells_.isServing(*cell) : isInList(reading)) return;
+  if (cell ? !cells_.isServing(*cell) : isOneOfSeveral(reading)) return;
   const SeenCell* whose = cell ? cell : cells_.serving();
   alarms_.value(*quantity, now_, value, whose ? whose->identity : CellIdentity());
 }

@@ -7,7 +7,6 @@
 #include <vector>
 
 #include "Radio/CellCarriers.h"
-#include "Radio/Channels.h"
 
 namespace kelvasi::cockpit {
 
@@ -57,13 +56,6 @@ std::string listed(const Carriers& carriers, Append&& append) {
   std::string joined;
   for (const std::string& text : texts) joined += (joined.empty() ? "" : " or ") + text;
   return joined;
-}
-
-Carriers carriersOf(const CellIdentity& cell, std::optional<std::int64_t> bandClass) {
-  const bool isCdma = cell.family == RadioFamily::cdma || cell.family == RadioFamily::evdo;
-  if (isCdma && bandClass && cell.channel >= 0 && *bandClass >= 0)
-    return cdmaCarriers(static_cast<std::uint32_t>(cell.channel), static_cast<std::uint32_t>(*bandClass));
-  return kelvasi::carriersOf(cell);
 }
 
 }  // namespace

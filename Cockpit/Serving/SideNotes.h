@@ -4,10 +4,10 @@
 #pragma once
 
 #include <cstdint>
-#include <map>
 #include <optional>
 
 #include "LogGenerator/Readings.h"
+#include "Survey/Cells/BandClasses.h"
 
 namespace kelvasi::cockpit {
 
@@ -20,11 +20,9 @@ class SideNotes {
   std::optional<std::int64_t> bandClass(std::int64_t cdmaChannel) const;
 
  private:
-  static constexpr std::size_t mostChannels = 256;
-
   std::optional<std::int64_t> area_;
   std::optional<std::int64_t> routingArea_;
-  std::map<std::int64_t, std::int64_t> bandClasses_;  // by channel
+  survey::BandClasses bandClasses_;
 };
 
 }  // namespace kelvasi::cockpit

@@ -44,7 +44,7 @@ void GSMLogGenerator::updateState(PlistDictionary& state, std::span<const std::u
   state.set("ExtraInfo", PlistDictionary::make());
   count(0, Outcome::shown, data);
   if (!readings()) return;
-  readings()->addDisplay(display);
+  readings()->addDisplay(display, roleOfObjectSection);
   nameObjectReadings(readings()->all());
 }
 

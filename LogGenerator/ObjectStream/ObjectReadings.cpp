@@ -42,6 +42,15 @@ constexpr std::array rows{
     level("Transmit Power", quantity::txPower, " dBm"),
 };
 
+struct SectionRole {
+  std::string_view name;
+  CellRole role;
+};
+constexpr std::array sectionRoles{
+    SectionRole{"Serving Cell", CellRole::serving},
+    SectionRole{"Neighbor Cells", CellRole::neighbour},
+};
+
 struct CellNames {
   RadioFamily family;
   const Quantity* channel;
@@ -100,6 +109,11 @@ void learn(CellIdentity& cell, const Reading& reading) {
 
 std::span<const Row> objectRows() {
   return rows;
+}
+
+CellRole roleOfObjectSection(std::string_view name) {
+  const auto found = std::ranges::find(sectionRoles, name, &SectionRole::name);
+  return found == sectionRoles.end() ? CellRole::none : found->role;
 }
 
 void nameObjectReadings(std::span<Reading> readings) {

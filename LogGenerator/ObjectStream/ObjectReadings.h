@@ -13,6 +13,9 @@ namespace kelvasi {
 // A text under one of these keys that is a number and the row's unit is of the row's quantity.
 std::span<const Row> objectRows();
 
+// What the cells of the section of this name are to the handset.
+CellRole roleOfObjectSection(std::string_view name);
+
 // Gives the values of a display their quantities, numbers and cells, as far as their names tell.
 void nameObjectReadings(std::span<Reading> readings);
 

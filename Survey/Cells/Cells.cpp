@@ -5,6 +5,8 @@
 #include <array>
 #include <utility>
 
+#include "Survey/Cells/OneOfSeveral.h"
+
 namespace kelvasi::survey {
 
 namespace {
@@ -19,21 +21,20 @@ constexpr std::array nameQuantities{
     NameQuantity{&quantity::cellId, &CellNames::cellId}, NameQuantity{&quantity::baseId, &CellNames::cellId},
     NameQuantity{&quantity::sid, &CellNames::sid},       NameQuantity{&quantity::nid, &CellNames::nid}};
 
+constexpr bool isCdma(const CellIdentity& cell) {
+  return cell.family == RadioFamily::cdma || cell.family == RadioFamily::evdo;
+}
+
 const NameQuantity* nameQuantityOf(const Quantity* quantity) {
   const auto found = std::ranges::find(nameQuantities, quantity, &NameQuantity::quantity);
   return found == nameQuantities.end() ? nullptr : &*found;
-}
-
-bool isInList(const Reading& reading) {
-  return reading.entry != Reading::notInList || reading.element != Reading::notInList;
 }
 
 // The sections of CDMA hold all sorts of rows; there a row itself tells: a pilot of the active set by its
 // Ec/Io, the serving cell by its channel or PN offset.
 CellRole roleOf(const Reading& reading, const Quantity& quantity) {
   const CellRole role = reading.section ? reading.section->role : CellRole::none;
-  const RadioFamily family = reading.cell.family;
-  if (role != CellRole::none || (family != RadioFamily::cdma && family != RadioFamily::evdo)) return role;
+  if (role != CellRole::none || !isCdma(reading.cell)) return role;
   if (&quantity == &quantity::ecio) return CellRole::active;
   return quantity.kind == QuantityKind::identity ? CellRole::serving : CellRole::none;
 }
@@ -63,6 +64,7 @@ Cells::Cells(OnMeasured onMeasured, OnServing onServing, std::size_t most)
 void Cells::take(const Readings& readings) {
   ++message_;
   lastAsked_ = {};
+  bandClasses_.take(readings);
   const Naming naming = namingIn(readings);
   if (naming.cell) learn(naming, readings.arrival());
   for (const Reading& reading : readings.all()) measure(reading, readings.arrival());
@@ -73,7 +75,7 @@ Cells::Naming Cells::namingIn(const Readings& readings) {
   Naming naming;
   for (const Reading& reading : readings.all()) {
     const Quantity* quantity = quantityOf(reading);
-    if (!quantity || quantity->kind != QuantityKind::identity || isInList(reading)) continue;
+    if (!quantity || quantity->kind != QuantityKind::identity || isOneOfSeveral(reading)) continue;
     const auto number = numberOf(reading);
     if (!number || *number < 0) continue;
     if (namesServingCell(reading, *quantity, *number)) naming.cell = reading.cell;
@@ -128,6 +130,7 @@ void Cells::mention(std::size_t cell, CellRole role, Arrival time) {
   if (role == CellRole::neighbour && isServing(seen)) role = CellRole::serving;
   if (role != CellRole::none) seen.role = role;
   seen.roles.add(role);
+  if (isCdma(seen.identity)) seen.bandClass = bandClasses_.of(seen.identity.channel);
   seen.last = std::max(seen.last, time);
   seen.first = std::min(seen.first, time);
   if (std::exchange(mentioned_[cell], message_) != message_) ++seen.count;

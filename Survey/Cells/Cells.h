@@ -18,6 +18,7 @@
 #include <vector>
 
 #include "LogGenerator/Readings.h"
+#include "Survey/Cells/BandClasses.h"
 #include "Survey/Cells/SeenCell.h"
 
 namespace kelvasi::survey {
@@ -89,6 +90,7 @@ class Cells {
   OnServing onServing_;
   std::size_t most_;
   std::vector<SeenCell> cells_;
+  BandClasses bandClasses_;
   std::vector<std::uint64_t> mentioned_;  // by cell: the message that spoke of it last
   std::vector<Place> index_;              // by identity; the latest cell of each
   struct Serving {

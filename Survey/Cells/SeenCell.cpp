@@ -68,6 +68,7 @@ void SeenCell::add(const Quantity& quantity, Arrival time, double value) {
 
 void SeenCell::merge(const SeenCell& other) {
   names.learn(other.names);
+  if (other.bandClass) bandClass = other.bandClass;
   roles.add(other.roles);
   if (other.last >= last) role = other.role;
   first = std::min(first, other.first);

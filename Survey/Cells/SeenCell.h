@@ -66,9 +66,10 @@ struct SeenCell {
   std::uint32_t number = 0;  // of this record, never given again
   CellIdentity identity;
   CellNames names;
-  RoleSet roles;                   // all that it ever had
-  CellRole role = CellRole::none;  // the one it was named in last
-  Arrival first{0};                // when a message first spoke of it
+  std::optional<std::int64_t> bandClass = {};  // of CDMA, where a record said it
+  RoleSet roles;                               // all that it ever had
+  CellRole role = CellRole::none;              // the one it was named in last
+  Arrival first{0};                            // when a message first spoke of it
   Arrival last{0};
   std::uint64_t count = 0;  // messages that spoke of it
 

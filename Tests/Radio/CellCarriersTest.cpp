@@ -21,6 +21,15 @@ TEST(CellCarriers, EachFamilyHasItsOwnNumbers) {
   EXPECT_EQ(carriersInText(RadioFamily::none, 62), "");
 }
 
+TEST(CellCarriers, WhereItIsKnownTheBandClassChoosesAmongThoseOfACdmaChannel) {
+  EXPECT_EQ(textOf(carriersOf({RadioFamily::cdma, 283, 132}, 0)), "BC0 878.49 MHz");
+  EXPECT_EQ(textOf(carriersOf({RadioFamily::evdo, 283, 132}, 1)), "BC1 1944.15 MHz");
+  EXPECT_EQ(textOf(carriersOf({RadioFamily::cdma, 283, 132}, 31)), "");
+  EXPECT_EQ(textOf(carriersOf({RadioFamily::cdma, 283, 132}, -1)), "");
+  EXPECT_EQ(carriersOf({RadioFamily::cdma, 1300, 132}, std::nullopt).size(), 5u);
+  EXPECT_EQ(textOf(carriersOf({RadioFamily::lte, 3350, 404}, 0)), "B7 2680 MHz");
+}
+
 TEST(CellCarriers, AChannelThatIsNotKnownOrTooLargeHasNone) {
   EXPECT_EQ(carriersInText(RadioFamily::lte, CellIdentity::unknown), "");
   EXPECT_EQ(carriersInText(RadioFamily::lte, (std::int64_t{1} << 32) + 3350), "");

@@ -70,6 +70,16 @@ TEST(Survey, AnAlarmLooksAtTheServingCell) {
   EXPECT_EQ(drive.alarms, std::vector<std::string>{"lte:3350/362 -100"});
 }
 
+TEST(Survey, AnAlarmLooksAtNoNeighbourWhoseCellIsNotKnown) {
+  const ReadingSection others{.name = "Others", .path = "/Others", .role = CellRole::neighbour};
+  const Row row{.key = "RSRP", .quantity = quantity::rsrp};
+  Surveyed drive("rsrp < -99");
+  Readings readings = served(0s, here, -90);
+  readings.add({.section = &others, .row = &row, .raw = -120, .key = row.key});
+  drive.take(readings);
+  EXPECT_EQ(drive.alarms, std::vector<std::string>{});
+}
+
 TEST(Survey, AnAlarmLooksAtTheHandsetItself) {
   Surveyed drive("tx_power > 20");
   drive.take(Message(0s).plain(quantity::txPower, 23));

@@ -44,6 +44,14 @@ TEST(RecordOutput, ATableHasItsColumns) {
             "\n");
 }
 
+TEST(RecordOutput, ColumnsAreAsWideAsTheirRecords) {
+  const std::array<Json, 2> records{oneRecord(), Json{{"cell_id", "Télé 1234"}, {"mean", -1234.56}}};
+  const auto wide = fitted(columns, records);
+  std::vector<std::size_t> widths;
+  for (const Column& column : wide) widths.push_back(column.width);
+  EXPECT_EQ(widths, (std::vector<std::size_t>{19, 9, 7, 14, 0}));
+}
+
 TEST(RecordOutput, ATableObeysNoTerminalCodes) {
   EXPECT_EQ(printed(Format::table, {Json{{"cell_id", "\x1b[2J\n"}}}).substr(45),
             "                     ?[2J?\n");

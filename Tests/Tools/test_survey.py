@@ -5,6 +5,7 @@ import csv
 import io
 import json
 import os
+import re
 import signal
 import subprocess
 import time
@@ -91,6 +92,35 @@ class Cells(Survey):
         self.assertEqual(first.split(), ["lte:3350/404", "B7", "2680.0", "4517", "27578369", "serving", "14:07:09",
                                          "14:07:10", "rsrp", "dBm", "1", "-95.0", "-95.0", "-95.0"])
         self.assertEqual(second.split()[0], "rsrq")
+
+    def test_a_table_stands_straight(self):
+        for technology in ("IFX", "Orvane_GSM", "Orvane_CDMA", "Orvane_LTE", "Orvane_UTRAN2"):
+            with self.subTest(technology):
+                heading, *lines = self.run_verb("cells", "--format", "table", self.drive(technology)).splitlines()
+                begins = [match.start() for match in re.finditer(r"(?<=  )(bands|network|roles|first|last|quantity|unit)\b",
+                                                                 heading)]
+                self.assertEqual(len(begins), 7)
+                self.assertGreater(len(lines), 5)
+                for line in lines:
+                    self.assertEqual([line[begin - 2:begin].strip() for begin in begins], [""] * 7, line)
+
+    def test_the_band_class_that_a_record_says_is_the_band(self):
+        cells = self.records("cells", self.drive("Orvane_CDMA"))
+        self.assertEqual({tuple(cell["bands"]) for cell in cells}, {("BC0",)})
+        self.assertEqual({cell["mhz"][0] for cell in cells}, {878.49, 877.26})
+
+    def test_the_object_stream_has_cells_that_serve_and_their_names(self):
+        path = self.drive("IFX")
+        cells = self.records("cells", path)
+        self.assertEqual({role for cell in cells for role in cell["roles"]}, {"serving", "neighbour"})
+        serving = [cell for cell in cells if "serving" in cell["roles"]]
+        self.assertGreater(len(serving), 5)
+        for cell in serving:
+            self.assertRegex(cell["network"], "^999-0[12]")
+            self.assertIsNotNone(cell["cell_id"])
+        self.assertEqual({cell["cell_id"] for cell in cells if cell["roles"] == ["neighbour"]}, {None})
+        kinds = {event["event"] for event in self.records("events", path)}
+        self.assertTrue({"cell_change", "rat_change"} <= kinds, kinds)
 
     def test_captures_are_merged_over_technologies(self):
         lte = self.lte((0.0, serving()), (1.0, measured(-95)))

@@ -3,6 +3,8 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdio>
+#include <iterator>
 
 #include "Radio/CellCarriers.h"
 #include "Tools/Kelvasictl/RecordText.h"
@@ -16,9 +18,11 @@ using survey::SeenCell;
 
 constexpr std::array roles{CellRole::serving, CellRole::active, CellRole::neighbour, CellRole::candidate};
 
-constexpr std::array levelsOfTables{&quantity::rsrp,  &quantity::rsrq,    &quantity::rssi,
-                                    &quantity::rscp,  &quantity::ecno,    &quantity::ecio,
-                                    &quantity::rxlev, &quantity::rxPower, &quantity::carrierToInterference};
+constexpr std::array levelsOfTables{&quantity::rsrp,     &quantity::rsrq,    &quantity::rssi,
+                                    &quantity::rscp,     &quantity::ecno,    &quantity::ecio,
+                                    &quantity::rxlev,    &quantity::rxPower, &quantity::carrierToInterference,
+                                    &quantity::rscpLevel};
+constexpr std::size_t bandsOfTables = 3;  // more say nothing any more
 
 constexpr std::array columns{
     Column{.key = "cell", .width = 14},
@@ -52,10 +56,10 @@ Json known(std::int64_t number) {
   return number == CellIdentity::unknown ? Json() : Json(number);
 }
 
-void addCarriers(Json& record, const CellIdentity& cell) {
+void addCarriers(Json& record, const SeenCell& cell) {
   Json bands = Json::array();
   Json mhz = Json::array();
-  for (const Carrier& carrier : carriersOf(cell)) {
+  for (const Carrier& carrier : carriersOf(cell.identity, cell.bandClass)) {
     bands.push_back(carrier.band.name);
     mhz.push_back(carrier.downlink.megahertz());
   }
@@ -93,7 +97,7 @@ Json recordOf(const SeenCell& cell, const Operators& operators) {
   record["rat"] = nameOf(cell.identity.family);
   record["channel"] = known(cell.identity.channel);
   record["code"] = known(cell.identity.code);
-  addCarriers(record, cell.identity);
+  addCarriers(record, cell);
   record["network"] = network(cell.names, operators);
   record["area"] = orNull(cell.names.area);
   record["cell_id"] = orNull(cell.names.cellId);
@@ -113,24 +117,44 @@ std::vector<const SeenCell*> inOrder(const survey::Cells& cells) {
   return order;
 }
 
-bool isShown(const CellLevel& level, RecordOutput::Format format) {
-  return format != RecordOutput::Format::table ||
-         std::ranges::find(levelsOfTables, level.quantity) != levelsOfTables.end();
+bool isShownInTables(const CellLevel& level) {
+  return std::ranges::find(levelsOfTables, level.quantity) != levelsOfTables.end();
 }
 
-void printLevels(const SeenCell& cell, Json line, RecordOutput& output, RecordOutput::Format format) {
-  // A table has room for one role: the one that says most.
-  if (format == RecordOutput::Format::table && !line["roles"].empty()) line["roles"] = line["roles"].front();
-  bool isFirst = true;
+// On a scale from 0 to 1 a tenth says little.
+void refine(Json& line, const Quantity& quantity) {
+  if (quantity.most - quantity.least > 1) return;
+  for (const char* key : {"min", "mean", "max"}) {
+    std::array<char, 32> text;
+    std::snprintf(text.data(), text.size(), "%.3f", line[key].get<double>());
+    line[key] = text.data();
+  }
+}
+
+// Only the first line tells of the cell, with the role that says most.
+void shortenForTable(Json& line) {
+  if (!line["roles"].empty()) line["roles"] = line["roles"].front();
+  const std::size_t bands = line["bands"].size();
+  if (bands <= bandsOfTables) return;
+  line["bands"] = std::to_string(bands) + " bands";
+  line["mhz"] = nullptr;
+}
+
+// A line for each level; one without a level where there is none.
+std::vector<Json> levelLines(const SeenCell& cell, const Operators& operators, bool isTable) {
+  Json line = recordOf(cell, operators);
+  if (isTable) shortenForTable(line);
+  std::vector<Json> lines;
   for (const CellLevel& level : cell.levels()) {
-    if (!isShown(level, format)) continue;
-    if (!isFirst && format == RecordOutput::Format::table) line = Json::object();
+    if (isTable && !isShownInTables(level)) continue;
     line["quantity"] = level.quantity->id;
     addLevel(line, level);
-    output.print(line);
-    isFirst = false;
+    if (isTable) refine(line, *level.quantity);
+    lines.push_back(line);
+    if (isTable) line = Json::object();
   }
-  if (isFirst) output.print(line);
+  if (lines.empty()) lines.push_back(std::move(line));
+  return lines;
 }
 
 }  // namespace
@@ -148,14 +172,18 @@ std::vector<Json> cellRecords(const survey::Cells& cells, const Operators& opera
 
 void printCells(const survey::Cells& cells, const Operators& operators, RecordOutput::Format format,
                 RecordOutput::Print print) {
-  RecordOutput output(format, columns, std::move(print));
-  output.begin();
+  const bool isTable = format == RecordOutput::Format::table;
+  std::vector<Json> lines;
   if (format == RecordOutput::Format::ndjson) {
-    for (const Json& record : cellRecords(cells, operators)) output.print(record);
+    lines = cellRecords(cells, operators);
   } else {
     for (const SeenCell* cell : inOrder(cells))
-      printLevels(*cell, recordOf(*cell, operators), output, format);
+      std::ranges::move(levelLines(*cell, operators, isTable), std::back_inserter(lines));
   }
+  const std::vector<Column> widths = fitted(columns, lines);
+  RecordOutput output(format, widths, std::move(print));
+  output.begin();
+  for (const Json& line : lines) output.print(line);
 }
 
 }  // namespace kelvasi

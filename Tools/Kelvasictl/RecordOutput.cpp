@@ -65,6 +65,18 @@ void trimRight(std::string& line) {
 
 }  // namespace
 
+std::vector<Column> fitted(std::span<const Column> columns, std::span<const Json> records) {
+  std::vector<Column> result(columns.begin(), columns.end());
+  for (Column& column : result) {
+    for (const Json& record : records) {
+      const auto value = record.find(std::string(column.key));
+      if (column.width == 0 || column.isTime || value == record.end()) continue;
+      column.width = std::max(column.width, widthOf(shown(column, *value)));
+    }
+  }
+  return result;
+}
+
 void RecordOutput::print(const Json& record) {
   if (format_ == Format::ndjson) return print_(jsonText(record) + "\n");
   if (format_ == Format::table) return print_(tableLine(record));

@@ -8,6 +8,7 @@
 #include <span>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "Tools/OptionSet.h"
 
@@ -22,6 +23,9 @@ struct Column {
   int decimals = 0;       // in a table
   bool isTime = false;    // whole seconds are enough for a table
 };
+
+// The columns of a table, as wide as these records need at least.
+std::vector<Column> fitted(std::span<const Column> columns, std::span<const Json> records);
 
 class RecordOutput {
  public:

@@ -8,7 +8,7 @@ namespace {
 
 Readings readingsOf(const PlistValue& display) {
   Readings readings;
-  readings.addDisplay(display);
+  readings.addDisplay(display, roleOfObjectSection);
   nameObjectReadings(readings.all());
   return readings;
 }
@@ -37,6 +37,19 @@ TEST(ObjectReadings, LeaveATextWithAnotherUnitOrWithMoreThanANumberAsItIs) {
     EXPECT_EQ(numberOf(reading), std::nullopt);
     EXPECT_FALSE(reading.cell);
   }
+}
+
+TEST(ObjectReadings, HaveTheRoleThatTheirSectionsNameTells) {
+  const auto cell = PlistDictionary::make({{"ARFCN", "62"}, {"BSIC", "13"}});
+  const PlistValue display =
+      PlistDictionary::make({{"02;Serving Cell", cell},
+                             {"Neighbor Cells", PlistDictionary::make({{"GSM", cell}})},
+                             {"Other", cell}});
+  const Readings readings = readingsOf(display);
+  ASSERT_EQ(readings.all().size(), 7u);  // a removal first
+  EXPECT_EQ(readings.all()[1].section->role, CellRole::serving);
+  EXPECT_EQ(readings.all()[3].section->role, CellRole::neighbour);
+  EXPECT_EQ(readings.all()[5].section->role, CellRole::none);
 }
 
 TEST(ObjectReadings, TellTheCellsOfAListApart) {

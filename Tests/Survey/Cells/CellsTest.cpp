@@ -243,6 +243,36 @@ TEST(Cells, TwoAirInterfacesServeSideBySide) {
   EXPECT_TRUE(cells.isServing(onlyCell(cells, data)));
 }
 
+// The number of a CDMA channel does not tell it.
+TEST(Cells, ACdmaCellHasTheBandClassThatRecordsSayOfItsChannel) {
+  Cells cells;
+  const CellIdentity voice{RadioFamily::cdma, 384, 12};
+  const CellIdentity elsewhere{RadioFamily::cdma, 507, 12};
+  cells.take(Message(0s).serving(voice, quantity::cdmaChannel, 384));
+  EXPECT_EQ(onlyCell(cells, voice).bandClass, std::nullopt);
+  cells.take(Message(1s).plain(quantity::bandClass, 1).plain(quantity::cdmaChannel, 384));
+  cells.take(Message(2s).serving(voice, quantity::cdmaChannel, 384));
+  cells.take(Message(3s).serving(elsewhere, quantity::cdmaChannel, 507));
+  EXPECT_EQ(onlyCell(cells, voice).bandClass, 1);
+  EXPECT_EQ(onlyCell(cells, elsewhere).bandClass, std::nullopt);
+  Cells merged;
+  merged.merge(cells);
+  EXPECT_EQ(onlyCell(merged, voice).bandClass, 1);
+}
+
+// Not only where they stand in a list.
+TEST(Cells, WhatNeighboursAreCalledIsNoNameOfTheServingCell) {
+  const ReadingSection others{.name = "Others", .path = "/Others", .role = CellRole::neighbour};
+  const Row row{.key = "Cell ID", .quantity = quantity::cellId};
+  Message message(0s);
+  message.serving(here, quantity::earfcn, here.channel).serving(here, quantity::cellId, 7);
+  Readings readings = message;
+  readings.add({.section = &others, .row = &row, .raw = 99, .key = row.key, .cell = there});
+  Cells cells;
+  cells.take(readings);
+  EXPECT_EQ(onlyCell(cells, here).names.cellId, 7);
+}
+
 // Many kinds of record have a serving section; only one that names the cell says where the handset is.
 TEST(Cells, AStateOfTheOldCellIsNoWayBack) {
   Cells cells;
