@@ -40,7 +40,7 @@ int main(int count, char** arguments) {
   if (benchmark::ReportUnrecognizedArguments(allCount, const_cast<char**>(all.data()))) return 2;
   Table table;
   addRecordDecoding(table);
-  addMixtureDecoding(table);
+  addDriveDecoding(table);
   addCaptureDecoding(table, isSmoke);
   addTree(table);
   addChannel(table, isSmoke);

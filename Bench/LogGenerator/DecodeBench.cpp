@@ -2,6 +2,7 @@
 #include "Bench/LogGenerator/DecodeBench.h"
 
 #include "Bench/LogGenerator/Decoding.h"
+#include "Bench/Simulator/Drive.h"
 #include "Tests/Support/AllocationCounter.h"
 
 namespace kelvasi::bench {
@@ -9,7 +10,7 @@ namespace kelvasi::bench {
 namespace {
 
 constexpr std::size_t messagesPerTick = 4096;  // about 2000 a second
-constexpr std::size_t mixtureLength = 1024;
+constexpr std::size_t driveLength = 4096;
 
 // What a tick allocates is not the records' doing, but it takes its time.
 Work decoding(std::string_view technology, Messages messages) {
@@ -61,10 +62,10 @@ void addRecordDecoding(Table& table) {
   }
 }
 
-void addMixtureDecoding(Table& table) {
+void addDriveDecoding(Table& table) {
   for (const Technology& technology : technologies()) {
-    table.add(measurement(std::string(technology.name) + " mixture, in memory", technology.id,
-                          mixtureOf(technology, mixtureLength)));
+    const Messages messages = driveOf(technology, driveLength);
+    table.add(measurement(nameOfDrive(technology, messages) + ", in memory", technology.id, messages));
   }
 }
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// Decoding, record type by record type and in mixtures.
+// Decoding, record type by record type and in drives.
 #pragma once
 
 #include "Bench/LogGenerator/Samples.h"
@@ -11,6 +11,6 @@ namespace kelvasi::bench {
 std::vector<PlainRows> rowsOfEach(std::string_view technology, const Messages& messages);
 
 void addRecordDecoding(Table& table);
-void addMixtureDecoding(Table& table);
+void addDriveDecoding(Table& table);
 
 }  // namespace kelvasi::bench

@@ -89,13 +89,4 @@ Messages recordsOf(const Sample& sample) {
   return records;
 }
 
-Messages mixtureOf(const Technology& technology, std::size_t count) {
-  std::vector<const Sample*> draw;
-  for (const Sample& sample : technology.samples) draw.insert(draw.end(), sample.share, &sample);
-  Random random;
-  Messages messages(count);
-  std::ranges::generate(messages, [&] { return makeRecord(*draw[random.below(draw.size())], random); });
-  return messages;
-}
-
 }  // namespace kelvasi::bench

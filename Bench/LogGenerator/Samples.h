@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// The records that the benchmarks decode. To add one, add a line to the table of its technology.
+// The records that the benchmarks decode kind by kind. To add one, add a line to the table of its technology.
 #pragma once
 
 #include <array>
@@ -30,7 +30,6 @@ struct FieldValue {
 
 struct Sample {
   std::string_view name;
-  unsigned share = 1;  // how often it comes in a mixed capture, against the others of its technology
   LogCode logCode = 0;
   std::size_t length = 0;  // at least
   std::span<const Field> layout = {};
@@ -56,7 +55,5 @@ std::span<const Technology> technologies();
 Bytes makeRecord(const Sample& sample, Random& random);
 // Some records of one kind.
 Messages recordsOf(const Sample& sample);
-// A capture's worth of records of a technology, drawn by their shares.
-Messages mixtureOf(const Technology& technology, std::size_t count);
 
 }  // namespace kelvasi::bench

@@ -5,6 +5,7 @@
 #include <iterator>
 
 #include "Bench/LogGenerator/Decoding.h"
+#include "Bench/Simulator/Drive.h"
 #include "Bench/Support/Baselines.h"
 #include "Model/KelvasiModelNode.h"
 #include "Tests/Support/AllocationCounter.h"
@@ -13,7 +14,7 @@ namespace kelvasi::bench {
 
 namespace {
 
-constexpr std::size_t messagesPerTick = 1000;
+constexpr std::size_t messagesPerTick = 4000;  // two seconds at 2,000/s
 
 std::size_t treeSize(const PlistValue& display) {
   PathDictionary nodes;
@@ -27,7 +28,7 @@ PlistValue displayOf(Decoding& generator, const Messages& messages) {
 }
 
 FilledDisplay filled(const Technology& technology) {
-  Messages messages = mixtureOf(technology, messagesPerTick);
+  Messages messages = driveOf(technology, messagesPerTick);
   Decoding generator(technology.id);
   const std::size_t nodes = treeSize(displayOf(generator, messages));
   return {technology, std::move(messages), nodes};

@@ -4,6 +4,7 @@
 #include <charconv>
 #include <iostream>
 
+#include "Bench/Simulator/Drive.h"
 #include "Bench/Support/Surroundings.h"
 #include "Platform/Qt/QtDaemonServerHost.h"
 #include "Platform/Qt/QtEventLoop.h"
@@ -70,7 +71,7 @@ class Peer {
 }  // namespace
 
 Messages channelMessages() {
-  Messages messages = mixtureOf(technologies().front(), messageKinds);
+  Messages messages = driveOf(technologies().front(), messageKinds);
   std::erase_if(messages, [](const Bytes& message) { return message.size() > channelMessageSize; });
   for (Bytes& message : messages) message.resize(channelMessageSize);
   return messages;

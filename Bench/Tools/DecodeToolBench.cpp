@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Bench/Tools/DecodeToolBench.h"
 
-#include "Bench/Capture/MixedCapture.h"
+#include "Bench/Capture/WrittenDrive.h"
 #include "Bench/LogGenerator/DecodeBench.h"
+#include "Bench/Simulator/Drive.h"
 #include "Bench/Support/Process.h"
 #include "Bench/Support/Surroundings.h"
 #include "Telvon/Technology.h"
@@ -17,7 +18,7 @@ constexpr std::size_t comparedMessages = 1024;
 
 // One capture an iteration, from opening the file to the last tick's display.
 void decodeFile(benchmark::State& state, const Technology& technology, std::size_t size) {
-  const std::string path = writeMixedCapture(technology, size);
+  const std::string path = writeDrive(technology, size);
   Surroundings surroundings;
   PushedClock clock(surroundings.clock);
   const std::uint64_t before = test::allocationsSoFar();
@@ -34,7 +35,7 @@ void decodeFile(benchmark::State& state, const Technology& technology, std::size
 
 void startTool(benchmark::State& state) {
   const Technology& technology = technologies().front();
-  const std::string path = writeMixedCapture(technology, 100);
+  const std::string path = writeDrive(technology, 100);
   for (auto _ : state) {
     Process tool(KELVASI_BENCH_TOOL, {"decode", "--technology", std::string(technology.id), path},
                  Process::Output::dropped);
@@ -48,8 +49,8 @@ void startTool(benchmark::State& state) {
 void addCaptureDecoding(Table& table, bool isSmoke) {
   const std::size_t size = isSmoke ? 500 : 100000;
   for (const Technology& technology : technologies()) {
-    const Messages compared = mixtureOf(technology, comparedMessages);
-    table.add({.name = std::string(technology.name) + " mixture, pcap file to display",
+    const Messages compared = driveOf(technology, comparedMessages);
+    table.add({.name = nameOfDrive(technology, compared) + ", pcap file to display",
                .work = [=](benchmark::State& state) { decodeFile(state, technology, size); },
                .copy = copying(compared),
                .plain = showing([=] { return rowsOfEach(technology.id, compared); })});

@@ -1,16 +1,16 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "Bench/Capture/MixedCapture.h"
+#include "Bench/Capture/WrittenDrive.h"
 
 #include <algorithm>
 #include <stdexcept>
 
+#include "Bench/Simulator/Drive.h"
 #include "Capture/PcapWriter.h"
+#include "Simulator/RecordStamp.h"
 
 namespace kelvasi::bench {
 
 namespace {
-
-using namespace std::chrono_literals;
 
 std::string pathFor(const Technology& technology, std::size_t count) {
   std::string name(technology.name);
@@ -20,14 +20,13 @@ std::string pathFor(const Technology& technology, std::size_t count) {
 
 }  // namespace
 
-std::string writeMixedCapture(const Technology& technology, std::size_t count) {
+std::string writeDrive(const Technology& technology, std::size_t count) {
   const std::string path = pathFor(technology, count);
   PcapWriter writer(path, OutputFile::Existing::isReplaced);
-  std::chrono::nanoseconds arrival = 1709647629s;
-  for (const Bytes& message : mixtureOf(technology, count)) {
-    if (!writer.write(message, arrival)) throw std::runtime_error(writer.error().value_or(path));
-    arrival += 500us;
-  }
+  playDrive(technology, count, [&](const Bytes& message, sim::WorldTime at) {
+    return writer.write(message, sim::worldEpoch + at);
+  });
+  if (writer.error()) throw std::runtime_error(*writer.error());
   return path;
 }
 
