@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
-// Runs the benchmarks and prints their table. `--smoke` runs each as briefly as it can be; what else is given
-// goes to the benchmark library, as in --benchmark_filter=tree.
+// Runs the benchmarks and prints their table. `--smoke` runs each as briefly as it can be;
+// `--count-instructions` does the work that Bench/instructions counts, and measures nothing; what else is
+// given goes to the benchmark library, as in --benchmark_filter=tree.
 #include <cstring>
 #include <vector>
 
 #include "Bench/App/ViewerBench.h"
+#include "Bench/Instructions/InstructionCount.h"
 #include "Bench/LogGenerator/DecodeBench.h"
 #include "Bench/Model/TreeBench.h"
 #include "Bench/Platform/ChannelBench.h"
@@ -33,6 +35,10 @@ std::vector<const char*> libraryArguments(int count, char** arguments, bool isSm
 
 int main(int count, char** arguments) {
   if (count > 1 && std::strcmp(arguments[1], "--peer") == 0) return runChannelPeer();
+  if (count > 1 && std::strcmp(arguments[1], "--count-instructions") == 0) {
+    countInstructions();
+    return 0;
+  }
   const bool isSmoke = count > 1 && std::strcmp(arguments[1], "--smoke") == 0;
   auto all = libraryArguments(count, arguments, isSmoke);
   int allCount = static_cast<int>(all.size());
