@@ -12,6 +12,7 @@
 #include "Bench/Platform/ChannelBench.h"
 #include "Bench/Platform/ChannelPeer.h"
 #include "Bench/Tools/DecodeToolBench.h"
+#include "Bench/Tools/DriveBench.h"
 
 using namespace kelvasi::bench;
 
@@ -39,6 +40,8 @@ int main(int count, char** arguments) {
     countInstructions();
     return 0;
   }
+  if (count == 4 && std::strcmp(arguments[1], "--drive") == 0)
+    return measureDrive(arguments[2], arguments[3]) ? 0 : 1;
   const bool isSmoke = count > 1 && std::strcmp(arguments[1], "--smoke") == 0;
   auto all = libraryArguments(count, arguments, isSmoke);
   int allCount = static_cast<int>(all.size());
