@@ -6,27 +6,36 @@ install(TARGETS kelvasi kelvasictl telvon-sim)
 install(DIRECTORY ${RESOURCES}/ DESTINATION ${CMAKE_INSTALL_DATADIR}/kelvasi FILES_MATCHING PATTERN "*.plist"
         PATTERN systemd EXCLUDE)
 
-# kelvasi_installed(DIRECTORY FILE...): files of the source tree. One whose name ends in .in is told where the programs are,
-# which is known when it is installed.
+# kelvasi_installed(DIRECTORY [PROGRAMS] FILE...): files of the source tree. One whose name ends in .in is told where the
+# programs are, which is known when it is installed.
 function(kelvasi_installed DIRECTORY)
-  foreach(FILE ${ARGN})
+  cmake_parse_arguments(ARG "PROGRAMS" "" "" ${ARGN})
+  set(KIND FILES)
+  if(ARG_PROGRAMS)
+    set(KIND PROGRAMS)
+  endif()
+  foreach(FILE ${ARG_UNPARSED_ARGUMENTS})
     cmake_path(GET FILE FILENAME NAME)
     if(NAME MATCHES "\\.in$")
       string(REGEX REPLACE "\\.in$" "" NAME ${NAME})
       set(TOLD ${PROJECT_BINARY_DIR}/Installed/${NAME})
       install(CODE "set(BINDIR \"${CMAKE_INSTALL_BINDIR}\")
+        set(LIBEXECDIR \"${CMAKE_INSTALL_LIBEXECDIR}\")
         cmake_path(ABSOLUTE_PATH BINDIR BASE_DIRECTORY \"\${CMAKE_INSTALL_PREFIX}\")
+        cmake_path(ABSOLUTE_PATH LIBEXECDIR BASE_DIRECTORY \"\${CMAKE_INSTALL_PREFIX}\")
         configure_file(\"${FILE}\" \"${TOLD}\" @ONLY)")
       set(FILE ${TOLD})
     endif()
-    install(FILES ${FILE} DESTINATION ${DIRECTORY})
+    install(${KIND} ${FILE} DESTINATION ${DIRECTORY})
   endforeach()
 endfunction()
 
 # Beside a viewer in /usr these are where desktops and systemd look.
 set(NAME org.kelvasi.Kelvasi)
 set(SHARE ${CMAKE_INSTALL_DATADIR})
-kelvasi_installed(${SHARE}/applications ${RESOURCES}/${NAME}.desktop)
+kelvasi_installed(${SHARE}/applications ${RESOURCES}/${NAME}.desktop ${RESOURCES}/org.kelvasi.Decode.desktop.in)
+kelvasi_installed(${CMAKE_INSTALL_LIBEXECDIR}/kelvasi PROGRAMS ${RESOURCES}/show-captures.in)
+kelvasi_installed(${SHARE}/dbus-1/services ${RESOURCES}/${NAME}.service.in)
 kelvasi_installed(${SHARE}/icons/hicolor/scalable/apps ${RESOURCES}/${NAME}.svg)
 kelvasi_installed(${SHARE}/icons/hicolor/symbolic/apps ${RESOURCES}/${NAME}-symbolic.svg)
 kelvasi_installed(${SHARE}/metainfo ${RESOURCES}/${NAME}.metainfo.xml)

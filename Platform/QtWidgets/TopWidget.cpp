@@ -24,6 +24,12 @@ void TopWidget::showFilling() {
   showFullScreen();
 }
 
+void TopWidget::bringToFront() {
+  setWindowState(windowState() & ~Qt::WindowMinimized);
+  raise();
+  activateWindow();
+}
+
 void TopWidget::showWindowed() {
   const QSize size = windowedSize_;
   showNormal();

@@ -16,6 +16,8 @@ class TopWidget : public QWidget {
   QSize windowedSize() const { return windowedSize_; }
   void setWindowedSize(const QSize& size);
   void showFilling();
+  // Before other windows and with the keyboard, as far as the desktop allows.
+  void bringToFront();
   // Keys that nobody else took go to `keys` first, which says whether it took them.
   void setKeys(std::function<bool(QKeyEvent& event)> keys) { keys_ = std::move(keys); }
 

@@ -20,10 +20,12 @@ SOURCES = pathlib.Path(os.environ["SOURCES"])
 PROGRAMS = {"bin/kelvasi", "bin/kelvasictl", "bin/telvon-sim"}
 TEMPLATES = {f"share/kelvasi/{name}" for name in ("C2KTemplate.plist", "LTE.plist", "Orvane_GSM.plist", "UTRAN.plist")}
 DESKTOP = {f"share/{name}" for name in (
-    "applications/org.kelvasi.Kelvasi.desktop", "icons/hicolor/scalable/apps/org.kelvasi.Kelvasi.svg",
+    "applications/org.kelvasi.Decode.desktop", "applications/org.kelvasi.Kelvasi.desktop",
+    "dbus-1/services/org.kelvasi.Kelvasi.service", "icons/hicolor/scalable/apps/org.kelvasi.Kelvasi.svg",
     "icons/hicolor/symbolic/apps/org.kelvasi.Kelvasi-symbolic.svg", "metainfo/org.kelvasi.Kelvasi.metainfo.xml",
     "mime/packages/org.kelvasi.Kelvasi.xml")}
 UNITS = {f"lib/systemd/user/{name}.service" for name in ("kelvasi-kiosk", "kelvasi-record", "telvon-sim")}
+HELPERS = {"libexec/kelvasi/show-captures"}
 DOCUMENTS = {f"share/doc/kelvasi/{name}" for name in (
     "LICENSE", "CHANGELOG.md", "Notices/README.md", "Notices/LICENSE.CLI11", "Notices/LICENSE.LGPL-2.1",
     "Notices/LICENSE.nlohmann-json")}
@@ -70,7 +72,7 @@ class Installed(LiveTest):
 
     def test_the_programs_and_what_they_need_are_there(self):
         files = {str(path.relative_to(self.prefix)) for path in self.prefix.rglob("*") if path.is_file()}
-        self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | UNITS | DOCUMENTS)
+        self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | UNITS | HELPERS | DOCUMENTS)
 
     def test_all_of_it_is_taken_away_again_and_nothing_else(self):
         with tempfile.TemporaryDirectory() as root:

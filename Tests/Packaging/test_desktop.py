@@ -1,12 +1,16 @@
 # SPDX-License-Identifier: Apache-2.0
-"""What a desktop reads: entry, icons, metadata, file types."""
+"""What a desktop reads: entries, icons, metadata, file types, the bus."""
 
 import configparser
+import os
+import pathlib
+import shlex
 import tempfile
 import unittest
 import xml.etree.ElementTree as xml
 
 from packaging_support import SOURCES, InstalledTest, needs, run
+from support import MM_IDLE, pcap
 
 NAME = "org.kelvasi.Kelvasi"
 
@@ -22,12 +26,21 @@ class Entries(InstalledTest):
     @needs("desktop-file-validate")
     def test_the_entries_are_valid(self):
         entries = sorted((self.prefix / "share/applications").iterdir())
-        self.assertEqual(len(entries), 1)
+        self.assertEqual(len(entries), 2)
         for path in entries:
             self.assertEqual(self.passes("desktop-file-validate", path), "")
 
     def test_the_viewer_is_one_for_phones_too(self):
         self.assertIn("Mobile", entry(self.prefix / f"share/applications/{NAME}.desktop")["X-Purism-FormFactor"])
+
+    @needs("less")
+    def test_the_reader_shows_what_a_capture_ends_with(self):
+        with tempfile.TemporaryDirectory() as directory:
+            capture = pathlib.Path(directory, "a drive.pcap")
+            capture.write_bytes(pcap(MM_IDLE))
+            command = entry(self.prefix / "share/applications/org.kelvasi.Decode.desktop")["Exec"].split()
+            result = run(*(capture if word == "%F" else word for word in command))
+        self.assertIn("MM State\tMM_IDLE", result.stdout, result.stderr)
 
 
 class Metadata(InstalledTest):
@@ -61,6 +74,23 @@ class FileTypes(InstalledTest):
         self.assertIn(":application/x-dlf:*.dlf\n", globs)
         # length 161 and code 0x1FFD, little-endian
         self.assertIn(b"\xa1\x00\xfd\x1f", (self.prefix / "share/mime/magic").read_bytes())
+
+
+class OnTheBus(InstalledTest):
+    ACTIVATE = [NAME, "/org/kelvasi/Kelvasi", "org.freedesktop.Application", "Activate", "a{sv}", "0"]
+    WHOSE = ["org.freedesktop.DBus", "/org/freedesktop/DBus", "org.freedesktop.DBus", "GetConnectionUnixProcessID", "s", NAME]
+
+    @needs("dbus-run-session")
+    @needs("busctl")
+    def test_a_desktop_starts_the_viewer_once_and_brings_it_to_the_front(self):
+        call, whose = ("busctl --user call " + shlex.join(what) for what in (self.ACTIVATE, self.WHOSE))
+        with tempfile.TemporaryDirectory() as home:
+            environment = os.environ | {"XDG_DATA_DIRS": f"{self.prefix}/share", "QT_QPA_PLATFORM": "offscreen",
+                                        "HOME": home, "XDG_RUNTIME_DIR": home, "XDG_CONFIG_HOME": home}
+            script = f"{call} && first=$({whose}) && {call} && [ \"$first\" = \"$({whose})\" ]; status=$?\n" \
+                     "kill ${first#u }; exit $status"
+            result = run("dbus-run-session", "--", "sh", "-c", script, env=environment)
+        self.assertEqual(result.returncode, 0, result.stderr)
 
 
 class Flatpak(unittest.TestCase):

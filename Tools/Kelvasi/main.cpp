@@ -3,6 +3,7 @@
 #include <QCoreApplication>
 #include <cstdio>
 #include <cstdlib>
+#include <optional>
 #include <stdexcept>
 
 #include "App/KelvasiApp.h"
@@ -17,6 +18,7 @@
 #include "Platform/Qt/QtMainQueue.h"
 #include "Platform/Qt/QtMessagePorts.h"
 #include "Platform/Qt/QtTelephonyDaemon.h"
+#include "Platform/QtDesktop/DesktopActivation.h"
 #include "Platform/QtDesktop/QtDateFormatters.h"
 #include "Platform/QtDesktop/QtPreferences.h"
 #include "Platform/QtWidgets/QtApplicationFramework.h"
@@ -82,6 +84,11 @@ bool run(QtApplicationFramework& framework, const ViewerOptions& options) {
     writeMemory(memoryPath, memory);
   });
   const Script script(options.script);
+  std::optional<DesktopActivation> activation;  // a viewer that a script leads is nobody's to raise
+  if (options.script.empty())
+    activation.emplace([&ui] {
+      if (ui.window()) ui.window()->bringToFront();
+    });
   queue.post([&] {  // when the window is there
     front = new CockpitFront(*ui.window(), *application, clock);
     front->cockpit().restorePins(memory.pins);

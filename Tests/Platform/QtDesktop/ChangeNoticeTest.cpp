@@ -3,33 +3,17 @@
 #include <gtest/gtest.h>
 
 #include <QDBusConnection>
-#include <QProcess>
 #include <QTemporaryDir>
 #include <QTest>
 
 #include "Platform/QtDesktop/QtPreferences.h"
 #include "Platform/QtDesktop/SessionBus.h"
+#include "Tests/Platform/QtDesktop/BusOfOwn.h"
 
 namespace kelvasi {
 namespace {
 
-class Bus {
- public:
-  Bus() {
-    process_.start("dbus-daemon", {"--session", "--nofork", "--nopidfile", "--print-address"});
-    if (process_.waitForStarted() && process_.waitForReadyRead()) address_ = process_.readLine().trimmed();
-    qputenv("DBUS_SESSION_BUS_ADDRESS", address_);
-  }
-  ~Bus() {
-    process_.terminate();
-    process_.waitForFinished();
-  }
-  QString address() const { return QString::fromUtf8(address_); }
-
- private:
-  QProcess process_;
-  QByteArray address_;
-};
+using testing::busOfOwn;
 
 class Listener : public QObject {
   Q_OBJECT
@@ -50,11 +34,10 @@ TEST(ChangeNotice, WithoutABusNothingIsSent) {
 }
 
 TEST(ChangeNotice, IsASignalWithDomainAndKeyThatComesAfterTheFileWasWritten) {
-  const Bus bus;
-  ASSERT_FALSE(bus.address().isEmpty()) << "there is no dbus-daemon";
+  ASSERT_FALSE(busOfOwn().isEmpty()) << "there is no dbus-daemon";
   const QTemporaryDir directory;
   Listener listener;
-  QDBusConnection ears = QDBusConnection::connectToBus(bus.address(), "ears");
+  QDBusConnection ears = QDBusConnection::connectToBus(busOfOwn(), "ears");
   ASSERT_TRUE(ears.connect({}, "/org/kelvasi/Preferences", "org.kelvasi.Preferences", "Changed", &listener,
                            SLOT(changed(QString, QString))));
   QtPreferences preferences(directory.path());

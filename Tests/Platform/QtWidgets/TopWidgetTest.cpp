@@ -27,6 +27,18 @@ TEST_F(TopWidgetTest, F11FillsTheScreenAndGivesItBack) {
   EXPECT_EQ(windowWidget().size(), QSize(390, 844));
 }
 
+TEST_F(TopWidgetTest, WhatIsMinimizedComesToTheFrontAsItWas) {
+  showRows(3);
+  windowWidget().showMinimized();
+  settle();
+  ASSERT_TRUE(windowWidget().isMinimized());
+  ui->window()->bringToFront();
+  settle();
+  EXPECT_FALSE(windowWidget().isMinimized());
+  EXPECT_TRUE(windowWidget().isActiveWindow());
+  EXPECT_EQ(windowWidget().size(), QSize(390, 844));
+}
+
 TEST_F(TopWidgetTest, ControlWClosesFromAnywhere) {
   showRows(3);
   push(2, "Next");
