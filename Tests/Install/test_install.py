@@ -25,6 +25,11 @@ DESKTOP = {f"share/{name}" for name in (
     "icons/hicolor/symbolic/apps/org.kelvasi.Kelvasi-symbolic.svg", "metainfo/org.kelvasi.Kelvasi.metainfo.xml",
     "mime/packages/org.kelvasi.Kelvasi.xml")}
 UNITS = {f"lib/systemd/user/{name}.service" for name in ("kelvasi-kiosk", "kelvasi-record", "telvon-sim")}
+# One for each program at least, and as many more as there are verbs and formats.
+MADE = {"share/man/man1/kelvasi.1", "share/man/man1/kelvasictl-decode.1", "share/man/man5/kelvasi-capture.5",
+        "share/bash-completion/completions/kelvasictl", "share/zsh/site-functions/_kelvasictl",
+        "share/fish/vendor_completions.d/kelvasictl.fish"}
+MADE_FOLDERS = ("share/man/", "share/bash-completion/", "share/zsh/", "share/fish/")
 HELPERS = {"libexec/kelvasi/show-captures"}
 DOCUMENTS = {f"share/doc/kelvasi/{name}" for name in (
     "LICENSE", "CHANGELOG.md", "Notices/README.md", "Notices/LICENSE.CLI11", "Notices/LICENSE.LGPL-2.1",
@@ -72,6 +77,8 @@ class Installed(LiveTest):
 
     def test_the_programs_and_what_they_need_are_there(self):
         files = {str(path.relative_to(self.prefix)) for path in self.prefix.rglob("*") if path.is_file()}
+        self.assertLess(MADE, files)
+        files = {name for name in files if not name.startswith(MADE_FOLDERS)}
         self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | UNITS | HELPERS | DOCUMENTS)
 
     def test_all_of_it_is_taken_away_again_and_nothing_else(self):
