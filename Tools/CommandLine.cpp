@@ -31,6 +31,7 @@ void CommandLine::addHelpVerb() {
   std::vector<std::string> names;
   for (const CLI::App* verb : app_->get_subcommands({})) names.push_back(verb->get_name());
   CLI::App& help = *app_->add_subcommand("help", "explain a verb");
+  names.push_back(help.get_name());
   const auto asked = std::make_shared<std::string>();
   help.add_option("VERB", *asked, "the verb; otherwise all of them are listed")
       ->type_name("NAME")
