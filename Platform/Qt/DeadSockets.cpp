@@ -17,6 +17,16 @@ namespace {
 
 constexpr std::chrono::milliseconds probeTimeout{1};
 
+void removeDeadSocketsIn(const std::string& room, SystemLog& log) {
+  std::error_code error;
+  for (std::filesystem::directory_iterator file(room, error), end; !error && file != end;
+       file.increment(error)) {
+    if (!file->is_socket(error)) continue;
+    if (const auto address = RuntimeDirectory::addressIn(room, file->path().filename().string(), log))
+      removeIfDead(*address);
+  }
+}
+
 }  // namespace
 
 // Connections to a dead socket are refused; to one that merely does not answer they are not.
@@ -32,13 +42,7 @@ void removeDeadSockets(SystemLog& log) {
   const auto directory = RuntimeDirectory::open(log);
   const FileDescriptor lock = directory ? directory->lock(log) : FileDescriptor();
   if (!lock) return;
-  std::error_code error;
-  for (std::filesystem::directory_iterator file(directory->path(), error), end; !error && file != end;
-       file.increment(error)) {
-    if (!file->is_socket(error)) continue;
-    if (const auto address = directory->addressOf(file->path().filename().string(), log))
-      removeIfDead(*address);
-  }
+  for (const std::string& room : directory->rooms()) removeDeadSocketsIn(room, log);
 }
 
 }  // namespace kelvasi

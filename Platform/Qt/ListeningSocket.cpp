@@ -10,7 +10,6 @@
 #include <cstring>
 
 #include "Platform/Qt/DeadSockets.h"
-#include "Platform/Qt/PeerCredentials.h"
 #include "Platform/SystemLog.h"
 
 namespace kelvasi {
@@ -32,7 +31,7 @@ const sockaddr* generic(const sockaddr_un& address) {
 std::unique_ptr<ListeningSocket> ListeningSocket::open(std::string_view name, SystemLog& log,
                                                        ConnectionHandler handler) {
   auto directory = RuntimeDirectory::open(log);
-  const auto address = directory ? directory->addressOf(name, log) : std::nullopt;
+  const auto address = directory ? directory->addressToListen(name, log) : std::nullopt;
   if (!address) return nullptr;
   std::unique_ptr<ListeningSocket> opened(
       new ListeningSocket(std::move(*directory), name, *address, log, std::move(handler)));
@@ -74,7 +73,7 @@ int ListeningSocket::bindToName() {
   if (::lstat(address_.sun_path, &made) != 0) return errno;
   device_ = made.st_dev;
   inode_ = made.st_ino;
-  return 0;
+  return directory_.admitCallers(address_);
 }
 
 void ListeningSocket::watch() {
@@ -94,7 +93,7 @@ void ListeningSocket::acceptOne() {
     pause_->start(pauseAfterFailure);
     return;
   }
-  if (!isPeerOfThisUser(socket.number(), name_, log_)) return;
+  if (!isPeerAllowed(socket.number(), directory_.allowedCallers(), name_, log_)) return;
   const auto handler = handler_;  // outlives this object, which the handler may destroy
   (*handler)(std::move(socket));
 }

@@ -7,11 +7,12 @@
 #include <cerrno>
 #include <cstring>
 
+#include "Platform/Qt/AccessGroup.h"
 #include "Platform/SystemLog.h"
 
 namespace kelvasi {
 
-bool isPeerOfThisUser(int socket, std::string_view name, SystemLog& log) {
+bool isPeerAllowed(int socket, const AllowedPeers& allowed, std::string_view name, SystemLog& log) {
   ucred peer{};
   socklen_t size = sizeof peer;
   const int nameLength = static_cast<int>(name.size());
@@ -20,9 +21,13 @@ bool isPeerOfThisUser(int socket, std::string_view name, SystemLog& log) {
               name.data(), std::strerror(errno));
     return false;
   }
-  if (peer.uid == ::geteuid()) return true;
-  log.print(LogPriority::error, "%.*s: peer (pid %ld) is of another user (uid %lu); connection closed",
-            nameLength, name.data(), static_cast<long>(peer.pid), static_cast<unsigned long>(peer.uid));
+  const bool isOfThisUser = peer.uid == ::geteuid();
+  if (allowed.ofThisUser && isOfThisUser) return true;
+  if (allowed.ofGroup && !isOfThisUser && isPeerInGroup(socket, *allowed.ofGroup)) return true;
+  log.print(LogPriority::error, "%.*s: peer (pid %ld) is of %s user (uid %lu)%s; connection closed",
+            nameLength, name.data(), static_cast<long>(peer.pid), isOfThisUser ? "this" : "another",
+            static_cast<unsigned long>(peer.uid),
+            allowed.ofGroup && !isOfThisUser ? " and not in the group of TELVON_GROUP" : "");
   return false;
 }
 

@@ -10,11 +10,12 @@
 #include <algorithm>
 #include <cerrno>
 #include <chrono>
-#include <cstdlib>
 #include <cstring>
 #include <thread>
 #include <utility>
 
+#include "Platform/Qt/AccessGroup.h"
+#include "Platform/Qt/RuntimeDirectoryFaults.h"
 #include "Platform/SystemLog.h"
 
 namespace kelvasi {
@@ -23,100 +24,99 @@ namespace {
 
 using namespace std::chrono_literals;
 
-constexpr mode_t privateMode = 0700;
-constexpr mode_t modeBits = 07777;
+constexpr mode_t lockMode = 0600;
+constexpr mode_t sharedLockMode = 0640;
+constexpr mode_t sharedSocketMode = 0660;
 constexpr auto lockPatience = 1000ms;
 constexpr auto lockInterval = 5ms;
 
-std::string valueOf(const char* variable) {
-  const char* value = std::getenv(variable);
-  return value ? value : "";
-}
-
-std::string pathFromEnvironment() {
-  if (std::string own = valueOf("TELVON_RUNTIME_DIR"); !own.empty()) return own;
-  const std::string shared = valueOf("XDG_RUNTIME_DIR");
-  return shared.empty() ? shared : shared + "/telvon";
-}
-
-// One that is made where directories hand their group on has a bit more than was asked for.
-void dropInheritedBits(const std::string& path) {
-  const FileDescriptor made(::open(path.c_str(), O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC));
-  if (made) ::fchmod(made.number(), privateMode);
-}
-
-// Why the directory cannot be trusted; empty when it can.
-std::string faultOf(const std::string& path) {
-  if (path.empty()) return "neither TELVON_RUNTIME_DIR nor XDG_RUNTIME_DIR is set";
-  if (path.front() != '/') return "not an absolute path";
-  if (::mkdir(path.c_str(), privateMode) == 0) {
-    dropInheritedBits(path);
-  } else if (errno != EEXIST) {
-    return std::string("cannot be made: ") + std::strerror(errno);
-  }
+bool exists(const sockaddr_un& address) {
   struct stat found {};
-  if (::lstat(path.c_str(), &found) != 0) return std::strerror(errno);
-  if (S_ISLNK(found.st_mode)) return "is a symbolic link";
-  if (!S_ISDIR(found.st_mode)) return "is not a directory";
-  if (found.st_uid != ::geteuid()) return "belongs to another user";
-  if ((found.st_mode & modeBits) != privateMode) return "its mode is not 0700";
-  return {};
+  return ::lstat(address.sun_path, &found) == 0;
 }
 
-bool isControl(char character) {
-  return static_cast<unsigned char>(character) < 0x20 || character == 0x7F;
-}
-
-const char* faultOfName(std::string_view name) {
-  if (name.empty()) return "is empty";
-  if (name.front() == '.') return "begins with a dot";
-  if (name.find('/') != std::string_view::npos) return "holds a slash";
-  if (std::ranges::any_of(name, isControl)) return "holds a control character";
-  return nullptr;
-}
-
-std::string printable(std::string_view name) {
-  std::string text(name.substr(0, 100));
-  std::ranges::replace_if(text, isControl, '?');
-  return text;
+uid_t ownerOf(const std::string& path) {
+  struct stat found {};
+  return ::lstat(path.c_str(), &found) == 0 ? found.st_uid : ::geteuid();
 }
 
 }  // namespace
 
-RuntimeDirectory::Place RuntimeDirectory::look() {
-  std::string path = pathFromEnvironment();
-  while (path.size() > 1 && path.back() == '/') path.pop_back();  // a link with a slash would be followed
-  std::string fault = faultOf(path);
+RuntimeDirectory::RuntimeDirectory(std::string path, std::optional<gid_t> group)
+    : path_(std::move(path)), group_(group), isOwner_(ownerOf(path_) == ::geteuid()) {}
+
+RuntimeDirectory::Place RuntimeDirectory::look(Side side) {
+  std::string path = runtimePathFromEnvironment();
+  const AccessGroup group = AccessGroup::ofEnvironment();
+  std::string fault = group.fault.empty() ? makeAndCheck(path, group.id, side == Side::daemon) : group.fault;
   return {.path = std::move(path), .fault = std::move(fault)};
 }
 
-std::optional<RuntimeDirectory> RuntimeDirectory::open(SystemLog& log) {
-  Place place = look();
+std::optional<RuntimeDirectory> RuntimeDirectory::open(SystemLog& log, Side side) {
+  Place place = look(side);
   if (!place.fault.empty()) {
     log.print(LogPriority::error, "Runtime directory \"%s\" refused: %s", place.path.c_str(),
               place.fault.c_str());
     return std::nullopt;
   }
-  return RuntimeDirectory(std::move(place.path));
+  return RuntimeDirectory(std::move(place.path), AccessGroup::ofEnvironment().id);
 }
 
-std::optional<sockaddr_un> RuntimeDirectory::addressOf(std::string_view name, SystemLog& log) const {
+std::string RuntimeDirectory::guestRoom() const {
+  return path_ + "/" + guestRoomName;
+}
+
+std::vector<std::string> RuntimeDirectory::rooms() const {
+  if (!group_) return {path_};
+  return {path_, guestRoom()};
+}
+
+std::optional<sockaddr_un> RuntimeDirectory::addressIn(const std::string& room, std::string_view name,
+                                                       SystemLog& log) {
   sockaddr_un address{};
   address.sun_family = AF_UNIX;
-  const char* fault = faultOfName(name);
-  const std::string path = path_ + "/" + std::string(name);
+  const std::string path = room + "/" + std::string(name);
+  const char* fault = faultOfPortName(name);
   if (!fault && path.size() >= sizeof address.sun_path) fault = "makes too long a path";
   if (fault) {
-    log.print(LogPriority::error, "Port name \"%s\" refused: %s", printable(name).c_str(), fault);
+    log.print(LogPriority::error, "Port name \"%s\" refused: %s", printablePortName(name).c_str(), fault);
     return std::nullopt;
   }
   std::ranges::copy(path, address.sun_path);
   return address;
 }
 
+std::optional<sockaddr_un> RuntimeDirectory::addressToListen(std::string_view name, SystemLog& log) const {
+  return addressIn(isGuest() ? guestRoom() : path_, name, log);
+}
+
+// Nobody but the owner can have put a socket into the directory itself, so its names come first.
+std::optional<sockaddr_un> RuntimeDirectory::addressToReach(std::string_view name, SystemLog& log) const {
+  const auto own = addressIn(path_, name, log);
+  if (!own || !group_ || !isOwner_ || exists(*own)) return own;
+  return addressIn(guestRoom(), name, log);
+}
+
+AllowedPeers RuntimeDirectory::allowedCallers() const {
+  return {.ofThisUser = true, .ofGroup = group_};
+}
+
+// What guests put there may be a link to anything; what it leads to is then no process of ours.
+AllowedPeers RuntimeDirectory::allowedAt(const sockaddr_un& address) const {
+  const bool isAtGuests = group_ && std::string_view(address.sun_path).starts_with(guestRoom() + "/");
+  return {.ofThisUser = !isAtGuests, .ofGroup = group_};
+}
+
+int RuntimeDirectory::admitCallers(const sockaddr_un& address) const {
+  return !group_ || ::chmod(address.sun_path, sharedSocketMode) == 0 ? 0 : errno;
+}
+
+// Guests may not write to the file, and need not.
 FileDescriptor RuntimeDirectory::lock(SystemLog& log) const {
   const std::string path = path_ + "/.lock";
-  FileDescriptor file(::open(path.c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW, 0600));
+  const int access = isGuest() ? O_RDONLY : O_RDWR | O_CREAT;
+  FileDescriptor file(::open(path.c_str(), access | O_CLOEXEC | O_NOFOLLOW, lockMode));
+  if (file && group_ && isOwner_) ::fchmod(file.number(), sharedLockMode);
   const auto deadline = std::chrono::steady_clock::now() + lockPatience;
   while (file && ::flock(file.number(), LOCK_EX | LOCK_NB) != 0) {
     if (errno == EINTR) continue;

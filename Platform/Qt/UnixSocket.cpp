@@ -8,7 +8,6 @@
 #include <cerrno>
 #include <cstring>
 
-#include "Platform/Qt/PeerCredentials.h"
 #include "Platform/SystemLog.h"
 
 namespace kelvasi {
@@ -58,7 +57,7 @@ int connectWithin(const FileDescriptor& socket, const sockaddr_un& address,
 
 FileDescriptor connectToName(std::string_view name, SystemLog& log) {
   const auto directory = RuntimeDirectory::open(log);
-  const auto address = directory ? directory->addressOf(name, log) : std::nullopt;
+  const auto address = directory ? directory->addressToReach(name, log) : std::nullopt;
   if (!address) return {};
   FileDescriptor socket = makeUnixSocket();
   int error = socket ? connectWithin(socket, *address, connectTimeout) : errno;
@@ -68,7 +67,8 @@ FileDescriptor connectToName(std::string_view name, SystemLog& log) {
       log.print(LogPriority::error, "%s: cannot connect: %s", address->sun_path, std::strerror(error));
     return {};
   }
-  return isPeerOfThisUser(socket.number(), name, log) ? std::move(socket) : FileDescriptor();
+  if (!isPeerAllowed(socket.number(), directory->allowedAt(*address), name, log)) return {};
+  return socket;
 }
 
 }  // namespace kelvasi

@@ -65,7 +65,7 @@ int serve(const SimulatorOptions& options) {
     complain(made.failure);
     return made.exitStatus;
   }
-  const auto directory = RuntimeDirectory::open(log);
+  const auto directory = RuntimeDirectory::open(log, RuntimeDirectory::Side::daemon);
   if (!directory) return 1;
   sim::Simulation simulation({.daemon = {peerLog, ports, plists}, .queue = queue, .clock = clock},
                              options.technology, options.faults, std::move(made.source), options.speed,

@@ -5,6 +5,8 @@
 #include <unistd.h>
 
 #include <fstream>
+#include <optional>
+#include <sstream>
 
 #include "Tests/Platform/Qt/PortTest.h"
 
@@ -27,7 +29,7 @@ class RuntimeDirectoryTest : public PortTest {
   // Likewise of a port name.
   std::string refusalOfName(const std::string& name) {
     log.clear();
-    if (RuntimeDirectory::open(log)->addressOf(name, log)) return "(usable)";
+    if (RuntimeDirectory::open(log)->addressToReach(name, log)) return "(usable)";
     return log.errors().size() == 1 ? log.errors().front() : "(not one line)";
   }
 };
@@ -136,6 +138,95 @@ TEST_F(RuntimeDirectoryTest, IsLockedByOneAtATime) {
   EXPECT_EQ(log.errors().size(), 1u);
   first.close();
   EXPECT_TRUE(opened->lock(log));
+}
+
+// Of the group of this process, which need not have a name.
+class SharedRuntimeDirectoryTest : public RuntimeDirectoryTest {
+ protected:
+  SharedRuntimeDirectoryTest() {
+    ::setenv("TELVON_GROUP", std::to_string(::getegid()).c_str(), 1);
+    ::setenv("TELVON_RUNTIME_DIR", path.c_str(), 1);
+  }
+  ~SharedRuntimeDirectoryTest() override { ::unsetenv("TELVON_GROUP"); }
+
+  std::optional<RuntimeDirectory> openAsDaemon() {
+    return RuntimeDirectory::open(log, RuntimeDirectory::Side::daemon);
+  }
+  static std::string modeOf(const std::string& name) {
+    struct stat found {};
+    if (::lstat(name.c_str(), &found) != 0) return "(absent)";
+    std::ostringstream text;
+    text << std::oct << (found.st_mode & 07777);
+    return text.str();
+  }
+
+  const std::string path = inside("shared");
+};
+
+TEST_F(SharedRuntimeDirectoryTest, IsMadeByADaemonOnly) {
+  EXPECT_THAT(refusalOf(path), HasSubstr("refused: No such file or directory"));
+  EXPECT_TRUE(openAsDaemon());
+  EXPECT_EQ(modeOf(path), "2750");
+  EXPECT_EQ(modeOf(path + "/applications"), "3770");
+  EXPECT_EQ(refusalOf(path), "(opened)");
+}
+
+TEST_F(SharedRuntimeDirectoryTest, IsRefusedUnlessItsModeIsTheGroups) {
+  ASSERT_TRUE(openAsDaemon());
+  for (const mode_t mode : {00700U, 00750U, 02770U, 02751U, 03750U}) {
+    ASSERT_EQ(::chmod(path.c_str(), mode), 0);
+    EXPECT_THAT(refusalOf(path), HasSubstr("its mode is not 2750")) << std::oct << mode;
+  }
+}
+
+TEST_F(SharedRuntimeDirectoryTest, IsRefusedWhenItIsOfAnotherGroup) {
+  if (::geteuid() != 0) GTEST_SKIP() << "only root can give a directory away";
+  ASSERT_TRUE(openAsDaemon());
+  ASSERT_EQ(::chown(path.c_str(), static_cast<uid_t>(-1), 65534), 0);
+  ASSERT_EQ(::chmod(path.c_str(), 02750), 0);
+  EXPECT_THAT(refusalOf(path), HasSubstr("its group is not that of TELVON_GROUP"));
+}
+
+TEST_F(SharedRuntimeDirectoryTest, OfAnotherUserIsForApplicationsOnly) {
+  if (::geteuid() != 0) GTEST_SKIP() << "only root can give a directory away";
+  ASSERT_TRUE(openAsDaemon());
+  ASSERT_EQ(::chown(path.c_str(), 65534, static_cast<gid_t>(-1)), 0);
+  ASSERT_EQ(::chmod(path.c_str(), 02750), 0);
+  EXPECT_FALSE(openAsDaemon());
+  EXPECT_THAT(log.errors().back(), HasSubstr("belongs to another user"));
+  const auto opened = RuntimeDirectory::open(log);
+  ASSERT_TRUE(opened);
+  EXPECT_EQ(opened->addressToListen("KelvasiApp.1", log)->sun_path, path + "/applications/KelvasiApp.1");
+  EXPECT_EQ(opened->addressToReach("telvon", log)->sun_path, path + "/telvon");
+}
+
+TEST_F(SharedRuntimeDirectoryTest, ItsOwnerFindsGuestsUnderNamesThatAreNotItsOwn) {
+  const auto opened = openAsDaemon();
+  ASSERT_TRUE(opened);
+  for (const char* name : {"/applications/guest", "/applications/telvon", "/telvon"})
+    std::ofstream(path + name) << "in the place of a socket";
+  EXPECT_EQ(opened->addressToListen("telvon", log)->sun_path, path + "/telvon");
+  EXPECT_EQ(opened->addressToReach("telvon", log)->sun_path, path + "/telvon");
+  EXPECT_EQ(opened->addressToReach("guest", log)->sun_path, path + "/applications/guest");
+}
+
+TEST_F(SharedRuntimeDirectoryTest, TheVariableNamesAGroupOfThisProcess) {
+  ::setenv("TELVON_GROUP", "no such group", 1);
+  EXPECT_THAT(refusalOf(path), HasSubstr("refused: TELVON_GROUP names no group: no such group"));
+  ::setenv("TELVON_GROUP", "4294967294", 1);
+  EXPECT_THAT(refusalOf(path), HasSubstr("refused: this process is not in the group of TELVON_GROUP"));
+  ::setenv("TELVON_GROUP", "", 1);  // as if it were not set
+  EXPECT_EQ(refusalOf(path), "(opened)");
+  EXPECT_EQ(modeOf(path), "700");
+}
+
+TEST_F(SharedRuntimeDirectoryTest, WhoeverTheGuestsLeadToIsNoProcessOfTheOwners) {
+  const auto daemon = openAsDaemon();
+  const auto atHome = daemon->allowedAt(*daemon->addressIn(path, "telvon", log));
+  const auto atGuests = daemon->allowedAt(*daemon->addressIn(path + "/applications", "guest", log));
+  EXPECT_TRUE(atHome.ofThisUser);
+  EXPECT_FALSE(atGuests.ofThisUser);
+  EXPECT_EQ(atGuests.ofGroup, ::getegid());
 }
 
 }  // namespace
