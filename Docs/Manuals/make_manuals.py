@@ -36,7 +36,8 @@ SEE_ALSO = {
 def by_manual(text):
     """Documents that are manuals too are named as these."""
     for name, section, document, _ in FORMATS:
-        text = text.replace(f"Docs/{document}", f"{name}({section})")
+        for written in (f"[Docs/{document}](Docs/{document})", f"Docs/{document}"):
+            text = text.replace(written, f"{name}({section})")
     return text
 
 
@@ -117,7 +118,7 @@ def verbs(program, table):
 def environment():
     """The table of variables that README.md has."""
     rows = re.search(r"^\| variable \| meaning \|\n(?:\|.*\n)+", (DOCUMENTS.parent / "README.md").read_text(), re.MULTILINE)
-    return ["# ENVIRONMENT", "", *convert(rows[0]), ""]
+    return ["# ENVIRONMENT", "", *convert(by_manual(rows[0])), ""]
 
 
 def see_also(names):

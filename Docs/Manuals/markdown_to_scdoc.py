@@ -70,7 +70,8 @@ def entries(head, body):
     """A table that is too wide: its rows one below the other."""
     result = [""]
     for first, *rest in body:
-        told = [f"_{escaped(name)}_: {inline(cell)}" if name else inline(cell) for name, cell in zip(head[1:], rest) if cell]
+        told = [f"_{escaped(name)}_: {inline(cell)}" if name and len(rest) > 1 else inline(cell)
+                for name, cell in zip(head[1:], rest) if cell]
         result += [inline(first), "\t" + "; ".join(told), ""]
     return result
 
