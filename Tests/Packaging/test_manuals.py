@@ -5,7 +5,7 @@ import os
 import re
 import unittest
 
-from packaging_support import BUILD, PROGRAMS, needs, run
+from packaging_support import BUILD, PROGRAMS, SOURCES, needs, run
 
 OPTION = re.compile(r"^  (-[^ ]+)", re.MULTILINE)
 VERB = re.compile(r"^  (\w[\w-]*) {2,}", re.MULTILINE)
@@ -55,6 +55,17 @@ class Manuals(unittest.TestCase):
     def test_what_is_not_in_the_help_is_not_in_the_manual_either(self):
         for name, _ in pages():
             self.assertNotIn("--describe", manual(name))
+
+    def test_the_options_of_examples_are_there(self):
+        seen = 0
+        for path in sorted((SOURCES / "Docs/Manuals").glob("*.md")):
+            for line in re.findall(r"^    (.*)", path.read_text(), re.MULTILINE):
+                for program, verb, rest in re.findall(r"\b(kelvasictl|telvon-sim)(?: (\w+))?([^|>]*)", line):
+                    known = options(help_of(program, *([verb] if verb else [])))
+                    for option in re.findall(r"(?<!\S)--?[a-z][a-z-]*", rest):
+                        self.assertIn(option, known, f"{path.name}: {line}")
+                        seen += 1
+        self.assertGreater(seen, 10)
 
     def test_help_of_a_verb_is_the_verb_s_help(self):
         for verb in verbs("kelvasictl"):
