@@ -22,6 +22,7 @@ Cockpit::~Cockpit() = default;
 
 void Cockpit::take(const Readings& readings, const Intake& intake) {
   parts_->link.take(readings.arrival(), intake);
+  parts_->coverage.take(intake);
   parts_->survey.take(readings, intake);
   parts_->notes.take(readings);
   parts_->rows.take(readings,

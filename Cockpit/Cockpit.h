@@ -71,6 +71,8 @@ class Cockpit {
   // All events that are kept: `most` of them from the newest on, `skip` left out.
   std::vector<EventLine> events(std::size_t most, std::size_t skip = 0) const;
   std::size_t eventCount() const;  // that are kept
+  // What arrived and was not shown, since the beginning.
+  Coverage coverage(Arrival now) const;
 
   // --- Rows. Paths are RFC 6901 pointers into the display; rowPath() finds one for a node of the panes.
 

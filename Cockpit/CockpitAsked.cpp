@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// What is asked of a cockpit beside its face: rows, pins, alarms, marks, charts.
+// What is asked of a cockpit beside its face: coverage, rows, pins, alarms, marks, charts.
 #include <algorithm>
 #include <utility>
 
@@ -8,6 +8,10 @@
 #include "Cockpit/Rows/RowPath.h"
 
 namespace kelvasi::cockpit {
+
+Coverage Cockpit::coverage(Arrival now) const {
+  return parts_->coverage.at(now);
+}
 
 std::optional<RowSheet> Cockpit::sheet(std::string_view path, Arrival now) const {
   const BookedRow* row = parts_->rows.find(path);

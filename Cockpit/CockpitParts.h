@@ -5,6 +5,7 @@
 #include "Cockpit/Cells/CellOrder.h"
 #include "Cockpit/Cockpit.h"
 #include "Cockpit/Events/AlarmBook.h"
+#include "Cockpit/Events/CoverageBook.h"
 #include "Cockpit/Events/Marks.h"
 #include "Cockpit/Link/LinkWatch.h"
 #include "Cockpit/Serving/SideNotes.h"
@@ -30,6 +31,7 @@ struct Cockpit::Parts {
   RowBook rows;
   SideNotes notes;
   LinkWatch link;
+  CoverageBook coverage;
   CellOrder order;
   Pins pins;
   Marks marks;

@@ -57,11 +57,19 @@ std::string countersText(std::uint64_t messages, std::uint64_t notShown) {
 }
 
 Coverage coverageOf(const Intake& intake, Arrival now) {
+  return coverageOf(intake.counts(), intake.messages(), intake.messages() - intake.messages(Outcome::shown),
+                    now);
+}
+
+Coverage coverageOf(std::span<const IntakeCount> counts, std::uint64_t messages, std::uint64_t notShown,
+                    Arrival now) {
   Coverage coverage;
-  coverage.messages = intake.messages();
-  coverage.notShown = intake.messages() - intake.messages(Outcome::shown);
-  for (const IntakeCount& count : intake.counts()) {
-    if (count.outcome != Outcome::shown) coverage.lines.push_back(lineOf(count, now));
+  coverage.messages = messages;
+  coverage.notShown = coverage.beyond = notShown;
+  for (const IntakeCount& count : counts) {
+    if (count.outcome == Outcome::shown) continue;
+    coverage.lines.push_back(lineOf(count, now));
+    coverage.beyond -= std::min(coverage.beyond, count.messages);
   }
   std::ranges::stable_sort(coverage.lines, std::ranges::greater(), &CoverageLine::messages);
   coverage.words = countersText(coverage.messages, coverage.notShown);

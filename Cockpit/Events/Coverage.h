@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstdint>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -29,9 +30,13 @@ struct Coverage {
   std::uint64_t notShown = 0;
   std::string words;                // "12,345 messages, 2 % not shown"; "12,345 messages, every one shown"
   std::vector<CoverageLine> lines;  // of what was not shown, the most frequent first
+  std::uint64_t beyond = 0;         // messages not shown that no line tells of
 };
 
 Coverage coverageOf(const Intake& intake, Arrival now);
+// Of counts, so many messages altogether, and so many that were not shown.
+Coverage coverageOf(std::span<const IntakeCount> counts, std::uint64_t messages, std::uint64_t notShown,
+                    Arrival now);
 // "0xB17F"
 std::string codeText(LogCode logCode);
 // "12,345 messages", "12,345 messages, 2 % not shown", "... less than 1 % not shown"

@@ -127,5 +127,16 @@ TEST(Cockpit, HandsOnWhatHappens) {
   EXPECT_TRUE(fed.at(1s).alarms.front().isRaised);
 }
 
+TEST(Cockpit, CoverageTellsWhatWasNotShown) {
+  Fed fed;
+  fed.take(served(0s, cell404, -95));
+  EXPECT_EQ(fed.cockpit.coverage(noon).words, "1 message, every one shown");
+  fed.intake.count(0xB17F, Outcome::tooShort, noon + 1s, {});
+  fed.take(served(1s, cell404, -95));
+  const Coverage coverage = fed.cockpit.coverage(noon + 1s);
+  ASSERT_EQ(coverage.lines.size(), 1U);
+  EXPECT_EQ(coverage.lines[0].code + " " + coverage.lines[0].words, "0xB17F too short");
+}
+
 }  // namespace
 }  // namespace kelvasi::cockpit

@@ -3,6 +3,8 @@
 
 #include <gtest/gtest.h>
 
+#include "Cockpit/Events/CoverageBook.h"
+
 namespace kelvasi::cockpit {
 namespace {
 
@@ -38,6 +40,54 @@ TEST(Coverage, WhatWasNotShownTheMostFrequentFirst) {
   EXPECT_EQ(coverage.lines[0].age.text, "7 s");
   EXPECT_EQ(coverage.lines[1].code, "0x1FEB");
   EXPECT_EQ(coverage.lines[2].code, "");
+}
+
+TEST(Coverage, MessagesThatNoLineTellsOfAreCounted) {
+  Intake intake;
+  for (LogCode code = 0; code < Intake::mostCounts + 3; ++code)
+    intake.count(code, Outcome::notAskedFor, 1s, {});
+  EXPECT_EQ(coverageOf(intake, 1s).beyond, intake.beyond());
+  EXPECT_GT(coverageOf(intake, 1s).beyond, 0U);
+}
+
+TEST(CoverageBook, KnowsWhatTheIntakeCounted) {
+  constexpr std::array<std::uint8_t, 2> record{0x05, 0x7F};
+  Intake intake;
+  CoverageBook book;
+  EXPECT_EQ(book.at(0s).words, "Nothing received yet");
+  intake.count(0xB0C2, Outcome::shown, 1s, {});
+  book.take(intake);
+  EXPECT_EQ(book.at(1s).words, "1 message, every one shown");
+  intake.count(0xB17F, Outcome::notUnderstood, 2s, record, 0);
+  book.take(intake);
+  intake.count(0xB0C2, Outcome::shown, 3s, {});
+  book.take(intake);
+  const Coverage coverage = book.at(10s);
+  EXPECT_EQ(coverage.words, "3 messages, 33 % not shown");
+  ASSERT_EQ(coverage.lines.size(), 1U);
+  EXPECT_EQ(coverage.lines[0].version, "version 5");
+  EXPECT_EQ(coverage.lines[0].age.text, "8 s");
+}
+
+TEST(CoverageBook, AnotherGeneratorsCountsAreAddedToThoseBeforeIt) {
+  CoverageBook book;
+  Intake first;
+  for (int message = 0; message < 3; ++message) {
+    first.count(0xB17F, Outcome::tooShort, 1s, {});
+    book.take(first);
+  }
+  Intake second;
+  second.count(0xB17F, Outcome::tooShort, 5s, {});
+  book.take(second);
+  second.count(0x1FEB, Outcome::notAskedFor, 6s, {});
+  book.take(second);
+  const Coverage coverage = book.at(8s);
+  EXPECT_EQ(coverage.messages, 5U);
+  EXPECT_EQ(coverage.notShown, 5U);
+  ASSERT_EQ(coverage.lines.size(), 2U);
+  EXPECT_EQ(coverage.lines[0].messages, 4U);
+  EXPECT_EQ(coverage.lines[0].age.text, "live");
+  EXPECT_EQ(coverage.lines[1].code, "0x1FEB");
 }
 
 TEST(Counters, AShareIsNeverRoundedAway) {

@@ -247,6 +247,9 @@ bool CockpitFront::takeKey(QKeyEvent& event) {
     case Qt::Key_A:
       pages_->openAlarms(pageHolder());
       return true;
+    case Qt::Key_C:
+      pages_->openCoverage(pageHolder());
+      return true;
     case Qt::Key_Asterisk:
       return pinRow();
     case Qt::Key_E:

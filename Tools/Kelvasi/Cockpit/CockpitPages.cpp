@@ -34,6 +34,7 @@ constexpr std::array keyTable{
     KeyWords{"+ -", "a shorter or a longer time in the chart"},
     KeyWords{"E", "events"},
     KeyWords{"A", "alarms"},
+    KeyWords{"C", "coverage: what came in and was not shown"},
     KeyWords{"M", "mark this moment"},
     KeyWords{"?", "these keys"},
     KeyWords{"Up Down Page Up Page Down Home End", "move among rows"},
@@ -44,6 +45,30 @@ constexpr std::array keyTable{
     KeyWords{"F11", "fill the screen"},
     KeyWords{"Ctrl+W, Ctrl+Q", "close"},
 };
+
+std::string detailsOf(const CoverageLine& line) {
+  std::string words = line.words;
+  for (const std::string& part : {line.version, std::to_string(line.lastLength) + " bytes"})
+    if (!part.empty()) words += ", " + part;
+  return words;
+}
+
+Blocks coverageBlocks(const Coverage& coverage, double width) {
+  Blocks blocks;
+  blocks.push_back(wordsBlock(coverage.words, width));
+  if (!coverage.lines.empty()) blocks.push_back(captionBlock("Not shown", width, "messages"));
+  for (const CoverageLine& line : coverage.lines) {
+    blocks.push_back(rowBlock({.name = line.code.empty() ? "No record" : line.code,
+                               .below = detailsOf(line),
+                               .value = countText(line.messages),
+                               .valueBelow = line.age.text},
+                              width));
+    if (!line.sample.empty()) blocks.push_back(wordsBlock("begins " + line.sample, width));
+  }
+  if (coverage.beyond > 0)
+    blocks.push_back(wordsBlock("And " + countText(coverage.beyond) + " of further codes.", width));
+  return blocks;
+}
 
 Block actionBlock(const std::string& words, double width, std::function<void()> action) {
   Block block = linkBlock(words, width);
@@ -121,10 +146,7 @@ void CockpitPages::openEvents(CockpitPane& in) {
 
 void CockpitPages::openCoverage(CockpitPane& in) {
   in.push(new BlockPage(BlockPage::tr("Coverage"), &in, [this](double width) {
-    Blocks blocks;
-    const Link link = cockpit_.at(host_.now()).link;
-    blocks.push_back(wordsBlock(link.counters + " since the connection.", width));
-    return blocks;
+    return coverageBlocks(cockpit_.coverage(host_.now()), width);
   }));
 }
 
