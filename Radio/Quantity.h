@@ -77,7 +77,7 @@ inline constexpr Quantity scramblingCode{"scrambling_code",      "", Kind::ident
 inline constexpr Quantity cellParameter{"cell_parameter", "", Kind::identity, 0, 127, "3GPP TS 25.223, 6.4"};
 inline constexpr Quantity pci{"pci", "", Kind::identity, 0, 503, "3GPP TS 36.211, 6.11"};
 inline constexpr Quantity pnOffset{"pn_offset", "64 chips", Kind::identity, 0, 511, "3GPP2 C.S0002"};
-inline constexpr Quantity cellId{"cell_id", "", Kind::identity, 0, 4294967295, "3GPP TS 23.003, 4.3.1"};
+inline constexpr Quantity cellId{"cell_id", "", Kind::identity, 0, 268435455, "3GPP TS 23.003, 4.3.1, 19.6"};
 inline constexpr Quantity baseId{"base_id", "", Kind::identity, 0, 65535, "3GPP2 C.S0005"};
 inline constexpr Quantity lac{"lac", "", Kind::identity, 0, 65535, "3GPP TS 23.003, 4.1"};
 inline constexpr Quantity rac{"rac", "", Kind::identity, 0, 255, "3GPP TS 23.003, 4.2"};
@@ -131,15 +131,15 @@ inline constexpr Quantity receivedBits{"received_bits", "bit", Kind::count, 0, 4
 inline constexpr Quantity newTransmissions{"new_transmissions", "", Kind::count, 0, 65535, ""};
 inline constexpr Quantity blockErrors{"block_errors", "", Kind::count, 0, 65535, ""};
 inline constexpr Quantity subFrames{"sub_frames", "", Kind::count, 0, 1023, ""};
-inline constexpr Quantity antennas{"antennas", "", Kind::count, 0, 255, "3GPP TS 36.211, 6.2.1"};
+inline constexpr Quantity antennas{"antennas", "", Kind::count, 1, 4, "3GPP TS 36.211, 6.2.1"};
 inline constexpr Quantity count{"count", "", Kind::count, 0, 255, ""};
 inline constexpr Quantity drxCycles{"drx_cycles", "", Kind::count, 0, 63, "3GPP TS 36.133, 4.2.2.1"};
 
 // Parameters.
 inline constexpr Quantity version{"version", "", Kind::parameter, 0, 255, ""};
-inline constexpr Quantity bandwidth{"bandwidth", "", Kind::parameter, 6, 100, "3GPP TS 36.101, 5.6"};
-inline constexpr Quantity priority{"priority", "", Kind::parameter, 0, 65535, "3GPP TS 36.304, 5.2.4.1"};
-inline constexpr Quantity qrxlevmin{"qrxlevmin", "dBm", Kind::parameter, -140, -14, "3GPP TS 36.331, 6.3.4"};
+inline constexpr Quantity bandwidth{"bandwidth", "RB", Kind::parameter, 6, 100, "3GPP TS 36.101, 5.6"};
+inline constexpr Quantity priority{"priority", "", Kind::parameter, 0, 7, "3GPP TS 36.304, 5.2.4.1"};
+inline constexpr Quantity qrxlevmin{"qrxlevmin", "dBm", Kind::parameter, -140, -44, "3GPP TS 36.331, 6.3.4"};
 inline constexpr Quantity pMax{"p_max", "dBm", Kind::parameter, -30, 33, "3GPP TS 36.331, 6.3.4"};
 inline constexpr Quantity ueTxPower{"ue_tx_power_max",    "dBm", Kind::parameter, -30, 33,
                                     "3GPP TS 36.101, 6.2"};
@@ -147,7 +147,7 @@ inline constexpr Quantity searchThreshold{"search_threshold",       "dB", Kind::
                                           "3GPP TS 36.304, 5.2.4.2"};
 inline constexpr Quantity measurementRules{"measurement_rules",      "", Kind::parameter, 0, 15,
                                            "3GPP TS 36.304, 5.2.4.2"};
-inline constexpr Quantity frameNumber{"frame_number", "", Kind::parameter, 0, 65535, "3GPP TS 36.211, 4.1"};
+inline constexpr Quantity frameNumber{"frame_number", "", Kind::parameter, 0, 10239, "3GPP TS 36.211, 4.1"};
 inline constexpr Quantity window{"window", "", Kind::parameter, 0, 65535, ""};
 inline constexpr Quantity carriers{"carriers", "", Kind::parameter, 0, 3, "3GPP TS 25.308"};
 inline constexpr Quantity hoppingSequence{"hopping_sequence",     "", Kind::parameter, 0, 63,

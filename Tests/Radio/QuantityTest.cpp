@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include <set>
+#include <utility>
 
 namespace kelvasi {
 namespace {
@@ -29,6 +30,18 @@ TEST(Quantity, HasARangeWhereItIsANumber) {
                           each->kind != QuantityKind::none;
     EXPECT_EQ(each->least < each->most, isNumber) << each->id;
   }
+}
+
+// Typed from the clauses, not from what the records have room for.
+TEST(Quantity, HasTheRangeThatItsSourceAllows) {
+  const auto range = [](const Quantity& quantity) { return std::pair(quantity.least, quantity.most); };
+  EXPECT_EQ(range(quantity::qrxlevmin), std::pair(2 * -70.0, 2 * -22.0));
+  EXPECT_EQ(range(quantity::searchThreshold), std::pair(0.0, 2 * 31.0));
+  EXPECT_EQ(range(quantity::priority), std::pair(0.0, 7.0));
+  EXPECT_EQ(range(quantity::cellId), std::pair(0.0, 268435455.0));  // 28 bits
+  EXPECT_EQ(range(quantity::antennas), std::pair(1.0, 4.0));
+  EXPECT_EQ(range(quantity::frameNumber), std::pair(0.0, 10 * 1024 - 1.0));  // with the subframe
+  EXPECT_EQ(range(quantity::pci), std::pair(0.0, 503.0));
 }
 
 TEST(Quantity, OfReceivedCodePowerIsInDecibelOfAMilliwatt) {
