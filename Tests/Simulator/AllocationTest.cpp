@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-// Once the rows that a record fills exist, it costs no allocation: every record of a drive, by its log code.
+// Once the rows that a record fills exist, it costs no allocation, its readings included: every record of a
+// drive, by its log code.
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -9,6 +10,7 @@
 #include <map>
 
 #include "LogGenerator/LogGenerator.h"
+#include "LogGenerator/Readings.h"
 #include "Platform/Plist/LibplistSerialiser.h"
 #include "Simulator/ScenarioList.h"
 #include "Simulator/Subscription.h"
@@ -37,6 +39,7 @@ class Generator {
     generator_ = LogGenerator::generatorFromTechnology(
         technology, {log_, surroundings_.trace, plists_, surroundings_.resources, surroundings_.clock});
     generator_->generateLogUsingState(*state_);
+    generator_->gatherInto(&readings_);
   }
 
   void take(const Messages& messages) {
@@ -50,6 +53,7 @@ class Generator {
   DeafLog log_;
   kelvasi::test::TestPlatform surroundings_;
   LibplistSerialiser plists_;
+  Readings readings_;
   std::unique_ptr<LogGenerator> generator_;
   PlistValue::Dictionary state_ = PlistDictionary::make();
 };
