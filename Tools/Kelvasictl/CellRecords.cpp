@@ -82,7 +82,7 @@ Json rolesOf(const SeenCell& cell) {
 }
 
 void addLevel(Json& record, const CellLevel& level) {
-  record["unit"] = level.quantity->unit;
+  record["unit"] = level.quantity->unit.empty() ? Json() : Json(level.quantity->unit);
   record["count"] = level.count;
   record["min"] = level.minimum;
   record["mean"] = level.mean;

@@ -96,7 +96,9 @@ Json alarmRecord(const survey::Alarm& alarm, std::string_view technology) {
 
 std::string alarmText(const survey::Alarm& alarm) {
   const std::string cell = textOf(alarm.cell);
-  return alarm.rule.text + ": " + findingOf(alarm) + (cell.empty() ? "" : ", " + cell);
+  const std::string finding = findingOf(alarm);
+  const bool saysCell = cell.empty() || finding.ends_with(cell);
+  return alarm.rule.text + ": " + finding + (saysCell ? "" : ", " + cell);
 }
 
 }  // namespace kelvasi
