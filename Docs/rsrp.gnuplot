@@ -21,5 +21,6 @@ set ylabel "RSRP (dBm)"
 set grid linetype 1 linecolor "#dddddd"
 set border 3 linecolor "#888888"
 set tics nomirror
+set linetype 5 linecolor "#8c564b"  # its yellow is too light for white
 set key outside right top
 plot for [name in names] csv using 1:(strcol(7) eq name ? $9 : NaN) with points pointtype 7 pointsize 0.35 title name
