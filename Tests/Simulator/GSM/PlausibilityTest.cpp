@@ -11,6 +11,7 @@
 #include "Simulator/Handset/CellLayout.h"
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/DisplayTexts.h"
+#include "Tests/Simulator/HandsetWatch.h"
 #include "Tests/Simulator/PlayedScenario.h"
 
 namespace kelvasi::sim::gsm {
@@ -21,7 +22,6 @@ using testing::AllOf;
 using testing::Ge;
 using testing::Le;
 using testing::UnorderedElementsAreArray;
-using Rrc = RadioConnection::Rrc;
 
 constexpr int manySteps = 9000;  // half an hour
 constexpr int stepsOfTwoMinutes = 600;
@@ -98,69 +98,22 @@ TEST_P(GsmPlausibility, OnGsmTheUmtsNeighboursAreShown) {
   EXPECT_GT(withNeighbours, moments / 2);
 }
 
-// Of one connection, from its set-up to its release.
 TEST_P(GsmPlausibility, CipheringStaysOnInEveryStateOfALiveSession) {
-  std::optional<int> establishedFor;
-  std::set<Rrc> ciphered;
+  CipheringWatch watch;
   play([&](const Messages&) {
-    const Rrc rrc = world().connection().rrc();
-    const bool isAlive = rrc == Rrc::fach || rrc == Rrc::dch || rrc == Rrc::uraPch;
-    establishedFor = isAlive ? establishedFor.value_or(0) + 1 : std::optional<int>();
-    const std::string shown = viewer.text("UMTS RR Info", "Ciphering");
-    if (isAlive && *establishedFor > 5) {
-      ASSERT_EQ(shown, "Enabled") << static_cast<int>(rrc);
-      ciphered.insert(rrc);
-    }
-    if (!isAlive) {
-      ASSERT_NE(shown, "Enabled");
-    }
+    ASSERT_NO_FATAL_FAILURE(watch.see(world(), viewer.text("UMTS RR Info", "Ciphering") == "Enabled"));
   });
-  EXPECT_EQ(ciphered.size(), 3u);
+  EXPECT_EQ(watch.states().size(), 3u);
 }
-
-using Transition = std::pair<Rrc, Rrc>;
-// 3GPP TS 25.331, 7.1: what is possible without a message in between that is not told of.
-const std::set<Transition> possible{
-    {Rrc::disconnected, Rrc::connecting},
-    {Rrc::connecting, Rrc::disconnected},
-    {Rrc::connecting, Rrc::dch},
-    {Rrc::connecting, Rrc::fach},
-    {Rrc::dch, Rrc::fach},
-    {Rrc::fach, Rrc::dch},
-    {Rrc::fach, Rrc::uraPch},
-    {Rrc::uraPch, Rrc::fach},
-    {Rrc::dch, Rrc::disconnected},
-    {Rrc::fach, Rrc::disconnected},
-    {Rrc::uraPch, Rrc::disconnected},
-};
 
 TEST_P(GsmPlausibility, ConnectionsAreSetUpAndReleased) {
-  Rrc before = Rrc::disconnected;
-  bool wasReleasing = false;
-  pass([&](const World& world) {
-    const Rrc now = world.connection().rrc();
-    if (now != before) {
-      ASSERT_TRUE(possible.contains({before, now}))
-          << static_cast<int>(before) << " to " << static_cast<int>(now);
-    }
-    ASSERT_FALSE(wasReleasing && now == Rrc::dch && !world.connection().isReleasing());
-    wasReleasing = now == Rrc::dch && world.connection().isReleasing();
-    before = now;
-  });
+  TransitionWatch watch;
+  pass([&](const World& world) { watch.see(world); });
 }
 
-// From one dedicated channel to the next only within the active set, that is by soft handover.
 TEST_P(GsmPlausibility, ADedicatedChannelThatLosesItsCellIsReleased) {
-  std::vector<std::size_t> active;
-  Rrc before = Rrc::disconnected;
-  pass([&](const World& world) {
-    const Rrc now = world.connection().rrc();
-    if (before == Rrc::dch && now == Rrc::dch) {
-      ASSERT_THAT(active, testing::Contains(*world.serving()));
-    }
-    before = now;
-    active = world.activeSet().cells();
-  });
+  DedicatedChannelWatch watch;
+  pass([&](const World& world) { watch.see(world); });
 }
 
 TEST_P(GsmPlausibility, AConnectionStaysInItsNetwork) {
