@@ -2,19 +2,13 @@
 #include "LogGenerator/C2K/C2KLogGenerator.h"
 
 #include <algorithm>
-#include <array>
 
 #include "LogGenerator/C2K/C2KLookup.h"
 #include "LogGenerator/C2K/C2KRecords.h"
-#include "LogGenerator/C2K/DeviceStatus.h"
-#include "LogGenerator/C2K/EvdoActiveSet.h"
-#include "LogGenerator/C2K/EvdoRates.h"
-#include "LogGenerator/C2K/EvdoStatus.h"
-#include "LogGenerator/C2K/Fingers.h"
+#include "LogGenerator/C2K/C2KUpdate.h"
 #include "LogGenerator/C2K/PilotList.h"
-#include "LogGenerator/C2K/SystemParameters.h"
-#include "LogGenerator/C2K/TrafficFER.h"
 #include "LogGenerator/RecordFraming.h"
+#include "LogGenerator/RowCatalog.h"
 #include "LogGenerator/SortPrefix.h"
 #include "Platform/PlistSerialiser.h"
 #include "Platform/Resources.h"
@@ -22,19 +16,6 @@
 namespace kelvasi {
 
 namespace {
-
-// In the order in which the start command names the codes. A new record adds its line here.
-constexpr std::array records{
-    C2KRecord{fingers::logCode, parseFingers, fingersParts},
-    C2KRecord{evdoStatus::logCode, parseEvdoStatus, evdoStatusParts},
-    C2KRecord{evdoForwardRate::logCode, parseEvdoForwardRate, evdoForwardRateParts},
-    C2KRecord{evdoActiveSet::logCode, parseEvdoActiveSet, evdoActiveSetParts},
-    C2KRecord{deviceStatus::logCode, parseDeviceStatus, deviceStatusParts},
-    C2KRecord{trafficFER::logCode, parseTrafficFER, trafficFERParts},
-    C2KRecord{evdoReverseRate::logCode, parseEvdoReverseRate, evdoReverseRateParts},
-    C2KRecord{systemParameters::logCode, parseSystemParameters, systemParametersParts,
-              fieldIn(systemParameters::layout, "version").byte},
-};
 
 PlistValue loadTemplate(const Platform& platform) {
   const auto bytes = platform.resources.contents("C2KTemplate", "plist");
@@ -84,7 +65,8 @@ void C2KLogGenerator::updateFromLog(std::span<const std::uint8_t> data, const Pl
   if (!isKnownType) {
     platform().log.print(LogPriority::error, "Invalid log type: %x. Dropping.", unsigned{framed->logType});
   }
-  const auto* const record = std::ranges::find(records, framed->logCode, &C2KRecord::logCode);
+  const auto records = c2kRecords();
+  const auto record = std::ranges::find(records, framed->logCode, &C2KRecord::logCode);
   if (record == records.end())
     return count(framed->logCode, isKnownType ? Outcome::notAskedFor : Outcome::unknownLogType,
                  framed->record.bytes());
@@ -101,7 +83,7 @@ void C2KLogGenerator::describe(RowCatalog& catalog) const {
   sections.learn(getDisplayFromState(state, platform()));
   const PlistValue lookup = state.get("Lookup");
   if (!lookup.dictionary()) return;
-  for (const C2KRecord& record : records) {
+  for (const C2KRecord& record : c2kRecords()) {
     RowCatalog byName;
     for (const RecordPart& part : record.parts()) byName.add({}, part);
     for (const CatalogRow& row : byName.rows()) {
@@ -131,7 +113,7 @@ PlistValue C2KLogGenerator::generateLogUsingState(PlistDictionary& state) {
 
 PlistValue C2KLogGenerator::getStartCommand() const {
   const auto logCodes = PlistArray::make();
-  for (const C2KRecord& record : records) logCodes->append(record.logCode);
+  for (const C2KRecord& record : c2kRecords()) logCodes->append(record.logCode);
   return PlistDictionary::make({{"SetState", "Streaming"}, {"SetOrvaneLogCodes", logCodes}});
 }
 

@@ -2,10 +2,11 @@
 #include "LogGenerator/C2K/DeviceStatus.h"
 
 #include "LogGenerator/C2K/ActiveSet1x.h"
-#include "LogGenerator/C2K/C2KRecords.h"
+#include "LogGenerator/C2K/C2KUpdate.h"
 #include "LogGenerator/C2K/SubPackets.h"
 #include "LogGenerator/C2K/TrafficFER.h"
 #include "LogGenerator/C2K/ValueTexts.h"
+#include "LogGenerator/RowCatalog.h"
 
 namespace kelvasi {
 
@@ -84,18 +85,18 @@ void showOldErrorRate(const C2KUpdate& update) {
 
 }  // namespace
 
-std::span<const RecordPart> deviceStatusParts() {
-  static constexpr std::array parts{
+std::span<const RecordPart> deviceStatus::parts() {
+  static constexpr std::array shown{
       RecordPart{logCode, stateLayout, stateRows, "sub-packet 1"},
       RecordPart{logCode, radioLayout, receiverRows, "sub-packet 2"},
       RecordPart{logCode, radioLayout, trafficRows, "sub-packet 2"},
       RecordPart{.logCode = logCode, .rows = std::span(activeSet1xRows).first(1), .list = "pilots"},
       RecordPart{.logCode = logCode, .rows = std::span(&trafficFER::oldRateRow, 1)},
   };
-  return parts;
+  return shown;
 }
 
-Outcome parseDeviceStatus(const C2KUpdate& update) {
+Outcome deviceStatus::parse(const C2KUpdate& update) {
   if (!isLongEnough(update, subPackets::minimumLength,
                     "Log code 0x119c is %u bytes long but must be at least %lu bytes."))
     return Outcome::tooShort;

@@ -4,6 +4,7 @@
 
 #include <array>
 
+#include "LogGenerator/C2K/C2KRecord.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 
@@ -48,5 +49,9 @@ constexpr std::size_t pilotEnergyAt(std::int64_t fingers) {
 }
 
 inline constexpr std::int64_t fingersId = 4;  // has to be there, though nothing of it is shown
+
+Outcome parse(const C2KUpdate& update);
+std::span<const RecordPart> parts();
+inline constexpr C2KRecord record{logCode, parse, parts};
 
 }  // namespace kelvasi::deviceStatus

@@ -3,7 +3,8 @@
 
 #include <string>
 
-#include "LogGenerator/C2K/C2KRecords.h"
+#include "LogGenerator/C2K/C2KUpdate.h"
+#include "LogGenerator/RowCatalog.h"
 
 namespace kelvasi {
 
@@ -76,20 +77,19 @@ void showRate(const C2KUpdate& update, const Link& link, std::uint32_t sequence,
 
 }  // namespace
 
-std::span<const RecordPart> evdoForwardRateParts() {
-  static constexpr std::array parts{
+std::span<const RecordPart> evdoForwardRate::parts() {
+  static constexpr std::array shown{
       RecordPart{.logCode = evdoForwardRate::logCode, .rows = std::span(&forwardRow, 1)}};
-  return parts;
+  return shown;
 }
 
-std::span<const RecordPart> evdoReverseRateParts() {
-  static constexpr std::array parts{
+std::span<const RecordPart> evdoReverseRate::parts() {
+  static constexpr std::array shown{
       RecordPart{.logCode = evdoReverseRate::logCode, .rows = std::span(&reverseRow, 1)}};
-  return parts;
+  return shown;
 }
 
-Outcome parseEvdoForwardRate(const C2KUpdate& update) {
-  using namespace evdoForwardRate;
+Outcome evdoForwardRate::parse(const C2KUpdate& update) {
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x1192 is %d bytes long but must be at least %ld bytes."))
     return Outcome::tooShort;
@@ -99,8 +99,7 @@ Outcome parseEvdoForwardRate(const C2KUpdate& update) {
   return Outcome::shown;
 }
 
-Outcome parseEvdoReverseRate(const C2KUpdate& update) {
-  using namespace evdoReverseRate;
+Outcome evdoReverseRate::parse(const C2KUpdate& update) {
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x127e is %d bytes long but must be at least %ld bytes."))
     return Outcome::tooShort;

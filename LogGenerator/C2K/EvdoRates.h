@@ -5,6 +5,7 @@
 
 #include <array>
 
+#include "LogGenerator/C2K/C2KRecord.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 
@@ -23,6 +24,10 @@ inline constexpr std::array<std::int64_t, 56> weights{
     0,    128,  256, 512,  1024, 0,    128,  256,  512,  1024, 0,    512,  1024, 2048,
     0,    128,  256, 512,  1024, 0,    512,  1024, 2048, 0,    1024, 3072, 0,    512,
     1024, 2048, 0,   4096, 0,    1024, 3072, 0,    4096, 0,    5120, 0,    5120, 0};
+
+Outcome parse(const C2KUpdate& update);
+std::span<const RecordPart> parts();
+inline constexpr C2KRecord record{logCode, parse, parts};
 
 }  // namespace evdoForwardRate
 
@@ -44,6 +49,10 @@ inline constexpr std::size_t counterStep = 4;
 // Bits of a packet, by rate.
 inline constexpr std::array<std::int64_t, 12> weights{128,  256,  512,  768,  1024, 1536,
                                                       2048, 3072, 4096, 6144, 8192, 12288};
+
+Outcome parse(const C2KUpdate& update);
+std::span<const RecordPart> parts();
+inline constexpr C2KRecord record{logCode, parse, parts};
 
 }  // namespace evdoReverseRate
 

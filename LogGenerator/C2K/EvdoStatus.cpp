@@ -1,9 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/C2K/EvdoStatus.h"
 
-#include "LogGenerator/C2K/C2KRecords.h"
+#include "LogGenerator/C2K/C2KUpdate.h"
 #include "LogGenerator/C2K/NoPilot.h"
 #include "LogGenerator/C2K/ValueTexts.h"
+#include "LogGenerator/RowCatalog.h"
 
 namespace kelvasi {
 
@@ -66,16 +67,16 @@ CellIdentity servingCell(RecordView record) {
 
 }  // namespace
 
-std::span<const RecordPart> evdoStatusParts() {
-  static constexpr std::array parts{
+std::span<const RecordPart> evdoStatus::parts() {
+  static constexpr std::array shown{
       RecordPart{evdoStatus::logCode, layout, radioRows},
       RecordPart{evdoStatus::logCode, layout, connectedRows},
       RecordPart{evdoStatus::logCode, layout, sessionRows},
   };
-  return parts;
+  return shown;
 }
 
-Outcome parseEvdoStatus(const C2KUpdate& update) {
+Outcome evdoStatus::parse(const C2KUpdate& update) {
   if (update.record.size() != evdoStatus::length) {
     update.log.print(LogPriority::error, "Log code 0x1183 is %u bytes long but should be %lu bytes.",
                      update.length(), static_cast<unsigned long>(evdoStatus::length));

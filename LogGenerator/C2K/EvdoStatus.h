@@ -4,6 +4,7 @@
 
 #include <array>
 
+#include "LogGenerator/C2K/C2KRecord.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 
@@ -27,5 +28,9 @@ inline constexpr std::array layout{
 static_assert(inWireOrder(layout));
 
 inline constexpr std::int64_t accessState = 4;  // below it, the second receiver and the transmitter are off
+
+Outcome parse(const C2KUpdate& update);
+std::span<const RecordPart> parts();
+inline constexpr C2KRecord record{logCode, parse, parts};
 
 }  // namespace kelvasi::evdoStatus

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/C2K/Fingers.h"
 
-#include "LogGenerator/C2K/C2KRecords.h"
-#include "LogGenerator/C2K/NoPilot.h"
+#include "LogGenerator/C2K/PilotEntries.h"
 #include "LogGenerator/C2K/ValueTexts.h"
+#include "LogGenerator/RowCatalog.h"
 
 namespace kelvasi {
 
@@ -15,35 +15,34 @@ constexpr Row fingerRow{.key = "kFingerC2I",
                         .unit = " dB",
                         .absent = "(none)",
                         .scale = strengthScale};
+constexpr PilotEntries entries{.family = RadioFamily::cdma,
+                               .first = fingers::firstFinger,
+                               .size = fingers::fingerSize,
+                               .layout = fingers::fingerLayout,
+                               .pilot = fieldIn(fingers::fingerLayout, "PN offset"),
+                               .row = fingerRow,
+                               .leavesOutNone = true};
 
 }  // namespace
 
-std::span<const RecordPart> fingersParts() {
-  static constexpr std::array parts{
+std::span<const RecordPart> fingers::parts() {
+  static constexpr std::array shown{
       RecordPart{fingers::logCode, fingers::fingerLayout, std::span(&fingerRow, 1), "finger", "fingers"}};
-  return parts;
+  return shown;
 }
 
-Outcome parseFingers(const C2KUpdate& update) {
-  using namespace fingers;
+Outcome fingers::parse(const C2KUpdate& update) {
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x108a is %u bytes long but must be at least %lu bytes."))
     return Outcome::tooShort;
   const auto count = static_cast<std::size_t>(valueOf(update.record, fieldIn(layout, "count")));
-  if (update.record.size() != firstFinger + fingerSize * count) {
+  if (update.record.size() != entries.lengthOf(count)) {
     update.log.print(LogPriority::error,
                      "Log code 0x108a has bad length of %u bytes, but has %d substructs (size=%lu).",
                      update.length(), static_cast<int>(count), static_cast<unsigned long>(minimumLength));
     return Outcome::notUnderstood;
   }
-  update.pilots.begin(RadioFamily::cdma);
-  for (std::size_t place = 0; place < count; ++place) {
-    const RecordView finger = update.record.from(firstFinger + fingerSize * place);
-    const std::int64_t pilot = valueOf(finger, fieldIn(fingerLayout, "PN offset"));
-    if (pilot == noPilot) continue;
-    update.pilots.add(place, pilot, fingerRow, rawOf(finger, fingerLayout, fingerRow));
-  }
-  update.writePilotsOrNone(fingerRow);
+  entries.show(update, count);
   return Outcome::shown;
 }
 

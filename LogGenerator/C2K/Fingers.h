@@ -4,6 +4,7 @@
 
 #include <array>
 
+#include "LogGenerator/C2K/C2KRecord.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 
@@ -21,5 +22,9 @@ inline constexpr std::array fingerLayout{
     Field{.name = "C/I", .byte = 6, .width = 16},
 };
 static_assert(inWireOrder(fingerLayout));
+
+Outcome parse(const C2KUpdate& update);
+std::span<const RecordPart> parts();
+inline constexpr C2KRecord record{logCode, parse, parts};
 
 }  // namespace kelvasi::fingers

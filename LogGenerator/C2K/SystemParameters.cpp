@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/C2K/SystemParameters.h"
 
-#include "LogGenerator/C2K/C2KRecords.h"
+#include "LogGenerator/C2K/C2KUpdate.h"
 #include "LogGenerator/C2K/ValueTexts.h"
+#include "LogGenerator/RowCatalog.h"
 
 namespace kelvasi {
 
@@ -44,17 +45,17 @@ constexpr std::array cellRows{
 
 }  // namespace
 
-std::span<const RecordPart> systemParametersParts() {
-  static constexpr std::array parts{
+std::span<const RecordPart> systemParameters::parts() {
+  static constexpr std::array shown{
       RecordPart{logCode, layout, roamingRows},
       RecordPart{logCode, layout, identityRows},
       RecordPart{logCode, layout, unknownRows},
       RecordPart{logCode, layout, cellRows},
   };
-  return parts;
+  return shown;
 }
 
-Outcome parseSystemParameters(const C2KUpdate& update) {
+Outcome systemParameters::parse(const C2KUpdate& update) {
   if (!isLongEnough(update, minimumLength,
                     "Log code 0x134f is %d bytes long but must be at least %lu bytes."))
     return Outcome::tooShort;

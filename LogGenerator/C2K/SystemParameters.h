@@ -4,6 +4,7 @@
 
 #include <array>
 
+#include "LogGenerator/C2K/C2KRecord.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 
@@ -26,5 +27,9 @@ inline constexpr std::array layout{
     Field{.name = "base identity", .byte = 184, .width = 16},
 };
 static_assert(inWireOrder(layout));
+
+Outcome parse(const C2KUpdate& update);
+std::span<const RecordPart> parts();
+inline constexpr C2KRecord record{logCode, parse, parts, fieldIn(layout, "version").byte};
 
 }  // namespace kelvasi::systemParameters

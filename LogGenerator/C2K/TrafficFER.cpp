@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "LogGenerator/C2K/TrafficFER.h"
 
-#include "LogGenerator/C2K/C2KRecords.h"
+#include "LogGenerator/C2K/C2KUpdate.h"
 #include "LogGenerator/C2K/SubPackets.h"
+#include "LogGenerator/RowCatalog.h"
 
 namespace kelvasi {
 
@@ -13,14 +14,13 @@ std::optional<double> trafficFER::rateOf(const PlistDictionary& state) {
   return std::nullopt;
 }
 
-std::span<const RecordPart> trafficFERParts() {
-  static constexpr std::array parts{
+std::span<const RecordPart> trafficFER::parts() {
+  static constexpr std::array shown{
       RecordPart{.logCode = trafficFER::logCode, .rows = std::span(&trafficFER::rateRow, 1)}};
-  return parts;
+  return shown;
 }
 
-Outcome parseTrafficFER(const C2KUpdate& update) {
-  using namespace trafficFER;
+Outcome trafficFER::parse(const C2KUpdate& update) {
   if (!isLongEnough(update, subPackets::minimumLength,
                     "Log code 0x119d is %d bytes long but must be at least %ld bytes."))
     return Outcome::tooShort;

@@ -5,6 +5,7 @@
 #include <array>
 #include <optional>
 
+#include "LogGenerator/C2K/C2KRecord.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 #include "LogGenerator/Row.h"
@@ -38,5 +39,9 @@ std::optional<double> rateOf(const PlistDictionary& state);
 constexpr double percent(double rate) {
   return rate * 100;
 }
+
+Outcome parse(const C2KUpdate& update);
+std::span<const RecordPart> parts();
+inline constexpr C2KRecord record{logCode, parse, parts};
 
 }  // namespace kelvasi::trafficFER

@@ -3,6 +3,7 @@
 // anywhere between them: the tests of every section find them by themselves.
 #pragma once
 
+#include <algorithm>
 #include <string_view>
 #include <vector>
 
@@ -26,5 +27,17 @@ struct RequiredLength {
 // lengths of its records, and the codes whose records show nothing by themselves.
 template <typename Index>
 struct Required;
+
+// What the required sections ask for, each code once.
+template <typename Index>
+std::vector<LogCode> requiredCodes() {
+  std::vector<LogCode> codes;
+  for (const RequiredSection& section : Required<Index>::sections) {
+    for (const LogCode code : section.logCodes) {
+      if (std::ranges::count(codes, code) == 0) codes.push_back(code);
+    }
+  }
+  return codes;
+}
 
 }  // namespace kelvasi::test

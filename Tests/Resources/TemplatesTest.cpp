@@ -10,8 +10,8 @@
 
 #include "Model/KelvasiModelNode.h"
 #include "Platform/Plist/LibplistSerialiser.h"
+#include "Tests/LogGenerator/C2K/LookupNames.h"
 #include "Tests/LogGenerator/Sections/ClassIndexes.h"
-#include "Tests/Support/C2KLookupNames.h"
 
 namespace kelvasi {
 namespace {
@@ -73,7 +73,9 @@ std::vector<std::string> sectionsOf() {
 template <typename... Index>
 std::vector<std::string> wanted(const std::string& name, testing::Types<Index...>) {
   std::vector<std::string> wanted;
-  if (name == "C2KTemplate") wanted.assign(test::c2kLookupNames.begin(), test::c2kLookupNames.end());
+  if (name == "C2KTemplate") {
+    for (const std::string_view lookupName : test::c2kLookupNames()) wanted.emplace_back(lookupName);
+  }
   ((name == test::Required<Index>::displayTemplate ? void(wanted = sectionsOf<Index>()) : void()), ...);
   std::ranges::sort(wanted);
   return wanted;

@@ -7,6 +7,8 @@
 #include "LogGenerator/C2K/C2KLookup.h"
 #include "Telvon/Technology.h"
 #include "Tests/LogGenerator/C2K/C2KFixture.h"
+#include "Tests/LogGenerator/C2K/LookupNames.h"
+#include "Tests/LogGenerator/C2K/Required.h"
 
 namespace kelvasi {
 namespace {
@@ -29,13 +31,24 @@ TEST(C2KLogGenerator, IsTheGeneratorOfItsTechnology) {
   EXPECT_NE(dynamic_cast<C2KLogGenerator*>(generator.get()), nullptr);
 }
 
-TEST(C2KLogGenerator, StartCommandNamesEightCodesInThisOrder) {
+TEST(C2KLogGenerator, TheStartCommandNamesTheCodeOfEveryRecordInOrder) {
   const C2KFixture fixture({});
-  EXPECT_EQ(
-      fixture.generator.getStartCommand(),
-      PlistValue(PlistDictionary::make(
-          {{"SetState", "Streaming"},
-           {"SetOrvaneLogCodes", PlistArray::make({4234, 4483, 4498, 4790, 4508, 4509, 4734, 4943})}})));
+  const auto codes = PlistArray::make();
+  for (const C2KRecord& each : c2kRecords()) codes->append(each.logCode);
+  EXPECT_EQ(fixture.generator.getStartCommand(),
+            PlistValue(PlistDictionary::make({{"SetState", "Streaming"}, {"SetOrvaneLogCodes", codes}})));
+}
+
+TEST(C2KLogGenerator, TheEightRequiredCodesStandInThisOrder) {
+  const std::vector<LogCode> required{4234, 4483, 4498, 4790, 4508, 4509, 4734, 4943};
+  std::vector<LogCode> codes;
+  for (const C2KRecord& each : c2kRecords()) codes.push_back(each.logCode);
+  std::erase_if(codes, [&](LogCode code) { return std::ranges::count(required, code) == 0; });
+  EXPECT_EQ(codes, required);
+}
+
+TEST(C2KLogGenerator, TheRequiredNamesAreFilled) {
+  EXPECT_THAT(test::c2kLookupNames(), testing::IsSupersetOf(test::requiredC2KNames));
 }
 
 TEST(C2KLogGenerator, TheFirstRequestAlreadyReturnsTheDisplay) {

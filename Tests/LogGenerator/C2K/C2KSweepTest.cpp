@@ -7,38 +7,21 @@
 
 #include "Plist/Description.h"
 #include "Tests/LogGenerator/C2K/C2KFixture.h"
-#include "Tests/Support/C2KLookupNames.h"
+#include "Tests/LogGenerator/C2K/LookupNames.h"
+#include "Tests/LogGenerator/C2K/Required.h"
 
 namespace kelvasi {
 namespace {
 
 using test::C2KFixture;
 using test::record;
-
-struct SweptRecord {
-  LogCode logCode;
-  std::size_t minimumLength;
-  const char* row;  // that the second of two records of zeros fills; none where there is nothing to show
-  const char* text;
-  bool isExact = false;  // longer ones are refused again
-};
-
-constexpr std::array swept{
-    SweptRecord{0x108A, 23, "kFingerC2I", "(none)", true},
-    SweptRecord{0x1183, 50, "kChannel", "259", true},
-    SweptRecord{0x1192, 241, "kFLDataRate", "0.00 kbps"},
-    SweptRecord{0x12B6, 25, "kActiveSetPilots", "(none)"},
-    SweptRecord{0x119C, 17, nullptr, nullptr},
-    SweptRecord{0x119D, 17, nullptr, nullptr},
-    SweptRecord{0x127E, 1750, "kRLDataRate", "0.00 kbps"},
-    SweptRecord{0x134F, 171, "kSystemId", "(unknown system type 0)"},
-};
+using test::requiredC2KRecords;
 
 constexpr std::array<std::uint8_t, 2> fills{0x00, 0xFF};
 
 // Every lookup name has a leaf.
 struct AllRows : C2KFixture {
-  AllRows() : C2KFixture(test::c2kLookupNames) { generator.generateLogUsingState(state); }
+  AllRows() : C2KFixture(test::c2kLookupNames()) { generator.generateLogUsingState(state); }
 };
 
 // In a buffer of exactly this size, so that a read past its end is seen. Every payload byte is `fill`.
@@ -50,7 +33,7 @@ Bytes filled(LogCode logCode, std::size_t length, std::uint8_t fill) {
 }
 
 // Of zeros but for bytes 13 and 14: a version of the system parameters, a sequence number of a rate.
-Bytes zeros(const SweptRecord& each, std::size_t length, std::string_view digits) {
+Bytes zeros(const test::RequiredC2KRecord& each, std::size_t length, std::string_view digits) {
   return test::with(filled(each.logCode, length, 0), 13, digits);
 }
 
@@ -63,9 +46,9 @@ std::string everything(const C2KFixture& fixture) {
 }
 
 TEST(C2KSweep, RecordsShorterThanTheirMinimumChangeNothing) {
-  for (const auto& each : swept) {
+  for (const auto& each : requiredC2KRecords) {
     AllRows fixture;
-    for (const auto& other : swept) fixture.take(zeros(other, other.minimumLength, "02 01"));
+    for (const auto& other : requiredC2KRecords) fixture.take(zeros(other, other.minimumLength, "02 01"));
     fixture.state.set("TrafficFER", 0.25);
     const std::string before = everything(fixture);
     for (std::size_t length = 0; length < each.minimumLength; ++length) {
@@ -79,7 +62,7 @@ TEST(C2KSweep, RecordsShorterThanTheirMinimumChangeNothing) {
 
 // Two of them, for the rates.
 TEST(C2KSweep, RecordsOfTheirMinimumAreTaken) {
-  for (const auto& each : swept) {
+  for (const auto& each : requiredC2KRecords) {
     for (std::size_t length = each.minimumLength; length <= each.minimumLength + 2; ++length) {
       AllRows fixture;
       fixture.take(zeros(each, length, "02 00"));
@@ -94,7 +77,7 @@ TEST(C2KSweep, RecordsOfTheirMinimumAreTaken) {
 
 // Counts of 255 over records that end inside the first entries, inside later ones, and behind the last.
 TEST(C2KSweep, CountsOf255AreTakenWhereverTheRecordEnds) {
-  for (const auto& each : swept) {
+  for (const auto& each : requiredC2KRecords) {
     AllRows fixture;
     for (std::size_t length = 13; length <= 700; ++length) fixture.take(filled(each.logCode, length, 0xFF));
     for (const std::size_t length : {2500U, 3085U, 3593U, 5000U, 70000U})
@@ -120,7 +103,7 @@ TEST(C2KSweep, RandomRecordsLeaveTextsAndDictionariesOnly) {
   fixture.surroundings.log.isMasked = true;
   std::mt19937 random(7);
   for (int turn = 0; turn < 4000; ++turn) {
-    const SweptRecord& each = swept[random() % swept.size()];
+    const test::RequiredC2KRecord& each = requiredC2KRecords[random() % requiredC2KRecords.size()];
     Bytes bytes = filled(each.logCode, each.minimumLength + random() % 64, 0);
     for (std::size_t at = 13; at < bytes.size(); ++at) bytes[at] = static_cast<std::uint8_t>(random());
     // Otherwise hardly a list or a sub-packet would be found.

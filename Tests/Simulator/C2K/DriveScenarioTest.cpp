@@ -14,8 +14,9 @@
 #include "Simulator/C2K/Frames.h"
 #include "Simulator/C2K/Strength.h"
 #include "Telvon/Technology.h"
+#include "Tests/LogGenerator/C2K/LookupNames.h"
+#include "Tests/LogGenerator/C2K/Required.h"
 #include "Tests/Simulator/PlayedScenario.h"
-#include "Tests/Support/C2KLookupNames.h"
 
 namespace kelvasi::sim::c2k {
 namespace {
@@ -32,7 +33,7 @@ constexpr std::array<std::uint64_t, 4> seeds{1, 3, 11, 12345};
 // A leaf for each lookup name, called after it.
 PlistValue displayTemplate() {
   const auto leaves = PlistDictionary::make();
-  for (const std::string_view name : kelvasi::test::c2kLookupNames) leaves->set(name, name);
+  for (const std::string_view name : kelvasi::test::c2kLookupNames()) leaves->set(name, name);
   return leaves;
 }
 
@@ -354,8 +355,10 @@ TEST_P(CdmaDrive, RatesAreThoseOfTheDataAndZeroWithoutThem) {
   EXPECT_GT(rates.size(), 20u);
 }
 
-TEST_P(CdmaDrive, SendsEveryCodeThatTheViewerSubscribesTo) {
-  test::expectEveryWantedCode(scenario, 2000, viewer.generator());
+TEST_P(CdmaDrive, SendsEveryRequiredCodeAndNoneThatTheViewerDoesNotSubscribeTo) {
+  std::vector<LogCode> required;
+  for (const auto& each : kelvasi::test::requiredC2KRecords) required.push_back(each.logCode);
+  test::expectEveryCode(scenario, 2000, viewer.generator(), required);
 }
 
 TEST_P(CdmaDrive, GoesThroughEveryStateOfBothAirInterfaces) {

@@ -5,9 +5,9 @@
 
 #include "Simulator/C2K/DriveScenario.h"
 #include "Telvon/Technology.h"
+#include "Tests/LogGenerator/C2K/LookupNames.h"
 #include "Tests/Simulator/DisplayTexts.h"
 #include "Tests/Simulator/PlayedScenario.h"
-#include "Tests/Support/C2KLookupNames.h"
 
 namespace kelvasi::sim::c2k {
 namespace {
@@ -19,7 +19,7 @@ constexpr int manySteps = 9000;  // half an hour
 // A leaf for each lookup name, called after it.
 PlistValue displayTemplate() {
   const auto leaves = PlistDictionary::make();
-  for (const std::string_view name : kelvasi::test::c2kLookupNames) leaves->set(name, name);
+  for (const std::string_view name : kelvasi::test::c2kLookupNames()) leaves->set(name, name);
   return leaves;
 }
 

@@ -9,6 +9,7 @@
 #include <set>
 
 #include "Telvon/Technology.h"
+#include "Tests/LogGenerator/GSM/Required.h"
 #include "Tests/Simulator/PlayedScenario.h"
 
 namespace kelvasi::sim::gsm {
@@ -238,8 +239,9 @@ TEST_F(Drive, MeasurementsAreThoseOfTheRadioModel) {
   EXPECT_GT(gsm, 20);
 }
 
-TEST_F(Drive, SendsEveryCodeThatTheViewerSubscribesTo) {
-  test::expectEveryWantedCode(scenario, manySteps, baseband.generator());
+TEST_F(Drive, SendsEveryRequiredCodeAndNoneThatTheViewerDoesNotSubscribeTo) {
+  test::expectEveryCode(scenario, manySteps, baseband.generator(),
+                        kelvasi::test::requiredCodes<Orvane_GSMClassIndex>());
 }
 
 TEST_F(Drive, SendsTheSimFilesOnceAndTellsThemToEveryNewStream) {

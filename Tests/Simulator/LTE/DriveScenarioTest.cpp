@@ -12,6 +12,7 @@
 
 #include "Radio/Channels.h"
 #include "Telvon/Technology.h"
+#include "Tests/LogGenerator/LTE/Required.h"
 #include "Tests/Simulator/PlayedScenario.h"
 #include "Tests/Simulator/RivalWatch.h"
 
@@ -313,8 +314,8 @@ TEST_P(LteDrive, GoesThroughEveryLayerStateAndSearch) {
   EXPECT_FALSE(seen.contains("Unknown"));
 }
 
-TEST_P(LteDrive, SendsEveryCodeThatTheViewerSubscribesToWithinAMinute) {
-  test::expectEveryWantedCode(scenario, 300, baseband.generator());
+TEST_P(LteDrive, SendsWithinAMinuteEveryRequiredCodeAndNoneThatTheViewerDoesNotSubscribeTo) {
+  test::expectEveryCode(scenario, 300, baseband.generator(), kelvasi::test::requiredCodes<LTEClassIndex>());
 }
 
 TEST_P(LteDrive, GreetsWithWhatIsTrueNow) {
