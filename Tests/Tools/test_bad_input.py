@@ -16,7 +16,7 @@ class BadCaptures(KelvasictlTest):
             with self.subTest(name):
                 result = self.decode(self.write(name, contents))
                 self.assert_fault(result, f"{self.path(name)}: byte 0: ")
-                self.assertEqual(result.stdout, b"null\n")
+                self.assertEqual(result.stdout, b"")
 
     def test_an_unknown_format_is_told_with_those_that_are_read(self):
         result = self.decode(self.write("text.pcap", b"this is no capture at all"))
@@ -32,10 +32,10 @@ class BadCaptures(KelvasictlTest):
 
     def test_the_captures_fault_is_named_even_where_a_later_step_fails_too(self):
         empty = self.write("empty.pcap", b"")
-        for result, pieces in ((self.decode(empty, "--format", "plist"), ("empty.pcap: byte 0: ", "no display")),
+        for result, pieces in ((self.decode(empty, "--format", "plist"), ("empty.pcap: byte 0: ",)),
                                (self.decode(empty, "--dlf", self.path("missing/x")), ("empty.pcap: byte 0: ", "missing/x"))):
             said = result.stderr.decode().splitlines()
-            self.assertEqual((len(said), result.returncode), (2, 1), said)
+            self.assertEqual((len(said), result.returncode), (len(pieces), 1), said)
             for line, piece in zip(said, pieces):
                 self.assertIn(piece, line)
 

@@ -75,7 +75,9 @@ class DecodeVerb {
       decode_->finish();
       tally.add(decode_->intake());
     }
-    if (!options_.everyTick) printDisplay(decode_ ? decode_->display() : PlistValue());
+    const PlistValue display = decode_ ? decode_->display() : PlistValue();
+    // Of a capture that could not be read, what was decoded before the fault and nothing else.
+    if (!options_.everyTick && (isWhole || !display.isAbsent())) printDisplay(display);
     save(decode_ ? decode_->saveContents() : PlistValue());
     return isWhole ? exitSuccess : exitFault;
   }
