@@ -128,6 +128,15 @@ class Demo(LiveTest):
         for name in ("root", "deep", "long-value", "save-view"):
             self.assertEqual((self.pictures / f"{name}.png").read_bytes()[:8], b"\x89PNG\r\n\x1a\n")
 
+    def test_the_pictures_are_the_users_own_whatever_was_there(self):
+        self.pictures.mkdir(mode=0o755, parents=True)
+        (self.pictures / "root.png").touch(mode=0o644)
+        self.check_ended(self.start_demo("--seconds", "1"))
+        for path in (self.pictures, self.pictures / "snapshots"):
+            self.assertEqual(path.stat().st_mode & 0o777, 0o700, path)
+        for path in self.pictures.glob("*.png"):
+            self.assertEqual(path.stat().st_mode & 0o777, 0o600, path)
+
     def test_a_display_that_cannot_be_reached_is_none(self):
         self.environment["DISPLAY"] = ":nowhere"
         demo = self.start_demo("--seconds", "1")
