@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
 # SPDX-License-Identifier: Apache-2.0
-"""Checks the one rule of direction: a folder includes only what stands below it.
+"""Checks the one rule of direction: a folder includes only what stands below it, and so does a room of a folder.
 
 Also that no headers include each other in a circle, that one technology includes nothing of another, that headers
 other than the C++ standard library's are included only where the platform, captures or tools are, that what is costly
@@ -17,6 +17,15 @@ HOUSE = ["Plist", "Platform", "Radio", "Telvon", "Dlf", "LogGenerator", "Model",
 # Rooms of LogGenerator/ and Simulator/, and beside them in Tests/ and Bench/.
 TECHNOLOGIES = {"GSM", "LTE", "UTRAN", "C2K", "ObjectStream"}
 MIRRORS = ["Tests", "Bench"]
+# Rooms of one folder, from the bottom upwards: each includes only what stands below it, and nothing beside it. What
+# lies in the folder itself serves all of them, or lists them.
+ROOMS = {
+    "Platform": [{"Posix", "Plist", "UserInterface", "QtDesktop"}, {"Qt"}, {"QtWidgets"}],
+    "LogGenerator": [{"Daemon"}, TECHNOLOGIES],
+    "Survey": [{"Series", "Cells"}, {"Events"}, {"Alarms"}],
+    "Simulator": [{"Radio"}, {"Handset"}, {"Daemon"}, TECHNOLOGIES],
+    "Tools": [{"Kelvasi", "Kelvasictl", "TelvonSim"}],
+}
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
 # What opens a descriptor, by the header that declares it and by name.
 OPENING_HEADERS = {"fcntl.h", "fstream", "sys/socket.h", "sys/eventfd.h", "sys/signalfd.h", "sys/timerfd.h", "sys/epoll.h",
@@ -86,8 +95,23 @@ def faults_of_technology(path: pathlib.Path):
         other = technology(pathlib.Path(name))
         if own and other and own != other:
             yield f'{place}: "{name}" is of another technology'
-        if other and path.parts[:2] == ("LogGenerator", "Daemon"):
-            yield f'{place}: "{name}" is of one technology, and the daemon serves all of them'
+
+
+def room_rank(path: pathlib.PurePath):
+    if len(path.parts) < 3:
+        return None
+    return next((rank for rank, rooms in enumerate(ROOMS.get(path.parts[0], [])) if path.parts[1] in rooms), None)
+
+
+def faults_of_room(path: pathlib.Path):
+    own = room_rank(path)
+    for place, kind, name in includes(path) if own is not None else ():
+        other = pathlib.PurePath(name)
+        if kind == "<" or other.parts[0] != path.parts[0] or other.parts[1] == path.parts[1]:
+            continue
+        rank = room_rank(other)
+        if rank is not None and rank >= own:
+            yield f'{place}: "{name}" does not stand below {path.parts[0]}/{path.parts[1]}/'
 
 
 # Each circle once, named by the header at which a walk from the top of the house met it again.
@@ -134,7 +158,8 @@ def sources(folders):
 
 def main() -> int:
     house = list(sources(HOUSE))
-    found = [fault for path in house for check in (faults_of_direction, faults_of_opening) for fault in check(path)]
+    found = [fault for path in house for check in (faults_of_direction, faults_of_room, faults_of_opening)
+             for fault in check(path)]
     for path in [*house, *sources(MIRRORS)]:
         found += [*faults_of_technology(path), *faults_of_cost(path), *faults_of_licence(path)]
     found += faults_of_circle([*house, *sources(MIRRORS)])
