@@ -95,7 +95,6 @@ class PlistArray {
   void removeFirst(std::size_t count);
   void removeAll() { elements_.clear(); }
   void truncate(std::size_t size);
-  void swapContents(PlistArray& other) { elements_.swap(other.elements_); }
 
  private:
   std::vector<PlistValue> elements_;

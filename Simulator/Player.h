@@ -31,7 +31,6 @@ class Player {
   // To be called when a channel's stream has begun: it is told the present state, and playing goes on. A
   // source that has ended begins anew.
   void streamBegan(Channel& channel);
-  bool isPlaying() const { return isPlaying_; }
 
  private:
   void play();

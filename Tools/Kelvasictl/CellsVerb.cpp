@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl cells: the cells of captures or of a live link.
-
 #include "Tools/Kelvasictl/CellRecords.h"
 #include "Tools/Kelvasictl/MessageTally.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
@@ -20,16 +19,11 @@ cell, CSV one for each level of a cell.)";
 
 int run(const SurveyOptions& options, MessageTally& tally) {
   survey::Cells cells;
-  const auto setUp = [](const std::string&, const SurveyUse::Print&) {
-    survey::SurveySetUp result;
-    result.keepsSeries = false;
-    return result;
-  };
   const auto take = [&](const Surveyed& surveyed) {
     cells.merge(surveyed.survey.cells());
     tally.add(surveyed.generator.intake());
   };
-  const int status = runSurvey(options, {.setUp = setUp, .take = take});
+  const int status = runSurvey(options, {.take = take});
   const LoadedOperators names = loadOperators();
   for (const std::string& line : names.complaints) complain(line);
   printCells(cells, names.operators, options.format.format(), printOut);
@@ -41,11 +35,7 @@ int run(const SurveyOptions& options, MessageTally& tally) {
 }  // namespace
 
 Action declareCells(OptionSet verb) {
-  const auto options = std::make_shared<SurveyOptions>();
-  options->addTo(verb);
-  options->addJobsTo(verb);
-  verb.setFooter(footer);
-  return [options](MessageTally& tally) { return run(*options, tally); };
+  return declareSurvey(verb, footer, run);
 }
 
 }  // namespace kelvasi

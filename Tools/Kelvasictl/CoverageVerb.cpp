@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl coverage: what became of the messages of captures or of a live link.
-
 #include "Tools/Kelvasictl/CoverageRecords.h"
 #include "Tools/Kelvasictl/MessageTally.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
@@ -19,17 +18,12 @@ length and the last version byte, where the record has one, and the first bytes 
 
 int run(const SurveyOptions& options, MessageTally& tally) {
   Coverage coverage;
-  const auto setUp = [](const std::string&, const SurveyUse::Print&) {
-    survey::SurveySetUp result;
-    result.keepsSeries = false;
-    return result;
-  };
   const auto take = [&](const Surveyed& surveyed) {
     const Intake& intake = surveyed.generator.intake();
     coverage.add(surveyed.technology, intake, logCodesAsked(surveyed.generator));
     tally.add(intake);
   };
-  const int status = runSurvey(options, {.setUp = setUp, .take = take});
+  const int status = runSurvey(options, {.take = take});
   RecordOutput output(options.format.format(), coverageColumns(), printOut);
   output.begin();
   for (const Json& record : coverage.records()) output.print(record);
@@ -39,11 +33,7 @@ int run(const SurveyOptions& options, MessageTally& tally) {
 }  // namespace
 
 Action declareCoverage(OptionSet verb) {
-  const auto options = std::make_shared<SurveyOptions>();
-  options->addTo(verb);
-  options->addJobsTo(verb);
-  verb.setFooter(footer);
-  return [options](MessageTally& tally) { return run(*options, tally); };
+  return declareSurvey(verb, footer, run);
 }
 
 }  // namespace kelvasi

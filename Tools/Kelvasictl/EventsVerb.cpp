@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasictl events: what happened in captures or on a live link.
-
 #include "Tools/Kelvasictl/EventRecords.h"
 #include "Tools/Kelvasictl/MessageTally.h"
 #include "Tools/Kelvasictl/StandardStreams.h"
@@ -22,8 +21,7 @@ int run(const SurveyOptions& options, MessageTally& tally) {
   const RecordOutput::Format format = options.format.format();
   RecordOutput(format, eventColumns(), printOut).begin();
   const auto setUp = [&](const std::string& technology, const SurveyUse::Print& print) {
-    survey::SurveySetUp result;
-    result.keepsSeries = false;
+    survey::SurveySetUp result = withoutSeries();
     result.events = 0;
     result.onEvent = [technology, output = RecordOutput(format, eventColumns(), print)](
                          const survey::Event& event) mutable {
@@ -38,11 +36,7 @@ int run(const SurveyOptions& options, MessageTally& tally) {
 }  // namespace
 
 Action declareEvents(OptionSet verb) {
-  const auto options = std::make_shared<SurveyOptions>();
-  options->addTo(verb);
-  options->addJobsTo(verb);
-  verb.setFooter(footer);
-  return [options](MessageTally& tally) { return run(*options, tally); };
+  return declareSurvey(verb, footer, run);
 }
 
 }  // namespace kelvasi

@@ -38,10 +38,25 @@ Option SurveyOptions::addJobsTo(OptionSet verb) {
   return InputOptions::addJobsTo(verb, "so many captures side by side; the output stays in their order");
 }
 
+survey::SurveySetUp withoutSeries() {
+  survey::SurveySetUp result;
+  result.keepsSeries = false;
+  return result;
+}
+
 int runSurvey(const SurveyOptions& options, const SurveyUse& use) {
   if (!options.isLive) return surveyCaptures(options, use);
   LiveSurvey(options.live, use).run();
   return exitSuccess;
+}
+
+Action declareSurvey(OptionSet verb, const std::string& footer,
+                     int (*run)(const SurveyOptions& options, MessageTally& tally)) {
+  const auto options = std::make_shared<SurveyOptions>();
+  options->addTo(verb);
+  options->addJobsTo(verb);
+  verb.setFooter(footer);
+  return [options, run](MessageTally& tally) { return run(*options, tally); };
 }
 
 }  // namespace kelvasi
