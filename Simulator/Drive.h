@@ -28,6 +28,7 @@ class Drive : public Scenario {
   }
   void greet(Messages& messages) override { feed_.all(now_, world_, messages); }
 
+  TrueCells truth() const override { return world_.truth(); }
   const World& world() const { return world_; }
 
  protected:

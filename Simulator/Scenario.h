@@ -9,6 +9,7 @@
 #include "Platform/PlistSerialiser.h"
 #include "Simulator/Message.h"
 #include "Simulator/MessageSource.h"
+#include "Simulator/Radio/TrueCell.h"
 
 namespace kelvasi::sim {
 
@@ -21,6 +22,8 @@ class Scenario {
   virtual void step(Messages& messages) = 0;
   // Appends one message of every kind that describes the present state.
   virtual void greet(Messages& messages) = 0;
+  // The cells of the world as they are now; none where the scenario has no world of radio.
+  virtual TrueCells truth() const { return {}; }
 };
 
 // Lets `time` pass, in whole steps, without a word of it.

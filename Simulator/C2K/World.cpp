@@ -116,6 +116,20 @@ double World::evdoTransmitPower() const {
   return std::clamp(turnaround - receivedPower(0) + data, leastPower, mostPower);
 }
 
+TrueCells World::truth() const {
+  TrueCells cells;
+  const auto& active = oneX_.pilots().active();
+  for (std::size_t place = 0; place < cells_.size(); ++place) {
+    cells.push_back({.identity = {RadioFamily::cdma, oneXChannel, cells_[place].code},
+                     .isServing = !active.empty() && active.front() == place,
+                     .now = {.level = {}, .quality = oneXRatios_[place]}});
+    cells.push_back({.identity = {RadioFamily::evdo, evdoChannel, cells_[place].code},
+                     .isServing = evdo_.serving() == place,
+                     .now = {.level = {}, .quality = evdoRatios_[place]}});
+  }
+  return cells;
+}
+
 World::Situation World::situation() const {
   return {.oneXState = oneX_.state(),
           .oneXActive = oneX_.pilots().active(),

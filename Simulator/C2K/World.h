@@ -14,6 +14,7 @@
 #include "Simulator/C2K/User.h"
 #include "Simulator/Radio/RadioModel.h"
 #include "Simulator/Radio/Route.h"
+#include "Simulator/Radio/TrueCell.h"
 
 namespace kelvasi::sim::c2k {
 
@@ -60,6 +61,8 @@ class World {
   double evdoTransmitPower() const;
   Point position() const { return route_.position(); }
   Situation situation() const;
+  // Each pilot twice, on either air interface's channel.
+  TrueCells truth() const;
 
  private:
   void measure();

@@ -140,6 +140,15 @@ std::vector<std::size_t> World::strongest(Technology technology) const {
   return places;
 }
 
+TrueCells World::truth() const {
+  TrueCells cells;
+  for (std::size_t place = 0; place < cells_.size(); ++place)
+    cells.push_back({.identity = identityOf(cells_[place]),
+                     .isServing = serving() == place,
+                     .now = levelsOf(reception(place))});
+  return cells;
+}
+
 double World::transmitPower() const {
   const double level = serving() ? reception(*serving()).level : 0;
   return std::clamp(pilotPower - level + uplinkInterference + requiredRatio, leastPower, mostPower);

@@ -13,6 +13,7 @@
 #include "Simulator/Handset/Traffic.h"
 #include "Simulator/Radio/RadioModel.h"
 #include "Simulator/Radio/Route.h"
+#include "Simulator/Radio/TrueCell.h"
 
 namespace kelvasi::sim::gsm {
 
@@ -65,6 +66,7 @@ class World {
   double transmitPower() const;
   Point position() const { return route_.position(); }
   Situation situation() const;
+  TrueCells truth() const;
 
  private:
   bool isInSoftHandover() const;

@@ -133,6 +133,16 @@ void World::keepOneNeighbour() {
   std::erase(detected_, *strongest);
 }
 
+TrueCells World::truth() const {
+  TrueCells cells;
+  for (std::size_t place = 0; place < cells_.size(); ++place)
+    cells.push_back({.identity = identityOf(cells_[place]),
+                     .isServing = serving_ == place,
+                     .now = levelsOf(reception(place)),
+                     .average = levelsOf(average(place))});
+  return cells;
+}
+
 double World::rssi(std::size_t place) const {
   const Reception& heard = reception(place);
   return heard.level - heard.ecNo + 10 * std::log10(layerOf(cell(place)).resourceBlocks);

@@ -9,6 +9,7 @@
 #include "Simulator/LTE/Reselection.h"
 #include "Simulator/Radio/RadioModel.h"
 #include "Simulator/Radio/Route.h"
+#include "Simulator/Radio/TrueCell.h"
 
 namespace kelvasi::sim::lte {
 
@@ -75,6 +76,7 @@ class World {
   double speedTowards(Point site) const { return route_.speedTowards(site); }
   double seconds() const { return seconds_; }
   Situation situation() const { return {serving_, candidate(), attachment_.phase(), measurementRules_}; }
+  TrueCells truth() const;
 
  private:
   void averageReceptions(double seconds);

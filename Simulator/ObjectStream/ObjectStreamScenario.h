@@ -18,6 +18,7 @@ class ObjectStreamScenario : public Scenario {
   void step(Messages& messages) override;
   void greet(Messages& messages) override;
 
+  TrueCells truth() const override { return world_.truth(); }
   const gsm::World& world() const { return world_; }
 
  private:

@@ -89,10 +89,11 @@ void declareOptions(CommandLine& commandLine, SimulatorOptions& options) {
       .type("X")
       .transform(readSpeed)
       .between(0, 1e6, "from 0 to 1000000");
-  app.add("--rate", options.rate, "synthetic load: repeat the scenario's messages, N a second")
-      .type("N")
-      .between(1e-3, 1e9, "from 0.001 to 1000000000")
-      .excludes(replay);
+  const Option rate =
+      app.add("--rate", options.rate, "synthetic load: repeat the scenario's messages, N a second")
+          .type("N")
+          .between(1e-3, 1e9, "from 0.001 to 1000000000")
+          .excludes(replay);
   app.add("--seed", options.seed, "the same seed gives the same messages").type("N").showsDefault();
   app.addReader<double>(
          "--start-at",
@@ -114,11 +115,18 @@ void declareOptions(CommandLine& commandLine, SimulatorOptions& options) {
          },
          "misbehave; see below")
       .type("FAULT");
+  const Option worldLog =
+      app.add("--world-log", options.worldLog,
+              "write the world's cells at every step into a new file, JSON lines: which serve, their levels")
+          .type("FILE")
+          .excludes(replay)
+          .excludes(rate);
   Option write =
       app.add("--write", options.write,
               "write what a stream from the start brings into a pcap file, without waiting, and end")
           .type("FILE")
           .excludes(replay)
+          .excludes(worldLog)
           .excludes(seconds);
   const Option messages = app.add("--messages", options.messages, "how many messages go into the file")
                               .type("N")

@@ -18,6 +18,7 @@ struct SimulatorOptions {
   std::string technology;      // full id
   std::string scenario;        // empty for the technology's usual one
   std::string replay;          // a capture's path; empty for a scenario
+  std::string worldLog;        // the path of the world's log; empty for none
   std::string write;           // the path of a capture to be written instead of serving; empty for none
   bool isForced = false;       // the written capture may take the place of a file
   std::uint64_t messages = 0;  // of the written capture

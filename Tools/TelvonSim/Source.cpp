@@ -14,14 +14,17 @@ namespace {
 
 constexpr int wrongUsage = 2;
 
+using Tell = sim::ToldScenario::Tell;
+
 std::unique_ptr<sim::Scenario> begun(const sim::ScenarioKind& kind, const SimulatorOptions& options,
-                                     const PlistSerialiser& plists) {
+                                     const PlistSerialiser& plists, const Tell& tell = {}) {
   auto scenario = kind.make(options.seed, plists);
   sim::skip(*scenario, options.startAt);
-  return scenario;
+  if (!tell) return scenario;
+  return std::make_unique<sim::ToldScenario>(std::move(scenario), tell);
 }
 
-SourceResult scenarioSource(const SimulatorOptions& options, const PlistSerialiser& plists) {
+SourceResult scenarioSource(const SimulatorOptions& options, const PlistSerialiser& plists, Tell tell) {
   const sim::ScenarioKind* kind = sim::findScenario(options.technology, options.scenario);
   if (!kind) {
     const std::string wanted =
@@ -33,8 +36,9 @@ SourceResult scenarioSource(const SimulatorOptions& options, const PlistSerialis
   }
   if (options.rate > 0)
     return {.source = std::make_unique<sim::LoadSource>(begun(*kind, options, plists), options.rate)};
-  return {.source = std::make_unique<sim::ScenarioSource>(
-              [kind, options, &plists] { return begun(*kind, options, plists); })};
+  return {.source = std::make_unique<sim::ScenarioSource>([kind, options, &plists, tell = std::move(tell)] {
+            return begun(*kind, options, plists, tell);
+          })};
 }
 
 void tellFaults(const CaptureReader& capture) {
@@ -52,9 +56,9 @@ SourceResult replaySource(const SimulatorOptions& options, const PlistSerialiser
 
 }  // namespace
 
-SourceResult makeSource(const SimulatorOptions& options, const PlistSerialiser& plists) {
+SourceResult makeSource(const SimulatorOptions& options, const PlistSerialiser& plists, Tell tell) {
   if (!options.replay.empty()) return replaySource(options, plists);
-  return scenarioSource(options, plists);
+  return scenarioSource(options, plists, std::move(tell));
 }
 
 }  // namespace kelvasi

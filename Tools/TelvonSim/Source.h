@@ -7,6 +7,7 @@
 
 #include "Platform/PlistSerialiser.h"
 #include "Simulator/MessageSource.h"
+#include "Simulator/ToldScenario.h"
 #include "Tools/TelvonSim/Options.h"
 
 namespace kelvasi {
@@ -18,6 +19,8 @@ struct SourceResult {
 };
 
 // `plists` outlives the source.
-SourceResult makeSource(const SimulatorOptions& options, const PlistSerialiser& plists);
+// `tell`, where there is one, gets the world's cells after each step of a scenario.
+SourceResult makeSource(const SimulatorOptions& options, const PlistSerialiser& plists,
+                        sim::ToldScenario::Tell tell = {});
 
 }  // namespace kelvasi

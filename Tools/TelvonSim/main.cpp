@@ -18,6 +18,7 @@
 #include "Tools/CommandLine.h"
 #include "Tools/TelvonSim/Options.h"
 #include "Tools/TelvonSim/Source.h"
+#include "Tools/TelvonSim/WorldLog.h"
 #include "Tools/TelvonSim/WrittenDrive.h"
 
 namespace kelvasi {
@@ -60,7 +61,15 @@ int serve(const SimulatorOptions& options) {
   QtMessagePorts ports(peerLog);
   QtDaemonServerHost host(peerLog);
 
-  SourceResult made = makeSource(options, plists);
+  std::optional<WorldLog> world;
+  if (!options.worldLog.empty()) world.emplace(options.worldLog, clock);
+  if (world && world->error()) {
+    complain(*world->error());
+    return 1;
+  }
+  sim::ToldScenario::Tell tell;
+  if (world) tell = [&world](const sim::TrueCells& cells) { world->tell(cells); };
+  SourceResult made = makeSource(options, plists, std::move(tell));
   if (!made.source) {
     complain(made.failure);
     return made.exitStatus;
