@@ -73,10 +73,76 @@ class Cockpit(ViewerTest):
         self.assertEqual((state["rows"], state["cockpit"]["place"]), ([], "none"))
         self.assertFalse(state["cockpit"]["serving"].get("known", False))
 
+    def test_search_opens_the_pane_at_the_row(self):
+        viewer = self.start_sized()
+        self.await_serving(viewer)
+        self.await_row(viewer, "Connected mode LTE Intra-frequency Measurement", "Serving Filtered RSRP")
+        viewer.do("press /", "type serving filtered rsrp")
+        self.assertRegex(viewer.state()["cockpit"]["texts"][1], r"^Serving Filtered RSRP, -\d+\.\d\d dBm, ")
+        viewer.do("press Return")
+        state = viewer.state()
+        self.assertEqual(state["title"], "Connected mode LTE Intra-frequency Measurement")
+        self.assertEqual(state["cockpit"]["place"], "none")
+        viewer.do("press *")  # goes to the row at which the keyboard is
+        self.assertEqual([pin["name"] for pin in viewer.state()["cockpit"]["pins"]], ["Serving Filtered RSRP"])
+
+    def test_search_says_where_there_is_no_such_row(self):
+        viewer = self.start_sized()
+        self.await_serving(viewer)
+        viewer.do("press /", "type no such thing")
+        self.assertEqual(viewer.state()["cockpit"]["texts"], ["No row with this name or value"])
+
+    def test_a_pin_stands_on_top_is_remembered_and_goes(self):
+        viewer = self.start_sized()
+        self.await_serving(viewer)
+        self.await_row(viewer, "Serving Cell Info", "Cell Identity")
+        viewer.do("open Serving Cell Info", "press Home", "press Space")
+        state = viewer.state()["cockpit"]
+        self.assertEqual((state["place"], state["texts"][0].split(",")[0]), ("full", "Value"))
+        self.choose(viewer, "Pin to the cockpit")
+        viewer.do("press Escape")
+        texts = viewer.state()["cockpit"]["texts"]
+        [pin] = viewer.state()["cockpit"]["pins"]
+        self.assertLess(texts.index("Pins"), texts.index("Cells, dBm"))
+        self.assertTrue(any(text.startswith(pin["name"] + ", ") for text in texts), texts)
+        self.assertEqual(viewer.close(), 0)
+
+        again = self.start_viewer("--memory", self.path("window.ini"))
+        self.await_serving(again)
+        self.assertEqual([kept["name"] for kept in again.state()["cockpit"]["pins"]], [pin["name"]])
+        self.await_row(again, "Serving Cell Info", "Cell Identity")
+        again.do("open Serving Cell Info", "press Home", "press *")
+        self.assertEqual(again.state()["cockpit"]["pins"], [])
+
+    def await_row(self, viewer, pane, name):
+        """Panes get what has come with the next update only; what is searched and pinned may be ahead of them."""
+        viewer.do("root", f"open {pane}")
+        viewer.await_state(lambda state: any(row[0] == name for row in state["rows"]))
+        viewer.do("root")
+
+    def choose(self, viewer, text):
+        """Goes to a line of the page that can be opened, by keyboard, and opens it."""
+        for _ in range(60):
+            viewer.do("press Down")
+            if viewer.state()["cockpit"]["selected"] == text:
+                return viewer.do("press Return")
+        return self.fail(f"there is no {text!r}")
+
+    def test_coverage_says_what_came_in_and_was_not_shown(self):
+        viewer = self.start_sized()
+        self.await_serving(viewer)
+        viewer.do("press C")
+        state = viewer.state()["cockpit"]
+        self.assertEqual(state["page"], "Coverage")
+        self.assertRegex(state["texts"][0], r"^[\d,]+ messages, (every one shown|.* not shown)$")
+        viewer.do("press Escape")
+        self.choose(viewer, viewer.state()["cockpit"]["link"]["counters"])
+        self.assertEqual(viewer.state()["cockpit"]["page"], "Coverage")
+
     def test_keys_events_and_marks_have_pages(self):
         viewer = self.start_sized()
         self.await_serving(viewer)
-        for keys, page in (("?", "Keys"), ("E", "Events"), ("M", "Marked")):
+        for keys, page in (("?", "Keys"), ("E", "Events"), ("M", "Marked"), ("C", "Coverage"), ("A", "Alarms")):
             viewer.do(f"press {keys}")
             self.assertEqual(viewer.state()["cockpit"]["page"], page)
             viewer.do("press Escape", "press Escape")

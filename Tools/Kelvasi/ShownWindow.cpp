@@ -96,6 +96,8 @@ QJsonValue cockpitState() {
   const CockpitPage* const page = front->shownPage();
   state.insert("place", front->placeName());
   state.insert("page", page ? QJsonValue(page->title()) : QJsonValue::Null);
+  state.insert("banner", front->bannerWords());
+  state.insert("selected", page ? page->selectedText() : QString());
   state.insert("texts", page ? QJsonArray::fromStringList(page->texts()) : QJsonArray());
   return state;
 }

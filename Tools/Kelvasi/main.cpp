@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasi: wires the viewer to its surroundings.
+#include <QApplication>
 #include <QCoreApplication>
 #include <cstdio>
 #include <cstdlib>
@@ -19,6 +20,7 @@
 #include "Platform/Qt/QtMessagePorts.h"
 #include "Platform/Qt/QtTelephonyDaemon.h"
 #include "Platform/QtDesktop/DesktopActivation.h"
+#include "Platform/QtDesktop/DesktopAttention.h"
 #include "Platform/QtDesktop/QtDateFormatters.h"
 #include "Platform/QtDesktop/QtPreferences.h"
 #include "Platform/QtWidgets/QtApplicationFramework.h"
@@ -58,6 +60,7 @@ bool run(QtApplicationFramework& framework, const ViewerOptions& options) {
   QtPreferences preferences;
   const QtDateFormatters dateFormatters;
   PosixFiles files;
+  DesktopAttention attention(&QApplication::beep);
   const AppPlatform platform{.core = {*log, trace, plists, resources, clock},
                              .link = {queue, ports, daemon},
                              .shell = {ui, preferences, dateFormatters, files},
@@ -90,7 +93,7 @@ bool run(QtApplicationFramework& framework, const ViewerOptions& options) {
       if (ui.window()) ui.window()->bringToFront();
     });
   queue.post([&] {  // when the window is there
-    front = new CockpitFront(*ui.window(), *application, clock);
+    front = new CockpitFront(*ui.window(), *application, {.clock = clock, .attention = attention});
     front->cockpit().restorePins(memory.pins);
     for (const std::string& rule : memory.alarms) front->cockpit().addAlarm(rule);
     noticeMissingTemplates(resources, ui);

@@ -28,6 +28,7 @@ class BlockView : public QAbstractScrollArea {
   // Goes to the next block with an action, or to the one before it. False at the end.
   bool select(bool next);
   std::optional<std::size_t> selected() const { return selected_; }
+  QString selectedText() const { return selected_ ? blocks_[*selected_].spoken : QString(); }
 
  protected:
   bool viewportEvent(QEvent* event) override;

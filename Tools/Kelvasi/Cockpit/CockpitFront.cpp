@@ -12,6 +12,7 @@
 #include "Platform/QtWidgets/StackWidget.h"
 #include "Platform/QtWidgets/TableWidget.h"
 #include "Platform/QtWidgets/TopWidget.h"
+#include "Tools/Kelvasi/Cockpit/AlarmBanner.h"
 #include "Tools/Kelvasi/Cockpit/CockpitCard.h"
 #include "Tools/Kelvasi/Cockpit/CockpitPane.h"
 #include "Tools/OperatorFile.h"
@@ -23,6 +24,7 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr auto tickTime = 1s;
+constexpr auto callPause = 2s;  // between two sounds
 constexpr int wide = 900;       // points, from which panes and cockpit stand beside each other
 constexpr int sideways = 560;   // the same, where the window is wider than high
 constexpr int paneWidth = 390;  // of the panes in a wide window
@@ -47,16 +49,6 @@ class CockpitLayer : public Layer {
   QWidget& content_;
 };
 
-cockpit::CockpitSetUp setUp(const Clock& clock) {
-  cockpit::CockpitSetUp setUp;
-  setUp.style.minus = "\u2212";
-  setUp.style.eastOfUtc = [&clock](Arrival at) {
-    return std::chrono::seconds(clock.localZone({std::chrono::duration<double>(at).count()}).secondsFromGmt);
-  };
-  setUp.operators = loadOperators().operators;
-  return setUp;
-}
-
 StackWidget& stackOf(const QWidget& window) {
   for (QWidget* const child : window.findChildren<QWidget*>())
     if (auto* const stack = dynamic_cast<StackWidget*>(child)) return *stack;
@@ -72,16 +64,18 @@ bool isCovered(const QWidget& window, const QWidget* except) {
 
 }  // namespace
 
-CockpitFront::CockpitFront(TopWidget& window, KelvasiApp& app, const Clock& clock)
+CockpitFront::CockpitFront(TopWidget& window, KelvasiApp& app, const Surroundings& surroundings)
     : QObject(&window),
       window_(window),
       app_(app),
-      clock_(clock),
-      cockpit_(std::make_unique<cockpit::Cockpit>(setUp(clock))),
+      clock_(surroundings.clock),
+      attention_(surroundings.attention),
+      cockpit_(std::make_unique<cockpit::Cockpit>(setUp())),
       pages_(std::make_unique<CockpitPages>(*cockpit_, *this)),
       card_(new CockpitCard([this] { return snapshot(); }, [this] { open(); })),
       pane_(new CockpitPane([this] { close(); })),
-      side_(new CockpitPane({})) {
+      side_(new CockpitPane({})),
+      banner_(new AlarmBanner(window, [this] { pages_->openAlarms(pageHolder()); })) {
   pane_->setParent(&window);
   pane_->hide();
   pane_->setRoot(pages_->face(*pane_));
@@ -100,6 +94,29 @@ CockpitFront::CockpitFront(TopWidget& window, KelvasiApp& app, const Clock& cloc
 }
 
 CockpitFront::~CockpitFront() = default;
+
+cockpit::CockpitSetUp CockpitFront::setUp() {
+  cockpit::CockpitSetUp setUp;
+  setUp.style.minus = "\u2212";
+  setUp.style.eastOfUtc = [this](Arrival at) {
+    return std::chrono::seconds(clock_.localZone({std::chrono::duration<double>(at).count()}).secondsFromGmt);
+  };
+  setUp.operators = loadOperators().operators;
+  setUp.onAlarm = [this](const cockpit::AlarmLine& line) { alarm(line); };
+  return setUp;
+}
+
+// Alarms may come thick and fast; sounds do not.
+void CockpitFront::alarm(const cockpit::AlarmLine& line) {
+  banner_->say(line.words);
+  if (line.time - lastCall_ < callPause) return;
+  lastCall_ = line.time;
+  attention_.call(line.ruleText, "Alarm", line.words);
+}
+
+QString CockpitFront::bannerWords() const {
+  return banner_->isVisible() ? banner_->words() : QString();
+}
 
 Arrival CockpitFront::now() const {
   return arrivalAt(clock_.now());

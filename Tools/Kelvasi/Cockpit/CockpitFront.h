@@ -15,11 +15,13 @@
 
 #include "App/KelvasiApp.h"
 #include "Cockpit/Cockpit.h"
+#include "Platform/Attention.h"
 #include "Platform/Clock.h"
 #include "Tools/Kelvasi/Cockpit/CockpitPages.h"
 
 namespace kelvasi {
 
+class AlarmBanner;
 class CockpitCard;
 class CockpitPane;
 class Layer;
@@ -28,7 +30,11 @@ class TopWidget;
 // A child of the window, which it outlives in nothing.
 class CockpitFront : public QObject, public CockpitPages::Host {
  public:
-  CockpitFront(TopWidget& window, KelvasiApp& app, const Clock& clock);
+  struct Surroundings {
+    const Clock& clock;
+    Attention& attention;
+  };
+  CockpitFront(TopWidget& window, KelvasiApp& app, const Surroundings& surroundings);
   ~CockpitFront() override;
 
   cockpit::Cockpit& cockpit() { return *cockpit_; }
@@ -37,6 +43,8 @@ class CockpitFront : public QObject, public CockpitPages::Host {
   // The page on top; null where only the card or nothing is shown.
   const CockpitPage* shownPage() const;
   cockpit::Snapshot snapshot() { return cockpit_->at(now()); }
+  // What the banner says now; empty while there is none.
+  QString bannerWords() const;
 
  protected:
   bool eventFilter(QObject* watched, QEvent* event) override;
@@ -45,7 +53,9 @@ class CockpitFront : public QObject, public CockpitPages::Host {
   Arrival now() const override;
   void openPane(const std::string& nodePath) override;
 
+  cockpit::CockpitSetUp setUp();
   void tick();
+  void alarm(const cockpit::AlarmLine& line);
   void tellLink();
   void refresh();
   void arrange();
@@ -61,11 +71,14 @@ class CockpitFront : public QObject, public CockpitPages::Host {
   TopWidget& window_;
   KelvasiApp& app_;
   const Clock& clock_;
+  Attention& attention_;
   std::unique_ptr<cockpit::Cockpit> cockpit_;
   std::unique_ptr<CockpitPages> pages_;
   CockpitCard* card_;  // children of the window
   CockpitPane* pane_;
   CockpitPane* side_;  // the chart beside the cockpit
+  AlarmBanner* banner_;
+  Arrival lastCall_{0};
   QPointer<Layer> layer_;
   std::string technologyOfPanes_;
   QTimer timer_;

@@ -20,6 +20,8 @@ class CockpitPage : public QWidget {
   virtual bool takeKey(const QKeyEvent& /*event*/) { return false; }
   // What the page says, a line each.
   virtual QStringList texts() const { return {}; }
+  // What it says at the keyboard; empty where the keyboard is at none of it.
+  virtual QString selectedText() const { return {}; }
 
  private:
   QString title_;
@@ -31,6 +33,7 @@ class BlockPage : public CockpitPage {
   void refresh() override { view_->refresh(); }
   QWidget& firstFocus() override { return *view_; }
   QStringList texts() const override;
+  QString selectedText() const override { return view_->selectedText(); }
   BlockView& view() { return *view_; }
 
  private:
@@ -45,6 +48,7 @@ class SearchPage : public CockpitPage {
   void refresh() override { view_->refresh(); }
   QWidget& firstFocus() override { return *field_; }
   QStringList texts() const override;
+  QString selectedText() const override { return view_->selectedText(); }
   QLineEdit& field() { return *field_; }
 
  protected:
