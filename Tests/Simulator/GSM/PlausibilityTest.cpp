@@ -12,7 +12,7 @@
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/DisplayTexts.h"
 #include "Tests/Simulator/HandsetWatch.h"
-#include "Tests/Simulator/PlayedScenario.h"
+#include "Tests/Simulator/LongDrive.h"
 
 namespace kelvasi::sim::gsm {
 namespace {
@@ -23,9 +23,8 @@ using testing::Ge;
 using testing::Le;
 using testing::UnorderedElementsAreArray;
 
-constexpr int manySteps = 9000;  // half an hour
+constexpr int manySteps = test::stepsOfHalfAnHour;
 constexpr int stepsOfTwoMinutes = 600;
-constexpr std::array<std::uint64_t, 4> seeds{1, 7, 42, 2024};
 
 constexpr std::array sections{
     test::SectionOfTemplate{"GSM Serving Cell"},
@@ -38,33 +37,11 @@ constexpr std::array sections{
     test::SectionOfTemplate{"GSM Set", true},
 };
 
-class GsmPlausibility : public testing::TestWithParam<std::uint64_t> {
- protected:
-  template <typename Look>
-  void play(Look look) {
-    test::play(scenario, manySteps, [&](const Messages& messages) {
-      viewer.take(messages);
-      look(messages);
-    });
-  }
-  // The same drive, without a word of it.
-  template <typename Look>
-  void pass(Look look) {
-    for (int step = 0; step < manySteps && !HasFailure(); ++step) {
-      untold.pass(0.2);
-      SCOPED_TRACE("step " + std::to_string(step));
-      look(untold);
-    }
-  }
-  const World& world() const { return scenario.world(); }
-
-  LibplistSerialiser plists;
-  DriveScenario scenario{GetParam(), plists};
-  World untold{Random(GetParam())};
-  DecodingViewer viewer{kTelvonLogChannelTechnology_Orvane_GSM, "Orvane_GSM", sections};
+struct GsmPlausibility : test::LongDrive<DriveScenario, World> {
+  GsmPlausibility() : LongDrive(kTelvonLogChannelTechnology_Orvane_GSM, "Orvane_GSM", sections) {}
 };
 
-INSTANTIATE_TEST_SUITE_P(Seeds, GsmPlausibility, testing::ValuesIn(seeds));
+INSTANTIATE_TEST_SUITE_P(Seeds, GsmPlausibility, testing::ValuesIn(test::plausibleSeeds));
 
 TEST_P(GsmPlausibility, BothTechnologiesServeSoonAndLong) {
   int step = 0;

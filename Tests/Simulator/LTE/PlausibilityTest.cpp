@@ -12,15 +12,13 @@
 #include "Simulator/Radio/Town.h"
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/DisplayTexts.h"
-#include "Tests/Simulator/PlayedScenario.h"
+#include "Tests/Simulator/LongDrive.h"
 
 namespace kelvasi::sim::lte {
 namespace {
 
 using test::DecodingViewer;
 using test::has;
-
-constexpr int manySteps = 9000;  // half an hour
 
 constexpr std::array sections{
     test::SectionOfTemplate{"Serving Cell Info"},
@@ -32,32 +30,11 @@ constexpr std::array sections{
     test::SectionOfTemplate{"SIM Info"},
 };
 
-class LtePlausibility : public testing::TestWithParam<std::uint64_t> {
- protected:
-  template <typename Look>
-  void play(Look look) {
-    test::play(scenario, manySteps, [&](const Messages& messages) {
-      viewer.take(messages);
-      look(messages);
-    });
-  }
-  // The same drive, without a word of it.
-  template <typename Look>
-  void pass(Look look) {
-    for (int step = 0; step < manySteps && !HasFailure(); ++step) {
-      untold.pass(0.2);
-      SCOPED_TRACE("step " + std::to_string(step));
-      look(untold);
-    }
-  }
-  const World& world() const { return scenario.world(); }
-  LibplistSerialiser plists;
-  DriveScenario scenario{GetParam(), plists};
-  World untold{Random(GetParam())};
-  DecodingViewer viewer{kTelvonLogChannelTechnology_Orvane_LTE, "LTE", sections};
+struct LtePlausibility : test::LongDrive<DriveScenario, World> {
+  LtePlausibility() : LongDrive(kTelvonLogChannelTechnology_Orvane_LTE, "LTE", sections) {}
 };
 
-INSTANTIATE_TEST_SUITE_P(Seeds, LtePlausibility, testing::Values(1, 7, 42, 2024));
+INSTANTIATE_TEST_SUITE_P(Seeds, LtePlausibility, testing::ValuesIn(test::plausibleSeeds));
 
 bool isSuitableNow(const World& world, std::size_t place) {
   return isSuitable(world.cell(place), world.average(place));

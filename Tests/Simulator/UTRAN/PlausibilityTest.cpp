@@ -14,7 +14,7 @@
 #include "Telvon/Technology.h"
 #include "Tests/Simulator/DisplayTexts.h"
 #include "Tests/Simulator/HandsetWatch.h"
-#include "Tests/Simulator/PlayedScenario.h"
+#include "Tests/Simulator/LongDrive.h"
 
 namespace kelvasi::sim::utran {
 namespace {
@@ -22,8 +22,7 @@ namespace {
 using gsm::World;
 using test::DecodingViewer;
 
-constexpr int manySteps = 9000;  // half an hour
-constexpr std::array<std::uint64_t, 4> seeds{1, 7, 42, 2024};
+constexpr int manySteps = test::stepsOfHalfAnHour;
 
 constexpr std::array sections{
     test::SectionOfTemplate{"RRC Info"},
@@ -34,33 +33,12 @@ constexpr std::array sections{
     test::SectionOfTemplate{"CCTRCH SIR", true},
 };
 
-class UtranPlausibility : public testing::TestWithParam<std::uint64_t> {
- protected:
-  template <typename Look>
-  void play(Look look) {
-    test::play(scenario, manySteps, [&](const Messages& messages) {
-      viewer.take(messages);
-      look(messages);
-    });
-  }
-  // The same drive, without a word of it.
-  template <typename Look>
-  void pass(Look look) {
-    for (int step = 0; step < manySteps && !HasFailure(); ++step) {
-      untold.pass(0.2);
-      SCOPED_TRACE("step " + std::to_string(step));
-      look(untold);
-    }
-  }
-  const World& world() const { return scenario.world(); }
-
-  LibplistSerialiser plists;
-  DriveScenario scenario{GetParam(), plists};
-  World untold{Random(GetParam()), layOutCells};
-  DecodingViewer viewer{kTelvonLogChannelTechnology_Orvane_UTRAN2, "UTRAN", sections};
+struct UtranPlausibility : test::LongDrive<DriveScenario, World> {
+  UtranPlausibility()
+      : LongDrive(kTelvonLogChannelTechnology_Orvane_UTRAN2, "UTRAN", sections, layOutCells) {}
 };
 
-INSTANTIATE_TEST_SUITE_P(Seeds, UtranPlausibility, testing::ValuesIn(seeds));
+INSTANTIATE_TEST_SUITE_P(Seeds, UtranPlausibility, testing::ValuesIn(test::plausibleSeeds));
 
 TEST_P(UtranPlausibility, ConnectionsAreSetUpAndReleased) {
   gsm::TransitionWatch watch;
