@@ -20,6 +20,9 @@ class Versions(unittest.TestCase):
         text = (SOURCES / "CHANGELOG.md").read_text()
         self.assertEqual(re.findall(r"^## (\d+\.\d+\.\d+), \d{4}-\d\d-\d\d$", text, re.MULTILINE)[0], VERSION)
 
+    def test_it_is_the_newest_of_the_package(self):
+        self.assertEqual(re.match(r"kelvasi \(([\d.]+)-\d", (SOURCES / "debian/changelog").read_text())[1], VERSION)
+
     def test_it_is_the_newest_in_the_metadata(self):
         root = xml.parse(SOURCES / "Resources/org.kelvasi.Kelvasi.metainfo.xml").getroot()
         self.assertEqual(root.find("releases/release").get("version"), VERSION)
