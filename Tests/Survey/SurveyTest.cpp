@@ -74,7 +74,8 @@ TEST(Survey, AnAlarmLooksAtNoNeighbourWhoseCellIsNotKnown) {
   const ReadingSection others{.name = "Others", .path = "/Others", .role = CellRole::neighbour};
   const Row row{.key = "RSRP", .quantity = quantity::rsrp};
   Surveyed drive("rsrp < -99");
-  Readings readings = served(0s, here, -90);
+  const Message message = served(0s, here, -90);
+  Readings readings = message;
   readings.add({.section = &others, .row = &row, .raw = -120, .key = row.key});
   drive.take(readings);
   EXPECT_EQ(drive.alarms, std::vector<std::string>{});

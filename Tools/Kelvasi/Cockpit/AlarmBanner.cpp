@@ -24,6 +24,7 @@ constexpr double besideShape = 28;  // points before the words
 
 AlarmBanner::AlarmBanner(QWidget& window, std::function<void()> open)
     : QWidget(&window), open_(std::move(open)) {
+  setAttribute(Qt::WA_DeleteOnClose);  // goes with the window
   hide();
   setCursor(Qt::PointingHandCursor);
   window.installEventFilter(this);
