@@ -21,10 +21,23 @@ Outcome ListDecoder::decodeOther(RecordView, LogCode logCode) {
 }
 
 void ListDecoder::describe(RowCatalog& catalog) const {
-  if (!section_.staysEmpty)
-    catalog.add(section_.name, {section_.logCode, section_.list.layout, section_.rows, "entry"});
-  for (const RecordPart& part : section_.others) catalog.add(section_.name, part);
+  catalog.add(section_.name, {.logCode = section_.logCode,
+                              .layout = section_.list.layout,
+                              .rows = section_.staysEmpty ? std::span<const Row>() : section_.rows,
+                              .of = "entry",
+                              .minimumLength = section_.minimumLength,
+                              .entries = &section_.list});
+  for (const RecordPart& part : section_.others) catalog.add(section_.name, whole(part));
   if (section_.cells) section_.cells->describe(section_.name, catalog);
+}
+
+// A part of the list's own record says no more than what it has of its own.
+RecordPart ListDecoder::whole(const RecordPart& part) const {
+  RecordPart whole = part;
+  if (part.logCode != section_.logCode) return whole;
+  whole.minimumLength = section_.minimumLength;
+  if (part.of == "entry" && !part.entries) whole.entries = &section_.list;
+  return whole;
 }
 
 CellIdentity ListDecoder::cellOf(RecordView record, std::size_t place) const {

@@ -62,6 +62,7 @@ class ListDecoder : public Base {
   Outcome showCells(RecordView record);
   // Where readings go; null when nothing is shown.
   Readings* listReadings() const { return sectionList() && !section_.staysEmpty ? readings() : nullptr; }
+  RecordPart whole(const RecordPart& part) const;
   void clearList();
   void startList();
 

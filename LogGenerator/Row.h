@@ -38,6 +38,7 @@ struct Scale {
   double offset = 0;
   const char* format = hundredths;
   double (*curve)(std::int64_t raw) = nullptr;
+  std::string_view formula = {};  // the curve in writing, for those who cannot call it; empty: raw itself
 
   constexpr double of(std::int64_t raw) const {
     return curve ? curve(raw) : static_cast<double>(raw) * factor + offset;

@@ -4,6 +4,7 @@
 namespace kelvasi {
 
 void RowCatalog::add(std::string_view section, const RecordPart& part) {
+  addPart(part);
   for (const Row& row : part.rows) {
     CatalogRow& added = rows_.emplace_back();
     added.section = section;
@@ -14,6 +15,7 @@ void RowCatalog::add(std::string_view section, const RecordPart& part) {
     added.digits = part.digits;
     added.of = part.of;
     added.list = part.list;
+    added.part = part;
   }
 }
 

@@ -61,13 +61,18 @@ Outcome StateDecoder::decodeOther(RecordView, LogCode logCode) {
 
 void StateDecoder::describe(RowCatalog& catalog) const {
   for (const RecordRows& record : section_.records) {
-    catalog.add(section_.name, {.logCode = record.logCode, .layout = record.layout, .rows = record.rows});
+    catalog.add(section_.name, {.logCode = record.logCode,
+                                .layout = record.layout,
+                                .rows = record.rows,
+                                .minimumLength = record.minimumLength});
     for (const ListColumn& column : record.lists)
       catalog.add(section_.name, {.logCode = record.logCode,
                                   .layout = column.list.layout,
                                   .rows = column.element ? std::span(column.element, 1) : column.rows,
                                   .of = "entry",
-                                  .list = column.key});
+                                  .list = column.key,
+                                  .minimumLength = record.minimumLength,
+                                  .entries = &column.list});
   }
   for (const RecordPart& part : section_.others) catalog.add(section_.name, part);
   if (section_.cells) section_.cells->describe(section_.name, catalog);

@@ -85,7 +85,11 @@ void C2KLogGenerator::describe(RowCatalog& catalog) const {
   if (!lookup.dictionary()) return;
   for (const C2KRecord& record : c2kRecords()) {
     RowCatalog byName;
-    for (const RecordPart& part : record.parts()) byName.add({}, part);
+    for (RecordPart part : record.parts()) {
+      part.minimumLength = record.minimumLength;
+      byName.add({}, part);
+      catalog.addPart(part);
+    }
     for (const CatalogRow& row : byName.rows()) {
       forEachLeaf(row.row->key, *lookup.dictionary(),
                   [&](const PlistDictionary& display, const std::string& key) {

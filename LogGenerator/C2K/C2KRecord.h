@@ -16,6 +16,7 @@ struct RecordPart;
 
 struct C2KRecord {
   LogCode logCode;
+  std::size_t minimumLength;  // of a whole record
   // Checks the record's length, and on a failure logs it and leaves every row as it was.
   Outcome (*parse)(const C2KUpdate& update);
   // What it shows; the keys of the rows are lookup names.

@@ -20,8 +20,9 @@ double receivePower(std::int64_t raw) {
 double transmitPower(std::int64_t raw) {
   return static_cast<double>(raw) / 10;
 }
-constexpr Scale receiveScale{.format = "%+.2f", .curve = receivePower};
-constexpr Scale transmitScale{.format = "%+.2f", .curve = transmitPower};
+constexpr Scale receiveScale{
+    .format = "%+.2f", .curve = receivePower, .formula = "raw * 334 / 1000 - 63.248"};
+constexpr Scale transmitScale{.format = "%+.2f", .curve = transmitPower, .formula = "raw / 10"};
 
 constexpr std::array stateRows{
     Row{.key = "k1xDeviceState",
@@ -92,6 +93,9 @@ std::span<const RecordPart> deviceStatus::parts() {
       RecordPart{logCode, radioLayout, trafficRows, "sub-packet 2"},
       RecordPart{.logCode = logCode, .rows = std::span(activeSet1xRows).first(1), .list = "pilots"},
       RecordPart{.logCode = logCode, .rows = std::span(&trafficFER::oldRateRow, 1)},
+      RecordPart{logCode, subPackets::layout},
+      RecordPart{.logCode = logCode, .layout = activeSetLayout, .of = "sub-packet 3"},
+      RecordPart{.logCode = logCode, .layout = pilotLayout, .of = "pilot"},
   };
   return shown;
 }

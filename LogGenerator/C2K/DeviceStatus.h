@@ -5,6 +5,7 @@
 #include <array>
 
 #include "LogGenerator/C2K/C2KRecord.h"
+#include "LogGenerator/C2K/SubPackets.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 
@@ -52,6 +53,6 @@ inline constexpr std::int64_t fingersId = 4;  // has to be there, though nothing
 
 Outcome parse(const C2KUpdate& update);
 std::span<const RecordPart> parts();
-inline constexpr C2KRecord record{logCode, parse, parts};
+inline constexpr C2KRecord record{logCode, subPackets::minimumLength, parse, parts};
 
 }  // namespace kelvasi::deviceStatus

@@ -15,18 +15,22 @@ constexpr Row pilotRow{.key = "kActiveSetPilots",
                        .unit = " dB",
                        .absent = "(none)",
                        .scale = strengthScale};
-constexpr PilotEntries pilots{.family = RadioFamily::evdo,
-                              .first = evdoActiveSet::firstPilot,
-                              .size = evdoActiveSet::pilotSize,
-                              .layout = evdoActiveSet::pilotLayout,
-                              .pilot = fieldIn(evdoActiveSet::pilotLayout, "PN offset"),
-                              .row = pilotRow};
+constexpr PilotEntries entries{.family = RadioFamily::evdo,
+                               .first = evdoActiveSet::firstPilot,
+                               .size = evdoActiveSet::pilotSize,
+                               .layout = evdoActiveSet::pilotLayout,
+                               .pilot = fieldIn(evdoActiveSet::pilotLayout, "PN offset"),
+                               .row = pilotRow};
 
 }  // namespace
 
 std::span<const RecordPart> evdoActiveSet::parts() {
-  static constexpr std::array shown{RecordPart{evdoActiveSet::logCode, evdoActiveSet::pilotLayout,
-                                               std::span(&pilotRow, 1), "pilot", "pilots"}};
+  static constexpr std::array shown{RecordPart{.logCode = evdoActiveSet::logCode,
+                                               .layout = evdoActiveSet::pilotLayout,
+                                               .rows = std::span(&pilotRow, 1),
+                                               .of = "pilot",
+                                               .list = "pilots",
+                                               .entries = &evdoActiveSet::pilots}};
   return shown;
 }
 
@@ -35,12 +39,12 @@ Outcome evdoActiveSet::parse(const C2KUpdate& update) {
                     "Log code 0x12b6 is %u bytes long but must be at least %lu bytes."))
     return Outcome::tooShort;
   const auto count = static_cast<std::size_t>(valueOf(update.record, fieldIn(layout, "count")));
-  if (update.record.size() < pilots.lengthOf(count)) {
+  if (update.record.size() < entries.lengthOf(count)) {
     update.log.print(LogPriority::error, "Log code 0x12b6 is %u bytes long, but has %d substructs.",
                      update.length(), static_cast<int>(count));
     return Outcome::tooShort;
   }
-  pilots.show(update, count);
+  entries.show(update, count);
   return Outcome::shown;
 }
 

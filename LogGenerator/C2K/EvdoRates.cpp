@@ -79,13 +79,15 @@ void showRate(const C2KUpdate& update, const Link& link, std::uint32_t sequence,
 
 std::span<const RecordPart> evdoForwardRate::parts() {
   static constexpr std::array shown{
-      RecordPart{.logCode = evdoForwardRate::logCode, .rows = std::span(&forwardRow, 1)}};
+      RecordPart{.logCode = evdoForwardRate::logCode, .rows = std::span(&forwardRow, 1)},
+      RecordPart{evdoForwardRate::logCode, evdoForwardRate::layout}};
   return shown;
 }
 
 std::span<const RecordPart> evdoReverseRate::parts() {
   static constexpr std::array shown{
-      RecordPart{.logCode = evdoReverseRate::logCode, .rows = std::span(&reverseRow, 1)}};
+      RecordPart{.logCode = evdoReverseRate::logCode, .rows = std::span(&reverseRow, 1)},
+      RecordPart{evdoReverseRate::logCode, evdoReverseRate::layout}};
   return shown;
 }
 

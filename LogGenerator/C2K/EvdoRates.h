@@ -27,7 +27,7 @@ inline constexpr std::array<std::int64_t, 56> weights{
 
 Outcome parse(const C2KUpdate& update);
 std::span<const RecordPart> parts();
-inline constexpr C2KRecord record{logCode, parse, parts};
+inline constexpr C2KRecord record{logCode, minimumLength, parse, parts};
 
 }  // namespace evdoForwardRate
 
@@ -52,7 +52,7 @@ inline constexpr std::array<std::int64_t, 12> weights{128,  256,  512,  768,  10
 
 Outcome parse(const C2KUpdate& update);
 std::span<const RecordPart> parts();
-inline constexpr C2KRecord record{logCode, parse, parts};
+inline constexpr C2KRecord record{logCode, minimumLength, parse, parts};
 
 }  // namespace evdoReverseRate
 

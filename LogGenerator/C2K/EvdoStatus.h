@@ -31,6 +31,6 @@ inline constexpr std::int64_t accessState = 4;  // below it, the second receiver
 
 Outcome parse(const C2KUpdate& update);
 std::span<const RecordPart> parts();
-inline constexpr C2KRecord record{logCode, parse, parts};
+inline constexpr C2KRecord record{logCode, length, parse, parts};
 
 }  // namespace kelvasi::evdoStatus

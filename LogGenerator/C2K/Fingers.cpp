@@ -26,8 +26,12 @@ constexpr PilotEntries entries{.family = RadioFamily::cdma,
 }  // namespace
 
 std::span<const RecordPart> fingers::parts() {
-  static constexpr std::array shown{
-      RecordPart{fingers::logCode, fingers::fingerLayout, std::span(&fingerRow, 1), "finger", "fingers"}};
+  static constexpr std::array shown{RecordPart{.logCode = fingers::logCode,
+                                               .layout = fingers::fingerLayout,
+                                               .rows = std::span(&fingerRow, 1),
+                                               .of = "finger",
+                                               .list = "fingers",
+                                               .entries = &fingers::all}};
   return shown;
 }
 

@@ -5,6 +5,7 @@
 #include <array>
 
 #include "LogGenerator/C2K/C2KRecord.h"
+#include "LogGenerator/EntryList.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 
@@ -22,9 +23,11 @@ inline constexpr std::array fingerLayout{
     Field{.name = "C/I", .byte = 6, .width = 16},
 };
 static_assert(inWireOrder(fingerLayout));
+inline constexpr EntryList all{
+    .count = fieldIn(layout, "count"), .start = firstFinger, .stride = fingerSize, .layout = fingerLayout};
 
 Outcome parse(const C2KUpdate& update);
 std::span<const RecordPart> parts();
-inline constexpr C2KRecord record{logCode, parse, parts};
+inline constexpr C2KRecord record{logCode, minimumLength, parse, parts};
 
 }  // namespace kelvasi::fingers

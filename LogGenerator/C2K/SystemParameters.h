@@ -30,6 +30,6 @@ static_assert(inWireOrder(layout));
 
 Outcome parse(const C2KUpdate& update);
 std::span<const RecordPart> parts();
-inline constexpr C2KRecord record{logCode, parse, parts, fieldIn(layout, "version").byte};
+inline constexpr C2KRecord record{logCode, minimumLength, parse, parts, fieldIn(layout, "version").byte};
 
 }  // namespace kelvasi::systemParameters

@@ -16,7 +16,10 @@ std::optional<double> trafficFER::rateOf(const PlistDictionary& state) {
 
 std::span<const RecordPart> trafficFER::parts() {
   static constexpr std::array shown{
-      RecordPart{.logCode = trafficFER::logCode, .rows = std::span(&trafficFER::rateRow, 1)}};
+      RecordPart{.logCode = trafficFER::logCode, .rows = std::span(&trafficFER::rateRow, 1)},
+      RecordPart{trafficFER::logCode, subPackets::layout},
+      RecordPart{
+          .logCode = trafficFER::logCode, .layout = trafficFER::demodulationLayout, .of = "sub-packet 11"}};
   return shown;
 }
 

@@ -6,6 +6,7 @@
 #include <optional>
 
 #include "LogGenerator/C2K/C2KRecord.h"
+#include "LogGenerator/C2K/SubPackets.h"
 #include "LogGenerator/LogCode.h"
 #include "LogGenerator/RecordLayout.h"
 #include "LogGenerator/Row.h"
@@ -42,6 +43,6 @@ constexpr double percent(double rate) {
 
 Outcome parse(const C2KUpdate& update);
 std::span<const RecordPart> parts();
-inline constexpr C2KRecord record{logCode, parse, parts};
+inline constexpr C2KRecord record{logCode, subPackets::minimumLength, parse, parts};
 
 }  // namespace kelvasi::trafficFER

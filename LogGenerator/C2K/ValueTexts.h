@@ -74,7 +74,8 @@ inline constexpr std::array roamingIndicators{
 inline double strengthInDecibel(std::int64_t raw) {
   return 10 * std::log10(static_cast<double>(raw) / 512);
 }
-inline constexpr Scale strengthScale{.format = "%+.2f", .curve = strengthInDecibel};
+inline constexpr Scale strengthScale{
+    .format = "%+.2f", .curve = strengthInDecibel, .formula = "10 * log10(raw / 512)"};
 // A number of decibels that was calculated.
 inline constexpr Scale decibelScale{.format = "%+.2f", .curve = fromRaw};
 inline constexpr Scale signedWhole{.format = "%+.0f"};

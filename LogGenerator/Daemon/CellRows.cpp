@@ -20,7 +20,8 @@ void CellTable::describe(std::string_view section, RowCatalog& catalog) const {
                  .key = std::string(each.row.key),
                  .logCode = cellInfoLogCode,
                  .row = &each.row,
-                 .source = std::string(each.cellKey)});
+                 .source = std::string(each.cellKey),
+                 .cells = this});
   }
 }
 

@@ -20,7 +20,11 @@ constexpr std::array calculatedRows{
 };
 constexpr const Row& powerRow = calculatedRows[0];
 constexpr const Row& energyRow = calculatedRows[1];
-constexpr std::array others{RecordPart{.logCode = cellSets::logCode, .rows = calculatedRows}};
+constexpr std::array others{
+    RecordPart{.logCode = cellSets::logCode, .rows = calculatedRows},
+    RecordPart{cellSets::logCode, layout},
+    RecordPart{.logCode = cellSets::logCode, .layout = energyLayout, .of = "entry", .entries = &energies},
+};
 
 constexpr CellFields memberCell{.family = RadioFamily::umts,
                                 .code = fieldIn(identityLayout, "scrambling code"),

@@ -43,7 +43,12 @@ constexpr std::array codeRows{
     Row{.key = "BSIC", .quantity = quantity::bsic, .field = indexIn(bsicList::cellLayout, "BSIC")},
 };
 constexpr std::array others{
-    RecordPart{bsicList::logCode, bsicList::cellLayout, codeRows, "entry"},
+    RecordPart{.logCode = bsicList::logCode,
+               .layout = bsicList::cellLayout,
+               .rows = codeRows,
+               .of = "entry",
+               .minimumLength = bsicList::minimumLength,
+               .entries = &bsicList::cells},
     RecordPart{.logCode = gsmMeasurements::logCode, .rows = codeRows, .of = "the last record 0x51FF"},
 };
 

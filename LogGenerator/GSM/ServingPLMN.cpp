@@ -57,9 +57,15 @@ constexpr std::array digitRows{
         .digits = 3},
 };
 constexpr std::array parts{
-    RecordPart{
-        .logCode = registeredPlmn::logCode, .layout = registeredPlmn::layout, .rows = digitRows, .digits = 3},
-    RecordPart{registeredPlmn::logCode, registeredPlmn::layout, registeredPlmn::rows},
+    RecordPart{.logCode = registeredPlmn::logCode,
+               .layout = registeredPlmn::layout,
+               .rows = digitRows,
+               .digits = 3,
+               .minimumLength = registeredPlmn::minimumLength},
+    RecordPart{.logCode = registeredPlmn::logCode,
+               .layout = registeredPlmn::layout,
+               .rows = registeredPlmn::rows,
+               .minimumLength = registeredPlmn::minimumLength},
 };
 
 constexpr StateSection section{.name = "Serving PLMN",

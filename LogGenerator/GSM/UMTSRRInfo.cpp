@@ -25,9 +25,21 @@ constexpr std::array powerRows{
         .scale = Scale{.curve = fromRaw}},
 };
 constexpr std::array parts{
-    RecordPart{.logCode = transmitPower::logCode, .rows = powerRows},
-    RecordPart{umtsServingCell::logCode, umtsServingCell::layout, umtsServingCell::cellRows},
-    RecordPart{umtsServingCell::logCode, umtsServingCell::layout, umtsServingCell::areaRows},
+    RecordPart{
+        .logCode = transmitPower::logCode, .rows = powerRows, .minimumLength = transmitPower::minimumLength},
+    RecordPart{.logCode = transmitPower::logCode,
+               .layout = transmitPower::sampleLayout,
+               .of = "entry",
+               .minimumLength = transmitPower::minimumLength,
+               .entries = &transmitPower::samples},
+    RecordPart{.logCode = umtsServingCell::logCode,
+               .layout = umtsServingCell::layout,
+               .rows = umtsServingCell::cellRows,
+               .minimumLength = umtsServingCell::minimumLength},
+    RecordPart{.logCode = umtsServingCell::logCode,
+               .layout = umtsServingCell::layout,
+               .rows = umtsServingCell::areaRows,
+               .minimumLength = umtsServingCell::minimumLength},
 };
 
 constexpr std::array records{rrcState::record, ciphering::record};
