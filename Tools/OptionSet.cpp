@@ -68,6 +68,11 @@ Option& Option::showsDefault() {
   return *this;
 }
 
+Option& Option::hidden() {
+  option_->group("");
+  return *this;
+}
+
 Option& Option::needs(const Option& other) {
   option_->needs(other.option_);
   return *this;

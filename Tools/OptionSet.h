@@ -67,6 +67,8 @@ class Option {
   Option& oneValueEach();
   // --help shows what it is when it is not given.
   Option& showsDefault();
+  // --help has no word of it.
+  Option& hidden();
   Option& needs(const Option& other);
   Option& excludes(const Option& other);
 

@@ -9,6 +9,8 @@
 #include <cstdlib>
 #include <utility>
 
+#include "Platform/Posix/FileDescriptor.h"
+
 namespace kelvasi {
 
 void secureStandardDescriptors() {
@@ -20,6 +22,11 @@ void secureStandardDescriptors() {
   }
   std::signal(SIGPIPE, SIG_IGN);
   std::signal(SIGXFSZ, SIG_IGN);
+}
+
+bool redirectStandardOutput(const std::string& path) {
+  const FileDescriptor file(::open(path.c_str(), O_WRONLY | O_CLOEXEC));
+  return file && ::dup2(file.number(), STDOUT_FILENO) == STDOUT_FILENO;
 }
 
 }  // namespace kelvasi

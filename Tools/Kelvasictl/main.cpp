@@ -25,6 +25,9 @@ constexpr std::array verbs{
     Verb{"events", "what happened: cell changes, states, rejects, service, link", declareEvents},
     Verb{"coverage", "what became of the messages, by log code", declareCoverage},
     Verb{"alarms", "watch captures or a live link by rules", declareAlarms},
+    Verb{"dissector", "print a dissector for Wireshark, made from the tables of the decoders",
+         declareDissector},
+    Verb{"extcap", "make live links appear among the interfaces of Wireshark", declareExtcap},
     Verb{"fields", "list every row of every technology, and what stands behind it", declareFields},
 };
 
