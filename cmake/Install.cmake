@@ -4,7 +4,7 @@ set(RESOURCES ${PROJECT_SOURCE_DIR}/Resources)
 
 install(TARGETS kelvasi kelvasictl telvon-sim)
 install(DIRECTORY ${RESOURCES}/ DESTINATION ${CMAKE_INSTALL_DATADIR}/kelvasi FILES_MATCHING PATTERN "*.plist"
-        PATTERN systemd EXCLUDE)
+        PATTERN "*.lua" PATTERN colorfilters PATTERN systemd EXCLUDE)
 
 # kelvasi_installed(DIRECTORY [PROGRAMS] FILE...): files of the source tree. One whose name ends in .in is told where the
 # programs are, which is known when it is installed.
@@ -43,6 +43,19 @@ install(FILES ${RESOURCES}/${NAME}.mime.xml DESTINATION ${SHARE}/mime/packages R
 foreach(UNIT telvon-sim kelvasi-record kelvasi-kiosk)
   kelvasi_installed(lib/systemd/user ${RESOURCES}/systemd/${UNIT}.service.in)
 endforeach()
+
+# Where Wireshark of the same prefix looks. The dissector is made by the program that was built, where that can run.
+set(WIRESHARK ${CMAKE_INSTALL_LIBDIR}/wireshark)
+kelvasi_installed(${WIRESHARK}/extcap PROGRAMS ${RESOURCES}/wireshark/kelvasi-extcap.in)
+if(NOT KELVASI_ODR AND NOT KELVASI_SANITIZE AND (NOT CMAKE_CROSSCOMPILING OR CMAKE_CROSSCOMPILING_EMULATOR))
+  set(DISSECTOR ${PROJECT_BINARY_DIR}/Installed/kelvasi.lua)
+  file(MAKE_DIRECTORY ${PROJECT_BINARY_DIR}/Installed)
+  file(GLOB SCRIPTS CONFIGURE_DEPENDS ${RESOURCES}/wireshark/*.lua ${RESOURCES}/*.plist)
+  add_custom_command(OUTPUT ${DISSECTOR} COMMAND kelvasictl dissector --resources ${RESOURCES} > ${DISSECTOR}
+                     DEPENDS kelvasictl ${SCRIPTS} VERBATIM)
+  add_custom_target(dissector ALL DEPENDS ${DISSECTOR})
+  install(FILES ${DISSECTOR} DESTINATION ${WIRESHARK}/plugins)
+endif()
 
 file(GLOB NOTICES CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/Notices/*)
 install(FILES ${PROJECT_SOURCE_DIR}/LICENSES/Apache-2.0.txt DESTINATION ${CMAKE_INSTALL_DOCDIR} RENAME LICENSE)

@@ -10,6 +10,7 @@ import subprocess
 import tempfile
 import unittest
 
+from dissected import AS_A_USER
 from live_support import PATIENCE, LiveTest
 from support import MM_IDLE, pcap
 
@@ -31,6 +32,8 @@ MADE = {"share/man/man1/kelvasi.1", "share/man/man1/kelvasictl-decode.1", "share
         "share/fish/vendor_completions.d/kelvasictl.fish"}
 MADE_FOLDERS = ("share/man/", "share/bash-completion/", "share/zsh/", "share/fish/")
 HELPERS = {"libexec/kelvasi/show-captures"}
+WIRESHARK = {f"share/kelvasi/wireshark/{path.name}" for path in (SOURCES / "Resources/wireshark").glob("[!k]*")} | {
+    "lib/wireshark/extcap/kelvasi-extcap", "lib/wireshark/plugins/kelvasi.lua"}
 DOCUMENTS = {f"share/doc/kelvasi/{name}" for name in (
     "LICENSE", "CHANGELOG.md", "Notices/README.md", "Notices/LICENSE.CLI11", "Notices/LICENSE.LGPL-2.1",
     "Notices/LICENSE.nlohmann-json")}
@@ -79,7 +82,7 @@ class Installed(LiveTest):
         files = {str(path.relative_to(self.prefix)) for path in self.prefix.rglob("*") if path.is_file()}
         self.assertLess(MADE, files)
         files = {name for name in files if not name.startswith(MADE_FOLDERS)}
-        self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | UNITS | HELPERS | DOCUMENTS)
+        self.assertEqual(files, PROGRAMS | TEMPLATES | DESKTOP | UNITS | HELPERS | WIRESHARK | DOCUMENTS)
 
     def test_all_of_it_is_taken_away_again_and_nothing_else(self):
         with tempfile.TemporaryDirectory() as root:
@@ -121,6 +124,17 @@ class Installed(LiveTest):
         self.assertEqual(result.returncode, 1)
         self.assertEqual(result.stderr, f"kelvasictl: {self.prefix}/share/kelvasi: No such file or directory; "
                                         "--resources or KELVASI_RESOURCES names where the display templates are\n")
+
+    def test_wireshark_finds_the_dissector_and_the_links(self):
+        capture = self.write("a.pcap", pcap(MM_IDLE))
+        found = {"WIRESHARK_PLUGIN_DIR": f"{self.prefix}/lib/wireshark/plugins", "HOME": self.directory.name}
+        shown = subprocess.run([*AS_A_USER, "tshark", "-r", capture, "-Y", 'kelvasi.gsm.process_cs.mm_state == "MM_IDLE"'],
+                               env=self.environment | found, capture_output=True, text=True, timeout=PATIENCE, check=True)
+        self.assertIn("GSM 0x7131 Process CS", shown.stdout)
+        script = (self.prefix / "lib/wireshark/extcap/kelvasi-extcap").read_text(encoding="utf-8")
+        self.assertEqual(script.splitlines()[-1], 'exec "/opt/kelvasi/bin/kelvasictl" extcap "$@"')
+        made = self.run_installed("kelvasictl", "dissector")
+        self.assertEqual(made.stdout, (self.prefix / "lib/wireshark/plugins/kelvasi.lua").read_text(encoding="utf-8"))
 
     def test_a_link_to_a_program_finds_them_too(self):
         link = self.path("link")
