@@ -24,7 +24,7 @@ struct CellLine {
   Level level;                       // what orders cells of its technology; with its line
   std::optional<double> difference;  // to the serving cell in the same level, dB
   std::string differenceText;        // "-10", "+3"; empty where there is none
-  Age age;                           // since it was last reported: "live", "6 s", "gone 14 s"
+  Age age;  // since it was last reported, its level where it has one: "live", "6 s", "gone 14 s"
 };
 
 struct CarrierLine {

@@ -104,8 +104,12 @@ CellLine lineOf(const View& view, const SeenCell& cell, const ServingCells& serv
   line.level = levelOf(view, cell, *kind, now);
   const SeenCell* base = servingOf(serving, family);
   const auto beside = base ? latest(view, *base, *kind) : std::nullopt;
+  // A cell may be spoken of without its level, which is no level of now for that.
+  if (line.level.value && line.level.age.time > line.age.time && !isGone) line.age = line.level.age;
   // Against a level of another time there is no difference to speak of.
-  if (!line.level.value || !beside || isGone || fadeOf(timeSince(beside->time, now)) == Fade::gone)
+  const auto isTooOld = [](std::chrono::nanoseconds age) { return fadeOf(age) == Fade::gone; };
+  if (!line.level.value || !beside || isGone || isTooOld(line.level.age.time) ||
+      isTooOld(timeSince(beside->time, now)))
     return line;
   line.difference = *line.level.value - beside->value;
   line.differenceText = differenceText(*line.difference, 0, view.style);

@@ -76,6 +76,19 @@ TEST(CellLines, ADifferenceNeedsALevelOfNow) {
   EXPECT_EQ(shown(fed.at(30s)), Texts{"PCI 362 -80  live"});
 }
 
+// As the record of cells that are too weak to be measured does.
+TEST(CellLines, ACellThatIsSpokenOfWithoutItsLevelHasNoLevelOfNow) {
+  Fed fed;
+  fed.take(listed(0s, {{cell362, -110}}));
+  for (const auto after : {12s, 40s}) {
+    Message message = served(after, cell404, -95);
+    message.neighbour(cell362, quantity::pci, 362);
+    fed.take(message);
+    EXPECT_EQ(shown(fed.at(after)),
+              Texts{after == 12s ? "PCI 362 -110 -15 12 s" : "PCI 362 -110  gone 40 s"});
+  }
+}
+
 TEST(CellLines, StayWhereTheyAreWhileHeld) {
   Fed fed;
   fed.take(listed(0s, {{cell362, -90}, {cell257, -100}}));
