@@ -83,6 +83,10 @@ Thresholds& Cockpit::thresholds() {
   return parts_->setUp.thresholds;
 }
 
+const TextStyle& Cockpit::style() const {
+  return parts_->setUp.style;
+}
+
 const survey::Survey& Cockpit::survey() const {
   return parts_->survey;
 }

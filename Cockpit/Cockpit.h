@@ -114,6 +114,7 @@ class Cockpit {
   // --- Settings and what lies below.
 
   Thresholds& thresholds();
+  const TextStyle& style() const;
   const survey::Survey& survey() const;
   const RowBook& rows() const;
   std::size_t bytes() const;  // of all series, at most

@@ -90,6 +90,8 @@ class Chart {
   // By a share of the window: -0.5 is half a window back. Up to now; there it follows again.
   void pan(double share, Arrival now);
   void show(Arrival from, Arrival to);
+  // The other's window of time and cursors; the lines stay.
+  void keepTimeOf(const Chart& other);
   Arrival endAt(Arrival now) const { return end_ ? std::min(*end_, now) : now; }
   Arrival beginAt(Arrival now) const { return endAt(now) - length_; }
   // A place of 0 to 1 in the window.

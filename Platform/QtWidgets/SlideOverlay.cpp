@@ -8,19 +8,18 @@ namespace kelvasi {
 
 namespace {
 
-constexpr int duration = 280;           // milliseconds
 constexpr double lowerPaneShare = 0.3;  // of the way that the upper pane takes
 constexpr double shade = 0.12;          // of the lower pane at its furthest
 
 }  // namespace
 
 SlideOverlay::SlideOverlay(QWidget& parent, const QRect& area, Pictures pictures, Direction direction,
-                           int barHeight)
+                           int barHeight, std::chrono::milliseconds duration)
     : QWidget(&parent), pictures_(std::move(pictures)), direction_(direction), barHeight_(barHeight) {
   setAttribute(Qt::WA_TransparentForMouseEvents);
   setAttribute(Qt::WA_DeleteOnClose);
   setGeometry(area);
-  progress_.setDuration(duration);
+  progress_.setDuration(static_cast<int>(duration.count()));
   progress_.setEasingCurve(QEasingCurve::OutCubic);
   progress_.setStartValue(0.0);
   progress_.setEndValue(1.0);
@@ -37,6 +36,7 @@ SlideOverlay::SlideOverlay(QWidget& parent, const QRect& area, Pictures pictures
 void SlideOverlay::paintEvent(QPaintEvent*) {
   QPainter painter(this);
   if (direction_ == Direction::downwards) return paintDownwards(painter);
+  if (direction_ == Direction::upwards) return paintUpwards(painter);
   paintBar(painter);
   painter.setClipRect(rect().adjusted(0, barHeight_, 0, 0));
   paintSideways(painter);
@@ -66,6 +66,11 @@ void SlideOverlay::paintSideways(QPainter& painter) const {
 
 void SlideOverlay::paintDownwards(QPainter& painter) const {
   painter.drawPixmap(QPointF(0, height() * at_), pictures_.before);
+}
+
+void SlideOverlay::paintUpwards(QPainter& painter) const {
+  painter.drawPixmap(0, 0, pictures_.before);
+  painter.drawPixmap(QPointF(0, height() * (1 - at_)), pictures_.after);
 }
 
 }  // namespace kelvasi

@@ -5,12 +5,14 @@
 #include <QPixmap>
 #include <QVariantAnimation>
 #include <QWidget>
+#include <chrono>
 
 namespace kelvasi {
 
 class SlideOverlay : public QWidget {
  public:
-  enum class Direction { leftwards, rightwards, downwards };
+  static constexpr std::chrono::milliseconds usualDuration{280};
+  enum class Direction { leftwards, rightwards, downwards, upwards };
 
   struct Pictures {
     QPixmap before;
@@ -19,7 +21,8 @@ class SlideOverlay : public QWidget {
 
   // Over `area` of `parent`; destroys itself when it is through. The first `barHeight` points fade over
   // instead of sliding.
-  SlideOverlay(QWidget& parent, const QRect& area, Pictures pictures, Direction direction, int barHeight = 0);
+  SlideOverlay(QWidget& parent, const QRect& area, Pictures pictures, Direction direction, int barHeight = 0,
+               std::chrono::milliseconds duration = usualDuration);
 
  protected:
   void paintEvent(QPaintEvent* event) override;
@@ -28,6 +31,7 @@ class SlideOverlay : public QWidget {
   void paintBar(QPainter& painter) const;
   void paintSideways(QPainter& painter) const;
   void paintDownwards(QPainter& painter) const;
+  void paintUpwards(QPainter& painter) const;
 
   Pictures pictures_;
   Direction direction_;

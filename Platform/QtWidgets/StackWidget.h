@@ -19,6 +19,7 @@ class StackWidget : public QWidget {
 
   NavigationBar& bar() const { return *bar_; }
   Toolbar& toolbar() const { return *toolbar_; }
+  void goBack() { goBack_(); }
   // Shows `page` instead of the one before, which is hidden. Does not own it.
   void showPage(QWidget& page);
   // Shown below the rows of the root page while these leave it the room it needs at least; null for none.

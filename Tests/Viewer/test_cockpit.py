@@ -1,6 +1,8 @@
 # SPDX-License-Identifier: Apache-2.0
 """The cockpit in the window, fed by a simulated drive."""
 
+import os
+import re
 import unittest
 
 from viewer_support import ViewerTest
@@ -124,7 +126,7 @@ class Cockpit(ViewerTest):
         """Goes to a line of the page that can be opened, by keyboard, and opens it."""
         for _ in range(60):
             viewer.do("press Down")
-            if viewer.state()["cockpit"]["selected"] == text:
+            if re.fullmatch(text, viewer.state()["cockpit"]["selected"]):
                 return viewer.do("press Return")
         return self.fail(f"there is no {text!r}")
 
@@ -136,8 +138,60 @@ class Cockpit(ViewerTest):
         self.assertEqual(state["page"], "Coverage")
         self.assertRegex(state["texts"][0], r"^[\d,]+ messages, (every one shown|.* not shown)$")
         viewer.do("press Escape")
-        self.choose(viewer, viewer.state()["cockpit"]["link"]["counters"])
+        self.choose(viewer, r"[\d,]+ messages.*")
         self.assertEqual(viewer.state()["cockpit"]["page"], "Coverage")
+
+    def save_chart(self, viewer, what):
+        viewer.do("press O", "press G", "press S")
+        self.assertEqual(viewer.state()["cockpit"]["page"], "Save chart")
+        self.choose(viewer, what)
+        return viewer.await_state(lambda state: state["notice"])["notice"]
+
+    def test_a_chart_is_saved_as_a_picture(self):
+        viewer = self.start_sized()
+        self.await_serving(viewer)
+        notice = self.save_chart(viewer, r"As a picture \(PNG\)")
+        self.assertEqual(notice["message"], "Chart saved")
+        self.assertRegex(notice["path"], r"/Chart \d{4}-\d\d-\d\d at \d\d\.\d\d\.\d\d\.png$")
+        self.assertEqual(os.path.dirname(notice["path"]), self.path("snapshots"))
+        self.assertEqual(self.read(notice["path"])[:8], b"\x89PNG\r\n\x1a\n")
+        self.assertEqual(os.stat(notice["path"]).st_mode & 0o777, 0o600)
+
+    def test_a_chart_is_saved_as_values(self):
+        viewer = self.start_sized()
+        self.await_serving(viewer)
+        notice = self.save_chart(viewer, r"As values \(CSV\)")
+        head, *lines = self.read(notice["path"]).decode().split("\r\n")
+        self.assertRegex(head, r"^time,PCI \d+ RSRP minimum \(dBm\),PCI \d+ RSRP mean \(dBm\),")
+        self.assertRegex(lines[0], r"^\d{4}-\d\d-\d\dT\d\d:\d\d:\d\dZ,-\d+")
+        self.assertEqual(os.stat(notice["path"]).st_mode & 0o777, 0o600)
+
+    def test_a_chart_that_cannot_be_written_is_told(self):
+        self.environment["KELVASI_LOG_DIRECTORY"] = self.path("nowhere")
+        viewer = self.start_sized()
+        self.await_serving(viewer)
+        viewer.do("press O", "press G", "press S")
+        self.choose(viewer, r"As values \(CSV\)")
+        self.assertEqual(viewer.await_state(lambda state: state["alert"])["alert"]["title"], "File Error")
+
+    def test_the_keyboard_reads_a_chart_at_two_moments(self):
+        viewer = self.start_sized()
+        self.await_serving(viewer)
+        viewer.do("press O", "press G", "press .", "press <")
+        texts = viewer.state()["cockpit"]["texts"]
+        self.assertEqual(len([text for text in texts if text.startswith("at ")]), 2, texts)
+        viewer.do("press Home")
+        texts = viewer.state()["cockpit"]["texts"]
+        self.assertEqual([text for text in texts if text.startswith("at ")], [])
+
+    def test_the_list_of_keys_names_every_key_of_the_cockpit(self):
+        viewer = self.start_sized()
+        self.await_serving(viewer)
+        viewer.do("press ?")
+        listed = " ".join(viewer.state()["cockpit"]["texts"])
+        for keys in ("O", "/", "G", "E", "A", "C", "M", "?", "*", "Space", "Enter", "Home", "S", "<, >", "comma", "Ctrl+S",
+                     "F11", "Ctrl+W", "Esc"):
+            self.assertIn(", " + keys, listed)
 
     def test_keys_events_and_marks_have_pages(self):
         viewer = self.start_sized()

@@ -93,7 +93,12 @@ bool run(QtApplicationFramework& framework, const ViewerOptions& options) {
       if (ui.window()) ui.window()->bringToFront();
     });
   queue.post([&] {  // when the window is there
-    front = new CockpitFront(*ui.window(), *application, {.clock = clock, .attention = attention});
+    front = new CockpitFront(*ui.window(), *application,
+                             {.clock = clock,
+                              .attention = attention,
+                              .ui = ui,
+                              .files = files,
+                              .directory = platform.paths.logDirectory});
     front->cockpit().restorePins(memory.pins);
     for (const std::string& rule : memory.alarms) front->cockpit().addAlarm(rule);
     noticeMissingTemplates(resources, ui);

@@ -14,7 +14,8 @@ namespace {
 
 using namespace std::chrono_literals;
 
-constexpr auto showTime = 12s;
+constexpr auto alarmTime = 12s;
+constexpr auto wordTime = 2s;
 constexpr int widest = 440;
 constexpr int margin = 12;
 constexpr int barHeight = 44;
@@ -29,19 +30,32 @@ AlarmBanner::AlarmBanner(QWidget& window, std::function<void()> open)
   setCursor(Qt::PointingHandCursor);
   window.installEventFilter(this);
   timer_.setSingleShot(true);
-  timer_.setInterval(showTime);
   connect(&timer_, &QTimer::timeout, this, [this] { hide(); });
 }
 
 void AlarmBanner::say(const std::string& words) {
   words_ = shown(words);
+  isAlarm_ = true;
   setAccessibleName(tr("Alarm"));
+  showFor(alarmTime);
+}
+
+// An alarm is not covered by less.
+void AlarmBanner::tell(const std::string& words) {
+  if (isVisible() && isAlarm_) return;
+  words_ = shown(words);
+  isAlarm_ = false;
+  setAccessibleName({});
+  showFor(wordTime);
+}
+
+void AlarmBanner::showFor(std::chrono::milliseconds time) {
   setAccessibleDescription(words_);
   place();
   show();
   raise();
   update();
-  timer_.start();
+  timer_.start(time);
   QAccessibleEvent alert(this, QAccessible::Alert);
   QAccessible::updateAccessibility(&alert);
 }
@@ -64,10 +78,11 @@ void AlarmBanner::paintEvent(QPaintEvent*) {
   painter.setRenderHint(QPainter::Antialiasing);
   const Canvas canvas(painter, coloursFor(palette()));
   const QRectF card = QRectF(rect()).adjusted(0.5, 0.5, -0.5, -0.5);
-  painter.setPen(QPen(canvas.colours.poor, 1));
+  painter.setPen(QPen(isAlarm_ ? canvas.colours.poor : canvas.colours.line, 1));
   painter.setBrush(canvas.colours.surface);
   painter.drawRoundedRect(card, 12, 12);
-  canvas.verdict({card.left() + margin + 8, card.center().y()}, cockpit::Verdict::veryPoor);
+  const auto shape = isAlarm_ ? cockpit::Verdict::veryPoor : cockpit::Verdict::none;
+  canvas.verdict({card.left() + margin + 8, card.center().y()}, shape);
   const double width = card.width() - 2 * margin - besideShape;
   const double high = heightOfWords(words_, textSize::text, width, true);
   canvas.words({card.left() + margin + besideShape, card.center().y() - high / 2, width, high}, words_,
@@ -80,7 +95,7 @@ void AlarmBanner::mousePressEvent(QMouseEvent* event) {
 
 void AlarmBanner::mouseReleaseEvent(QMouseEvent*) {
   hide();
-  open_();
+  if (isAlarm_) open_();
 }
 
 }  // namespace kelvasi

@@ -1,9 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
-// Says below the window's bar that an alarm was given, whatever is shown. A tap leads to the alarms.
+// Says below the window's bar what has just come, whatever is shown: an alarm, to which a tap leads, or what
+// a gesture did.
 #pragma once
 
 #include <QTimer>
 #include <QWidget>
+#include <chrono>
 #include <functional>
 #include <string>
 
@@ -13,8 +15,10 @@ class AlarmBanner : public QWidget {
  public:
   AlarmBanner(QWidget& window, std::function<void()> open);
 
-  // For a while; takes the place of what it said before.
+  // An alarm, for a while; takes the place of what it said before.
   void say(const std::string& words);
+  // What a gesture did, for a moment.
+  void tell(const std::string& words);
   const QString& words() const { return words_; }
 
  protected:
@@ -25,9 +29,11 @@ class AlarmBanner : public QWidget {
 
  private:
   void place();
+  void showFor(std::chrono::milliseconds time);
 
   std::function<void()> open_;
   QString words_;
+  bool isAlarm_ = false;
   QTimer timer_;
 };
 

@@ -20,7 +20,11 @@ struct Block {
   std::function<void(const Canvas& canvas, const QRectF& area)> paint;
   std::function<void()> action = {};  // a tap's, and Enter's; empty where there is none
   std::function<void()> more = {};    // of a hold, a right click and Space
-  QString spoken = {};
+  QString spoken = {};                // all of it in words
+  // The same for readers that tell a name from its value; without a name what is spoken is the name.
+  QString name = {};
+  QString value = {};
+  bool isHeading = false;
 };
 
 using Blocks = std::vector<Block>;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasi/Cockpit/BlockView.h"
 
+#include <QAccessible>
 #include <QContextMenuEvent>
 #include <QFocusEvent>
 #include <QKeyEvent>
@@ -40,7 +41,7 @@ BlockView::BlockView(QWidget* parent, Make make) : QAbstractScrollArea(parent), 
 
 void BlockView::refresh() {
   if (!isVisible()) return;
-  blocks_ = make_(viewport()->width());
+  const Blocks before = std::exchange(blocks_, make_(viewport()->width()));
   whole_ = 0;
   for (const Block& block : blocks_) whole_ += block.height;
   if (selected_ && !isUsable(*selected_)) selected_.reset();
@@ -48,6 +49,34 @@ void BlockView::refresh() {
   verticalScrollBar()->setSingleStep(arrowStep);
   verticalScrollBar()->setRange(0, std::max(0, static_cast<int>(std::ceil(whole_)) - viewport()->height()));
   viewport()->update();
+  if (QAccessible::isActive()) tellChanges(before);
+}
+
+// The value as its description too, for readers that know no values of texts.
+void BlockView::tellChanges(const Blocks& before) {
+  const auto tell = [](QAccessibleEvent& event, std::size_t place) {
+    event.setChild(static_cast<int>(place));
+    QAccessible::updateAccessibility(&event);
+  };
+  for (std::size_t place = 0; place < std::min(before.size(), blocks_.size()); ++place) {
+    const Block& block = blocks_[place];
+    QAccessibleEvent renamed(this, QAccessible::NameChanged);
+    if (before[place].name != block.name) tell(renamed, place);
+    if (before[place].value == block.value) continue;
+    QAccessibleEvent described(this, QAccessible::DescriptionChanged);
+    tell(described, place);
+    QAccessibleValueChangeEvent changed(this, block.value);
+    tell(changed, place);
+  }
+}
+
+QRectF BlockView::areaInView(std::size_t place) const {
+  return {0, topOf(place) - verticalScrollBar()->value(), 1.0 * viewport()->width(), blocks_[place].height};
+}
+
+QRect BlockView::areaOnScreen(std::size_t place) const {
+  const QRect area = areaInView(place).toRect();
+  return {viewport()->mapToGlobal(area.topLeft()), area.size()};
 }
 
 bool BlockView::isUsable(std::size_t place) const {
@@ -134,6 +163,9 @@ bool BlockView::select(bool next) {
     if (!isUsable(static_cast<std::size_t>(at))) continue;
     selected_ = static_cast<std::size_t>(at);
     bringIntoSight(*selected_);
+    QAccessibleEvent focus(this, QAccessible::Focus);
+    focus.setChild(static_cast<int>(at));
+    QAccessible::updateAccessibility(&focus);
     tellHold();
     viewport()->update();
     return true;

@@ -28,6 +28,10 @@ class BlockView : public QAbstractScrollArea {
   // Goes to the next block with an action, or to the one before it. False at the end.
   bool select(bool next);
   std::optional<std::size_t> selected() const { return selected_; }
+  // Does what a tap on the block does.
+  void act(std::size_t place);
+  QRectF areaInView(std::size_t place) const;
+  QRect areaOnScreen(std::size_t place) const;
   QString selectedText() const { return selected_ ? blocks_[*selected_].spoken : QString(); }
 
  protected:
@@ -52,7 +56,7 @@ class BlockView : public QAbstractScrollArea {
   void bringIntoSight(std::size_t place);
   void press(std::optional<std::size_t> place);
   void tellHold();
-  void act(std::size_t place);
+  void tellChanges(const Blocks& before);
   void askMore(std::size_t place);
 
   Make make_;

@@ -4,17 +4,22 @@
 #include <QBoxLayout>
 #include <QContextMenuEvent>
 #include <QKeyEvent>
+#include <QWindow>
 #include <algorithm>
 #include <chrono>
+#include <utility>
 
 #include "Platform/QtWidgets/CellWidget.h"
 #include "Platform/QtWidgets/Layer.h"
+#include "Platform/QtWidgets/SlideOverlay.h"
 #include "Platform/QtWidgets/StackWidget.h"
 #include "Platform/QtWidgets/TableWidget.h"
 #include "Platform/QtWidgets/TopWidget.h"
 #include "Tools/Kelvasi/Cockpit/AlarmBanner.h"
+#include "Tools/Kelvasi/Cockpit/BlockAccess.h"
 #include "Tools/Kelvasi/Cockpit/CockpitCard.h"
 #include "Tools/Kelvasi/Cockpit/CockpitPane.h"
+#include "Tools/Kelvasi/Cockpit/TouchWatch.h"
 #include "Tools/OperatorFile.h"
 
 namespace kelvasi {
@@ -24,6 +29,7 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr auto tickTime = 1s;
+constexpr auto motionTime = 180ms;
 constexpr auto callPause = 2s;  // between two sounds
 constexpr int wide = 900;       // points, from which panes and cockpit stand beside each other
 constexpr int sideways = 560;   // the same, where the window is wider than high
@@ -68,14 +74,20 @@ CockpitFront::CockpitFront(TopWidget& window, KelvasiApp& app, const Surrounding
     : QObject(&window),
       window_(window),
       app_(app),
-      clock_(surroundings.clock),
-      attention_(surroundings.attention),
+      around_(surroundings),
       cockpit_(std::make_unique<cockpit::Cockpit>(setUp())),
       pages_(std::make_unique<CockpitPages>(*cockpit_, *this)),
       card_(new CockpitCard([this] { return snapshot(); }, [this] { open(); })),
       pane_(new CockpitPane([this] { close(); })),
       side_(new CockpitPane({})),
-      banner_(new AlarmBanner(window, [this] { pages_->openAlarms(pageHolder()); })) {
+      banner_(new AlarmBanner(window, [this] { pages_->openAlarms(pageHolder()); })),
+      motion_(QStringLiteral("org.gnome.desktop.interface"), QStringLiteral("enable-animations"),
+              [this](const QVariant& value) {
+                isAnimated_ = value.toBool();
+                pane_->setAnimated(isAnimated_);
+                side_->setAnimated(isAnimated_);
+              }) {
+  installBlockAccess();
   pane_->setParent(&window);
   pane_->hide();
   pane_->setRoot(pages_->face(*pane_));
@@ -91,6 +103,7 @@ CockpitFront::CockpitFront(TopWidget& window, KelvasiApp& app, const Surrounding
   timer_.start(tickTime);
   tellLink();
   arrange();
+  watchTouches();
 }
 
 CockpitFront::~CockpitFront() = default;
@@ -99,7 +112,8 @@ cockpit::CockpitSetUp CockpitFront::setUp() {
   cockpit::CockpitSetUp setUp;
   setUp.style.minus = "\u2212";
   setUp.style.eastOfUtc = [this](Arrival at) {
-    return std::chrono::seconds(clock_.localZone({std::chrono::duration<double>(at).count()}).secondsFromGmt);
+    return std::chrono::seconds(
+        around_.clock.localZone({std::chrono::duration<double>(at).count()}).secondsFromGmt);
   };
   setUp.operators = loadOperators().operators;
   setUp.onAlarm = [this](const cockpit::AlarmLine& line) { alarm(line); };
@@ -111,7 +125,7 @@ void CockpitFront::alarm(const cockpit::AlarmLine& line) {
   banner_->say(line.words);
   if (line.time - lastCall_ < callPause) return;
   lastCall_ = line.time;
-  attention_.call(line.ruleText, "Alarm", line.words);
+  around_.attention.call(line.ruleText, "Alarm", line.words);
 }
 
 QString CockpitFront::bannerWords() const {
@@ -119,7 +133,7 @@ QString CockpitFront::bannerWords() const {
 }
 
 Arrival CockpitFront::now() const {
-  return arrivalAt(clock_.now());
+  return arrivalAt(around_.clock.now());
 }
 
 void CockpitFront::tick() {
@@ -164,6 +178,27 @@ bool CockpitFront::eventFilter(QObject* watched, QEvent* event) {
   return QObject::eventFilter(watched, event);
 }
 
+void CockpitFront::watchTouches() {
+  QWindow* const window = window_.windowHandle();
+  if (!window) return;
+  new TouchWatch(*window, {.twoFingers = [this] { markNow(); }, .fromEdge = [this] { goBack(); }});
+}
+
+// Where the user is: in the cockpit's pages while they cover the panes, else in the panes.
+void CockpitFront::goBack() {
+  if (isCovered(window_, layer_)) return;
+  if (pane_->isCovering()) return pane_->goBack();
+  stackOf(window_).goBack();
+}
+
+// Without a word: a note may follow from the list of events.
+void CockpitFront::markNow() {
+  if (isCovered(window_, layer_)) return;
+  cockpit_->mark(now());
+  banner_->tell("Marked");
+  refresh();
+}
+
 // Beside the panes where there is room for both.
 void CockpitFront::arrange() {
   if (layer_) return;
@@ -204,14 +239,25 @@ void CockpitFront::arrangeChart(bool isBeside) {
 
 void CockpitFront::open() {
   if (pane_->isVisible()) return pane_->top().firstFocus().setFocus();
+  const QPixmap before = isAnimated_ ? window_.grab() : QPixmap();
   layer_ = new CockpitLayer(window_, *pane_);
   pane_->setCovering(true);
   pane_->refresh();
   pane_->top().firstFocus().setFocus();
+  slide(before, true);
+}
+
+// The cockpit comes from below, where its card is, and goes there.
+void CockpitFront::slide(const QPixmap& before, bool isUp) {
+  if (before.isNull()) return;
+  new SlideOverlay(window_, window_.rect(), {before, isUp ? window_.grab() : QPixmap()},
+                   isUp ? SlideOverlay::Direction::upwards : SlideOverlay::Direction::downwards, 0,
+                   motionTime);
 }
 
 void CockpitFront::close() {
   if (!layer_) return;
+  const QPixmap before = isAnimated_ ? window_.grab() : QPixmap();
   pane_->goToRoot();
   pane_->hide();
   pane_->setParent(&window_);
@@ -220,6 +266,7 @@ void CockpitFront::close() {
   delete gone;  // NOLINT(cppcoreguidelines-owning-memory): the window's child
   arrange();
   refresh();
+  slide(before, false);
 }
 
 void CockpitFront::openPane(const std::string& nodePath) {
@@ -235,8 +282,22 @@ void CockpitFront::openPane(const std::string& nodePath) {
   }
 }
 
+// "Chart 2026-11-22 at 21.57.02.png", numbered where one of that second is there.
+void CockpitFront::keepFile(const std::string& ending, std::span<const std::uint8_t> bytes) {
+  std::string time = cockpit::dateText(now(), cockpit_->style());
+  std::ranges::replace(time, ':', '.');
+  const std::string name = around_.directory + "/Chart " + time.replace(time.find(' '), 1, " at ");
+  std::string path = name + ending;
+  for (int copy = 2; around_.files.exists(path); ++copy) path = name + " " + std::to_string(copy) + ending;
+  if (around_.files.write(path, bytes)) return around_.ui.showFileNotice("Chart saved", path);
+  around_.ui.showAlert("File Error", "Unable to write file to disk", "Close");
+}
+
+// What is to be opened comes sideways then, and the cockpit not from below.
 CockpitPane& CockpitFront::pageHolder() {
+  const bool wasAnimated = std::exchange(isAnimated_, false);
   open();
+  isAnimated_ = wasAnimated;
   return *pane_;
 }
 

@@ -17,6 +17,9 @@
 #include "Cockpit/Cockpit.h"
 #include "Platform/Attention.h"
 #include "Platform/Clock.h"
+#include "Platform/Files.h"
+#include "Platform/QtWidgets/PortalSetting.h"
+#include "Platform/UserInterface/UserInterface.h"
 #include "Tools/Kelvasi/Cockpit/CockpitPages.h"
 
 namespace kelvasi {
@@ -33,6 +36,9 @@ class CockpitFront : public QObject, public CockpitPages::Host {
   struct Surroundings {
     const Clock& clock;
     Attention& attention;
+    UserInterface& ui;
+    Files& files;
+    std::string directory;  // for the files of charts
   };
   CockpitFront(TopWidget& window, KelvasiApp& app, const Surroundings& surroundings);
   ~CockpitFront() override;
@@ -52,15 +58,20 @@ class CockpitFront : public QObject, public CockpitPages::Host {
  private:
   Arrival now() const override;
   void openPane(const std::string& nodePath) override;
+  void keepFile(const std::string& ending, std::span<const std::uint8_t> bytes) override;
 
   cockpit::CockpitSetUp setUp();
   void tick();
   void alarm(const cockpit::AlarmLine& line);
   void tellLink();
   void refresh();
+  void goBack();
+  void watchTouches();
+  void slide(const QPixmap& before, bool isUp);
   void arrange();
   void arrangeChart(bool isBeside);
   bool pinRow();
+  void markNow();
   void open();
   void close();
   CockpitPane& pageHolder();
@@ -70,8 +81,7 @@ class CockpitFront : public QObject, public CockpitPages::Host {
 
   TopWidget& window_;
   KelvasiApp& app_;
-  const Clock& clock_;
-  Attention& attention_;
+  Surroundings around_;
   std::unique_ptr<cockpit::Cockpit> cockpit_;
   std::unique_ptr<CockpitPages> pages_;
   CockpitCard* card_;  // children of the window
@@ -82,6 +92,8 @@ class CockpitFront : public QObject, public CockpitPages::Host {
   QPointer<Layer> layer_;
   std::string technologyOfPanes_;
   QTimer timer_;
+  bool isAnimated_ = true;
+  PortalSetting motion_;
 };
 
 }  // namespace kelvasi

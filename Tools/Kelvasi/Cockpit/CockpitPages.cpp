@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Tools/Kelvasi/Cockpit/CockpitPages.h"
 
+#include <QBuffer>
 #include <QClipboard>
 #include <QGuiApplication>
 #include <algorithm>
@@ -21,26 +22,37 @@ using namespace cockpit;
 constexpr std::size_t mostEvents = 500;
 
 struct KeyWords {
-  const char* keys;
+  const char* keys;  // null for the name of a group
   const char* words;
 };
 
 constexpr std::array keyTable{
-    KeyWords{"O", "open the cockpit, and close it"},
+    KeyWords{nullptr, "Anywhere"},
+    KeyWords{"O", "the cockpit, and back"},
     KeyWords{"/", "search all names and values"},
-    KeyWords{"*", "pin the row, or take its pin away"},
-    KeyWords{"Space", "all that is known of a row; also a hold or a right click"},
     KeyWords{"G", "chart"},
-    KeyWords{"+ -", "a shorter or a longer time in the chart"},
     KeyWords{"E", "events"},
     KeyWords{"A", "alarms"},
-    KeyWords{"C", "coverage: what came in and was not shown"},
-    KeyWords{"M", "mark this moment"},
+    KeyWords{"C", "coverage"},
+    KeyWords{"M, two fingers", "mark this moment"},
     KeyWords{"?", "these keys"},
-    KeyWords{"Up Down Page Up Page Down Home End", "move among rows"},
-    KeyWords{"Enter", "open the row"},
-    KeyWords{"Left Right", "move a long value sideways"},
-    KeyWords{"Esc, Backspace, Alt+Left", "back"},
+    KeyWords{"Esc, Backspace, Alt+Left", "back; also a swipe from the left edge"},
+    KeyWords{nullptr, "Rows"},
+    KeyWords{"Up, Down", "to the next row"},
+    KeyWords{"Page Up, Page Down, Home, End", "further"},
+    KeyWords{"Enter, tap", "open the row"},
+    KeyWords{"Space, hold, right click", "all that is known of it"},
+    KeyWords{"*", "pin it, or take its pin away"},
+    KeyWords{"Left, Right", "move a long value sideways"},
+    KeyWords{nullptr, "Chart"},
+    KeyWords{"+, \u2212, wheel, two fingers", "a shorter or longer time"},
+    KeyWords{"Left, Right, drag", "earlier or later"},
+    KeyWords{"comma, point, tap", "read all values at one moment"},
+    KeyWords{"<, >, hold, Shift+tap", "and at a second one"},
+    KeyWords{"Home", "back to now"},
+    KeyWords{"S", "save it as a picture or as values"},
+    KeyWords{nullptr, "Window"},
+    KeyWords{"Tab", "to the next part"},
     KeyWords{"Ctrl+S", "save a snapshot"},
     KeyWords{"F11", "fill the screen"},
     KeyWords{"Ctrl+W, Ctrl+Q", "close"},
@@ -74,6 +86,10 @@ Block actionBlock(const std::string& words, double width, std::function<void()> 
   Block block = linkBlock(words, width);
   block.action = std::move(action);
   return block;
+}
+
+std::span<const std::uint8_t> bytesOf(const QByteArray& bytes) {
+  return {reinterpret_cast<const std::uint8_t*>(bytes.constData()), static_cast<std::size_t>(bytes.size())};
 }
 
 void copy(const std::string& text) {
@@ -110,8 +126,33 @@ CockpitPage* CockpitPages::face(CockpitPane& in) {
 }
 
 CockpitPage* CockpitPages::chart(CockpitPane& in, std::vector<ChartLineKey> lines) {
-  return new ChartPage(
-      &in, cockpit_, [&host = host_] { return host.now(); }, std::move(lines));
+  return makeChart(in, std::move(lines));
+}
+
+ChartPage* CockpitPages::makeChart(CockpitPane& in, std::vector<ChartLineKey> lines) {
+  auto* const page =
+      new ChartPage(&in, {cockpit_, chartTime_, [&host = host_] { return host.now(); }}, std::move(lines));
+  page->setSave([this, &in, page] { openSaveChart(in, *page); });
+  return page;
+}
+
+void CockpitPages::openSaveChart(CockpitPane& in, ChartPage& chart) {
+  in.push(new BlockPage(BlockPage::tr("Save chart"), &in, [this, &in, &chart](double width) {
+    Blocks blocks;
+    blocks.push_back(actionBlock("As a picture (PNG)", width, [this, &in, &chart] {
+      QByteArray bytes;
+      QBuffer buffer(&bytes);
+      chart.image().save(&buffer, "PNG");
+      in.goBack();
+      host_.keepFile(".png", bytesOf(bytes));
+    }));
+    blocks.push_back(actionBlock("As values (CSV)", width, [this, &in, &chart] {
+      const std::string text = chart.csv();
+      in.goBack();
+      host_.keepFile(".csv", bytesOf(QByteArray::fromStdString(text)));
+    }));
+    return blocks;
+  }));
 }
 
 void CockpitPages::openChart(CockpitPane& in, std::vector<ChartLineKey> lines) {
@@ -120,19 +161,21 @@ void CockpitPages::openChart(CockpitPane& in, std::vector<ChartLineKey> lines) {
 
 // Two minutes around it, with the cursor on it.
 void CockpitPages::openMoment(CockpitPane& in, Arrival moment) {
-  auto* const page = new ChartPage(&in, cockpit_, [&host = host_] { return host.now(); }, {});
-  page->chart().show(moment - std::chrono::minutes(1),
-                     std::min(host_.now(), moment + std::chrono::minutes(1)));
-  page->chart().setCursor(0, moment);
+  auto* const page = makeChart(in, {});
+  page->show(moment - std::chrono::minutes(1), std::min(host_.now(), moment + std::chrono::minutes(1)),
+             moment);
   in.push(page);
 }
 
 void CockpitPages::openEvents(CockpitPane& in) {
   in.push(new BlockPage(BlockPage::tr("Events"), &in, [this, &in](double width) {
     Blocks blocks;
-    for (const MarkLine& mark : cockpit_.at(host_.now()).marks)
+    for (const MarkLine& mark : cockpit_.at(host_.now()).marks) {
       blocks.push_back(
           rowBlock({.name = mark.note.empty() ? "Mark" : mark.note, .value = mark.timeText}, width));
+      blocks.back().action = [this, &in, time = mark.time] { openMoment(in, time); };
+      blocks.back().more = [this, &in, mark] { openNoteOf(in, mark.number, mark.note); };
+    }
     if (!blocks.empty()) blocks.insert(blocks.begin(), captionBlock("Marks", width));
     if (!blocks.empty()) blocks.push_back(captionBlock("Events", width));
     for (const EventLine& event : cockpit_.events(mostEvents)) {
@@ -191,7 +234,10 @@ void CockpitPages::openAlarmField(CockpitPane& in, const std::string& begin) {
 }
 
 void CockpitPages::openNote(CockpitPane& in) {
-  const std::uint64_t mark = cockpit_.mark(host_.now());
+  openNoteOf(in, cockpit_.mark(host_.now()), {});
+}
+
+void CockpitPages::openNoteOf(CockpitPane& in, std::uint64_t mark, const std::string& note) {
   auto* page =
       new SearchPage(SearchPage::tr("Marked"), SearchPage::tr("A note, if you like"), &in,
                      [this, &in, mark](const QString& text, double width) {
@@ -204,6 +250,7 @@ void CockpitPages::openNote(CockpitPane& in) {
                        return blocks;
                      });
   in.push(page);
+  page->field().setText(QString::fromStdString(note));
 }
 
 void CockpitPages::togglePin(const std::string& path) {
@@ -279,7 +326,8 @@ void CockpitPages::openKeys(CockpitPane& in) {
   in.push(new BlockPage(BlockPage::tr("Keys"), &in, [](double width) {
     Blocks blocks;
     for (const KeyWords& key : keyTable)
-      blocks.push_back(rowBlock({.name = key.words, .value = key.keys}, width));
+      blocks.push_back(key.keys ? rowBlock({.name = key.words, .value = key.keys}, width)
+                                : captionBlock(key.words, width));
     return blocks;
   }));
 }

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <functional>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -12,6 +13,7 @@
 
 namespace kelvasi {
 
+class ChartPage;
 class CockpitPane;
 
 class CockpitPages {
@@ -21,6 +23,8 @@ class CockpitPages {
     virtual Arrival now() const = 0;
     // Shows the pane of a row of the display tree, with the row marked.
     virtual void openPane(const std::string& nodePath) = 0;
+    // Keeps a new file beside the snapshots and says where; `ending` begins with a point.
+    virtual void keepFile(const std::string& ending, std::span<const std::uint8_t> bytes) = 0;
 
    protected:
     ~Host() = default;
@@ -40,10 +44,14 @@ class CockpitPages {
   void openSearch(CockpitPane& in);
   void openKeys(CockpitPane& in);
   void openAlarmField(CockpitPane& in, const std::string& begin);
+  // Sets a mark, and takes its note if one follows.
   void openNote(CockpitPane& in);
+  void openNoteOf(CockpitPane& in, std::uint64_t mark, const std::string& note);
   void togglePin(const std::string& path);
 
  private:
+  ChartPage* makeChart(CockpitPane& in, std::vector<cockpit::ChartLineKey> lines);
+  void openSaveChart(CockpitPane& in, ChartPage& chart);
   void openMoment(CockpitPane& in, Arrival moment);
   FaceActions actionsOn(CockpitPane& in);
   Blocks sheetBlocks(CockpitPane& in, const std::string& path, double width);
@@ -52,6 +60,7 @@ class CockpitPages {
 
   cockpit::Cockpit& cockpit_;
   Host& host_;
+  cockpit::Chart chartTime_;  // of all charts
 };
 
 }  // namespace kelvasi

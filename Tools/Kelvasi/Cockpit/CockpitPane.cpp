@@ -2,10 +2,16 @@
 #include "Tools/Kelvasi/Cockpit/CockpitPane.h"
 
 #include <QKeyEvent>
+#include <chrono>
 
 #include "Platform/QtWidgets/NavigationBar.h"
+#include "Platform/QtWidgets/SlideOverlay.h"
 
 namespace kelvasi {
+
+namespace {
+constexpr std::chrono::milliseconds motionTime{180};
+}
 
 CockpitPane::CockpitPane(std::function<void()> leave)
     : leave_(std::move(leave)), bar_(new NavigationBar(this, [this] { goBack(); })) {
@@ -22,10 +28,22 @@ void CockpitPane::setRoot(CockpitPage* page) {
 
 void CockpitPane::push(CockpitPage* page) {
   page->setParent(this);
-  pages_.back()->hide();
-  pages_.push_back(page);
-  showPage(*page);
+  changePage(true, [&] {
+    pages_.back()->hide();
+    pages_.push_back(page);
+    showPage(*page);
+  });
   page->firstFocus().setFocus();
+}
+
+// A page slides over the one that leads to it.
+void CockpitPane::changePage(bool isPush, const std::function<void()>& change) {
+  const bool isSeen = isAnimated_ && isVisible();
+  const QPixmap before = isSeen ? grab() : QPixmap();
+  change();
+  if (!isSeen) return;
+  const auto direction = isPush ? SlideOverlay::Direction::leftwards : SlideOverlay::Direction::rightwards;
+  new SlideOverlay(*this, rect(), {before, grab()}, direction, bar_->height(), motionTime);
 }
 
 void CockpitPane::goBack() {
@@ -33,6 +51,10 @@ void CockpitPane::goBack() {
     if (covers_) leave_();
     return;
   }
+  changePage(false, [this] { dropPage(); });
+}
+
+void CockpitPane::dropPage() {
   CockpitPage* const gone = pages_.back();
   pages_.pop_back();
   showPage(top());
@@ -42,7 +64,7 @@ void CockpitPane::goBack() {
 }
 
 void CockpitPane::goToRoot() {
-  while (pages_.size() > 1) goBack();
+  while (pages_.size() > 1) dropPage();
 }
 
 void CockpitPane::showPage(CockpitPage& page) {

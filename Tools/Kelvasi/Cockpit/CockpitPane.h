@@ -29,6 +29,8 @@ class CockpitPane : public QWidget {
   // Whether it covers the window, and so has a way out of its first page.
   void setCovering(bool covers);
   bool isCovering() const { return covers_; }
+  // Whether pages slide; they do unless the desktop asks for less.
+  void setAnimated(bool isAnimated) { isAnimated_ = isAnimated; }
 
  protected:
   void keyPressEvent(QKeyEvent* event) override;
@@ -36,10 +38,13 @@ class CockpitPane : public QWidget {
 
  private:
   void showPage(CockpitPage& page);
+  void changePage(bool isPush, const std::function<void()>& change);
+  void dropPage();
   void placePage();
 
   std::function<void()> leave_;
   bool covers_ = false;
+  bool isAnimated_ = true;
   NavigationBar* bar_;  // a child
   std::vector<CockpitPage*> pages_;
 };

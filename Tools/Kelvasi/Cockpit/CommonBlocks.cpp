@@ -33,6 +33,8 @@ Block rowBlock(const RowWords& words, double width) {
   block.height =
       std::max(leastRow, lineHeight(text) + valueHeight + (hasSecond ? lineHeight(caption) : 0) + 8);
   block.spoken = name + QStringLiteral(", ") + value + QStringLiteral(", ") + below;
+  block.name = below.isEmpty() ? name : name + QStringLiteral(", ") + below;
+  block.value = valueBelow.isEmpty() ? value : value + QStringLiteral(", ") + valueBelow;
   block.paint = [=, fade = words.fade](const Canvas& canvas, const QRectF& area) {
     const QRectF row = inside(area);
     const double high = lineHeight(text) + valueHeight + (hasSecond ? lineHeight(caption) : 0);
@@ -62,6 +64,7 @@ Block captionBlock(const std::string& words, double, const std::string& atEnd) {
   Block block;
   block.height = lineHeight(caption) + 20;
   block.spoken = shown(words);
+  block.isHeading = true;
   block.paint = [words = shown(words), end = shown(atEnd)](const Canvas& canvas, const QRectF& area) {
     canvas.text(area.adjusted(pageMargin, 14, -pageMargin, -4), end,
                 {.size = caption, .colour = &canvas.colours.secondary, .alignment = atRight});

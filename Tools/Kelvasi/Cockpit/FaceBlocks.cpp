@@ -15,6 +15,8 @@ namespace {
 using namespace cockpit;
 using namespace textSize;
 
+constexpr Qt::Alignment atRight = Qt::AlignRight | Qt::AlignVCenter;
+
 // "B7 2680 MHz  PCI 362" with its parts kept whole where lines break.
 QString partsOf(const std::string& words) {
   QStringList parts = shown(words).split(QStringLiteral("  "), Qt::SkipEmptyParts);
@@ -40,6 +42,9 @@ Block headBlock(const ServingCell& serving, const Link& link, double width) {
   Block block;
   block.height = top + high + higher + 10;
   block.spoken = title + QStringLiteral(", ") + shown(link.words) + QStringLiteral(", ") + subtitle;
+  block.name = title + QStringLiteral(", ") + subtitle;
+  block.value = shown(link.shortly);
+  block.isHeading = true;
   block.paint = [=, linkState = link.state](const Canvas& canvas, const QRectF& area) {
     const QRectF head(area.left() + pageMargin, area.top() + 4, inner, top);
     const TextLook look{.size = textSize::title, .isBold = true};
@@ -83,8 +88,14 @@ CellColumns columnsOf(const std::vector<CellLine>& cells, double width) {
     if (cell.age.fade != Fade::none)
       columns.edge = std::max(columns.edge, widthOf(shown(cell.age.text), caption));
   }
-  columns.name = std::min(columns.name, (width - 2 * pageMargin) * 0.42) + gap;
+  columns.name = std::min(columns.name, (width - 2 * pageMargin) * 0.42) + 16;
   return columns;
+}
+
+QString cellWords(const CellLine& cell) {
+  const QString level = cell.level.isReported() ? shown(cell.level.text) : QString();
+  return shown(cell.name) + QStringLiteral(", ") + level + QStringLiteral(" ") + shown(cell.level.unit) +
+         QStringLiteral(", ") + shown(cell.differenceText) + QStringLiteral(" ") + shown(cell.age.text);
 }
 
 Block cellBlock(const CellLine& cell, const CellColumns& columns, const FaceActions& actions) {
@@ -95,8 +106,10 @@ Block cellBlock(const CellLine& cell, const CellColumns& columns, const FaceActi
   const QString age = cell.age.fade == Fade::none ? QString() : shown(cell.age.text);
   Block block;
   block.height = std::max(leastRow + 4, lineHeight(text) + lineHeight(caption) + 8);
-  block.spoken = name + QStringLiteral(", ") + level + QStringLiteral(" ") + shown(cell.level.unit) +
-                 QStringLiteral(", ") + difference + QStringLiteral(" ") + shown(cell.age.text);
+  block.spoken = cellWords(cell);
+  block.name = name + QStringLiteral(", ") + below;
+  block.value = level + QStringLiteral(" ") + shown(cell.level.unit);
+  if (!age.isEmpty()) block.value += QStringLiteral(", ") + age;
   if (actions.openCell) block.action = [open = actions.openCell, number = cell.number] { open(number); };
   block.paint = [=, line = cell.level.line, fade = cell.age.fade](const Canvas& canvas, const QRectF& area) {
     const QRectF row = area.adjusted(pageMargin, 4, -pageMargin, -4);
@@ -121,6 +134,46 @@ Block cellBlock(const CellLine& cell, const CellColumns& columns, const FaceActi
                  .colour = &canvas.colours.secondary,
                  .alignment = Qt::AlignRight | Qt::AlignVCenter});
     canvas.rule(area.adjusted(pageMargin, 0, 0, 0));
+  };
+  return block;
+}
+
+// On one line, for a card.
+Block shortCellBlock(const CellLine& cell, const CellColumns& columns) {
+  const QString name = shown(cell.name);
+  const QString level = cell.level.isReported() ? shown(cell.level.text) : QString();
+  const bool isOld = cell.age.fade != Fade::none;
+  const QString end = shown(isOld ? cell.age.text : cell.differenceText);
+  Block block;
+  block.height = std::max(30.0, lineHeight(text) + 6);
+  block.spoken = cellWords(cell);
+  block.paint = [=, line = cell.level.line, fade = cell.age.fade](const Canvas& canvas, const QRectF& area) {
+    const QRectF row = area.adjusted(pageMargin, 0, -pageMargin, 0);
+    const QColor& colour = canvas.colours.of(fade);
+    const QRectF number(row.left() + columns.name, row.top(), columns.level, row.height());
+    canvas.text({row.left(), row.top(), columns.name, row.height()}, name, {.size = text, .colour = &colour});
+    canvas.text(number, level, {.size = text, .isBold = true, .colour = &colour, .alignment = atRight});
+    const QRectF course(number.right() + 16, row.top() + 6,
+                        row.right() - columns.edge - 16 - number.right() - 16, row.height() - 12);
+    canvas.course(course, line, isOld ? canvas.colours.stale : canvas.colours.accent, 1.5);
+    canvas.text(row, end, {.size = isOld ? caption : text, .colour = &colour, .alignment = atRight});
+  };
+  return block;
+}
+
+// The newest on one line, for a card.
+Block shortEventBlock(const EventLine& event, double) {
+  const QString time = shown(event.timeText);
+  const QString words = shown(event.words);
+  Block block;
+  block.height = lineHeight(secondary) + 16;
+  block.spoken = time + QStringLiteral(", ") + words;
+  block.paint = [=](const Canvas& canvas, const QRectF& area) {
+    const QRectF row = area.adjusted(pageMargin, 4, -pageMargin, 0);
+    const double taken = widthOf(time, secondary) + 12;
+    canvas.rule({area.left() + pageMargin, area.top(), area.width() - pageMargin, 1});
+    canvas.text(row, time, {.size = secondary, .colour = &canvas.colours.secondary});
+    canvas.text(row.adjusted(taken, 0, 0, 0), words, {.size = secondary});
   };
   return block;
 }
@@ -226,16 +279,24 @@ Blocks faceBlocks(const Snapshot& snapshot, const FaceActions& actions, double w
 }
 
 Blocks cardBlocks(const Snapshot& snapshot, double width, double height) {
-  Blocks all;
-  all.push_back(headBlock(snapshot.serving, snapshot.link, width));
-  addServing(all, snapshot.serving, {}, width);
-  const CellColumns columns = columnsOf(snapshot.cells, width);
-  for (const CellLine& cell : snapshot.cells) all.push_back(cellBlock(cell, columns, {}));
-  double used = 0;
+  Blocks blocks;
+  addAlarms(blocks, snapshot, {}, width);
+  blocks.push_back(headBlock(snapshot.serving, snapshot.link, width));
+  if (auto levels = levelTiles(snapshot.serving.levels, width)) blocks.push_back(std::move(*levels));
+  std::optional<Block> last;
+  if (!snapshot.events.empty()) last = shortEventBlock(snapshot.events.front(), width);
+  double left = height - (last ? last->height : 0);
   const auto tooMuch =
-      std::ranges::find_if(all, [&](const Block& block) { return (used += block.height) > height; });
-  all.erase(tooMuch, all.end());
-  return all;
+      std::ranges::find_if(blocks, [&](const Block& block) { return (left -= block.height) < 0; });
+  blocks.erase(tooMuch, blocks.end());
+  const CellColumns columns = columnsOf(snapshot.cells, width);
+  for (const CellLine& cell : snapshot.cells) {
+    Block block = shortCellBlock(cell, columns);
+    if ((left -= block.height) < 0) break;
+    blocks.push_back(std::move(block));
+  }
+  if (last) blocks.push_back(std::move(*last));
+  return blocks;
 }
 
 }  // namespace kelvasi

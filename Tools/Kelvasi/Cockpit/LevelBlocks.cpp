@@ -37,6 +37,8 @@ Block missingBlock(const Level& level) {
   block.height = lineHeight(secondary) + 10;
   const QString name = shown(level.name);
   block.spoken = name + QStringLiteral(", not reported");
+  block.name = name;
+  block.value = shown(level.text);
   block.paint = [name, words = shown(level.text)](const Canvas& canvas, const QRectF& area) {
     const QRectF row = area.adjusted(pageMargin, 0, -pageMargin, 0);
     canvas.text(row, name, {.size = secondary, .colour = &canvas.colours.secondary});
@@ -66,7 +68,60 @@ void paintFigure(const Canvas& canvas, const QRectF& area, const Level& level) {
       {.size = secondary, .colour = &canvas.colours.secondary, .alignment = Qt::AlignLeft | Qt::AlignBottom});
 }
 
+constexpr double tileCourse = 30;
+
+// Name and verdict, the figure, and its minute below them.
+void paintTile(const Canvas& canvas, const QRectF& area, const Level& level) {
+  const double captionHigh = lineHeight(caption);
+  const QString name = captionOf(level);
+  canvas.text({area.left(), area.top(), area.width(), captionHigh}, name,
+              {.size = caption, .colour = &canvas.colours.secondary});
+  const double verdictLeft = area.left() + widthOf(name, caption) + gap;
+  if (level.verdict != Verdict::none) {
+    canvas.verdict({verdictLeft + 6 * textScale(), area.top() + captionHigh / 2}, level.verdict);
+    canvas.text({verdictLeft + 16 * textScale(), area.top(), area.right() - verdictLeft, captionHigh},
+                shown(level.verdictWord), {.size = caption});
+  }
+  const QRectF figureArea(area.left(), area.top() + captionHigh, area.width(), lineHeight(figure));
+  paintFigure(canvas, figureArea, level);
+  const QColor& colour = level.age.fade == Fade::none ? canvas.colours.accent : canvas.colours.stale;
+  canvas.course({area.left(), figureArea.bottom(), area.width(), tileCourse - 6}, level.line, colour, strong);
+}
+
 }  // namespace
+
+std::optional<Block> levelTiles(const std::vector<Level>& levels, double width) {
+  constexpr std::size_t most = 3;
+  constexpr double between = 24;
+  const double inner = width - 2 * pageMargin;
+  std::vector<Level> chosen;
+  double least = 0;
+  for (const Level& level : levels) {
+    if (!level.isReported() || chosen.size() == most) continue;
+    const double verdict =
+        level.verdict == Verdict::none ? 0 : 24 * textScale() + widthOf(shown(level.verdictWord), caption);
+    const double wide = std::max(figureWidth(level), widthOf(captionOf(level), caption) + verdict);
+    const double widest = std::max(least, wide);
+    const auto count = static_cast<double>(chosen.size() + 1);
+    if (!chosen.empty() && count * widest + (count - 1) * between > inner) break;
+    least = widest;
+    chosen.push_back(level);
+  }
+  if (chosen.empty()) return std::nullopt;
+  Block block;
+  block.height = lineHeight(caption) + lineHeight(figure) + tileCourse + 10;
+  for (const Level& level : chosen) block.spoken += levelBlock(level, 0, width).spoken + QStringLiteral(". ");
+  block.paint = [=](const Canvas& canvas, const QRectF& area) {
+    const auto count = static_cast<double>(chosen.size());
+    const double wide = (inner - (count - 1) * between) / count;
+    double left = area.left() + pageMargin;
+    for (const Level& level : chosen) {
+      paintTile(canvas, {left, area.top() + 4, wide, area.height() - 8}, level);
+      left += wide + between;
+    }
+  };
+  return block;
+}
 
 double figureColumn(const std::vector<Level>& levels) {
   double widest = 0;
@@ -87,6 +142,11 @@ Block levelBlock(const Level& level, double figureColumn, double width) {
   block.spoken = shown(level.name) + QStringLiteral(", ") + shown(level.text) + QStringLiteral(" ") +
                  shown(level.unit) + QStringLiteral(", ") + shown(level.verdictWord) + QStringLiteral(", ") +
                  shown(level.age.text);
+  block.name = shown(level.name);
+  block.value = shown(level.text) + QStringLiteral(" ") + shown(level.unit);
+  for (const QString& part :
+       {shown(level.verdictWord), level.age.fade == Fade::none ? QString() : shown(level.age.text)})
+    if (!part.isEmpty()) block.value += QStringLiteral(", ") + part;
   block.paint = [=](const Canvas& canvas, const QRectF& area) {
     const QRectF row = area.adjusted(pageMargin, 4, -pageMargin, -4);
     canvas.text({row.left(), row.top(), row.width(), captionHeight}, captionOf(level),
