@@ -107,7 +107,7 @@ class WrongUsage(KelvasictlTest):
                 self.assertEqual(result.stdout, b"")
 
     def test_is_told_in_plain_words(self):
-        for arguments, words in (([], "a subcommand is missing: decode, monitor, readings, record"),
+        for arguments, words in (([], "a subcommand is missing: decode, monitor, top, readings, record"),
                                  (["unknown"], "The following argument was not expected: unknown"),
                                  (["monitor", "--seconds", "x"], '--seconds: "x" is no number from 0 to 1000000000'),
                                  (["monitor", "--seconds", "nan"], '--seconds: "nan" is no number'),

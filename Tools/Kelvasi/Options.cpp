@@ -2,10 +2,9 @@
 #include "Tools/Kelvasi/Options.h"
 
 #include <cstdlib>
-#include <filesystem>
-#include <stdexcept>
 
 #include "Platform/Posix/PrivateFiles.h"
+#include "Tools/LogDirectory.h"
 
 namespace kelvasi {
 
@@ -16,18 +15,12 @@ std::string environment(const char* name) {
   return value ? value : "";
 }
 
-std::optional<std::filesystem::path> stateDirectory() {
-  const std::string state = environment("XDG_STATE_HOME");
-  const std::string home = environment("HOME");
-  if (!state.empty()) return std::filesystem::path(state) / "kelvasi";
-  if (!home.empty()) return std::filesystem::path(home) / ".local/state/kelvasi";
-  return std::nullopt;
-}
-
 }  // namespace
 
 void declareOptions(OptionSet app, ViewerOptions& options) {
   app.addFlag("--fullscreen", options.fullScreen, "fill the screen; a window of 390 by 844 points otherwise");
+  app.addFlag("--terminal", options.isInTerminal,
+              "run in the terminal, as `kelvasictl top` does; so it is without a display");
   app.addFlag("--log-stderr", options.logsToStderr,
               R"(system-log lines go to the standard error, as "<N>text", instead of to syslog)");
   app.addReader<std::string>(
@@ -62,17 +55,6 @@ std::string memoryFile(const std::string& stated) {
   if (!stated.empty() || !directory) return stated;
   makeFolders(*directory);  // without it nothing is remembered
   return *directory / "window.ini";
-}
-
-std::string makeLogDirectory() {
-  const std::string configured = environment("KELVASI_LOG_DIRECTORY");
-  if (!configured.empty()) return configured;
-  const auto directory = stateDirectory();
-  if (!directory)
-    throw std::runtime_error(
-        "nowhere to save snapshots: none of KELVASI_LOG_DIRECTORY, XDG_STATE_HOME and HOME is set");
-  makeFolders(*directory);  // a failure is told when a snapshot is saved
-  return *directory;
 }
 
 }  // namespace kelvasi

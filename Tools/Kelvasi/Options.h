@@ -13,6 +13,7 @@ namespace kelvasi {
 struct ViewerOptions {
   bool fullScreen = false;
   bool logsToStderr = false;
+  bool isInTerminal = false;  // instead of a window
   std::optional<ColourScheme> colourScheme;
   bool followsDesktop = false;  // its colours, whatever was remembered
   std::optional<double> textScale;
@@ -28,9 +29,5 @@ bool hasDisplay();
 // Where what is remembered of the window is kept: `stated`, else window.ini where snapshots go by default.
 // Empty for nowhere.
 std::string memoryFile(const std::string& stated);
-
-// Where snapshots go: $KELVASI_LOG_DIRECTORY; else kelvasi in $XDG_STATE_HOME or ~/.local/state, which is
-// made. Throws std::runtime_error when none of the variables says where.
-std::string makeLogDirectory();
 
 }  // namespace kelvasi

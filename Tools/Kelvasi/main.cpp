@@ -1,5 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // kelvasi: wires the viewer to its surroundings.
+#include <unistd.h>
+
 #include <QApplication>
 #include <QCoreApplication>
 #include <cstdio>
@@ -31,7 +33,9 @@
 #include "Tools/Kelvasi/Options.h"
 #include "Tools/Kelvasi/Script.h"
 #include "Tools/Kelvasi/TemplateNotice.h"
+#include "Tools/Kelvasi/TerminalViewer.h"
 #include "Tools/Kelvasi/ViewerMemory.h"
+#include "Tools/LogDirectory.h"
 
 namespace kelvasi {
 
@@ -123,6 +127,11 @@ int main(int argumentCount, char** arguments) {
   kelvasi::ViewerOptions options;
   kelvasi::declareOptions(commandLine.options(), options);
   if (const auto status = commandLine.parse(argumentCount, arguments)) return *status;
+  const bool isForTerminal = !kelvasi::hasDisplay() && options.script.empty() && ::isatty(STDOUT_FILENO) == 1;
+  if (options.isInTerminal || isForTerminal) {
+    std::fprintf(stderr, "kelvasi: %s\n", kelvasi::becomeTerminalViewer(options.logsToStderr).c_str());
+    return 1;
+  }
   if (!kelvasi::hasDisplay()) {
     std::fprintf(stderr, "kelvasi: there is no display (neither WAYLAND_DISPLAY nor DISPLAY is set)\n");
     return 1;

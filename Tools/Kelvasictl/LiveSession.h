@@ -31,6 +31,7 @@ class LiveSession {
   KelvasiModel& model() { return model_; }
   MainQueue& queue() { return queue_; }
   const Clock& clock() const { return surroundings_.clock; }
+  Platform platform() const { return surroundings_.platform(); }
 
   // Whether the tree, since this was asked last, has become one that a generator of another technology left.
   bool hasBegunToShowAnother();

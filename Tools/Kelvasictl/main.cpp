@@ -19,6 +19,7 @@ namespace {
 constexpr std::array verbs{
     Verb{"decode", "decode captures and print the display", declareDecode},
     Verb{"monitor", "print the display of a live link at every update", declareMonitor},
+    Verb{"top", "cockpit and panes on a terminal, of a live link or of a drive", declareTop},
     Verb{"readings", "print what every message wrote or removed, a line each", declareReadings},
     Verb{"record", "record a live link to a capture", declareRecord},
     Verb{"cells", "the cells of captures or of a live link, with their levels", declareCells},
