@@ -2,6 +2,7 @@
 #include "LogGenerator/LogGenerator.h"
 
 #include <array>
+#include <bit>
 #include <utility>
 
 #include "LogGenerator/Exceptions.h"
@@ -15,20 +16,38 @@ namespace {
 
 constexpr std::size_t historyLimit = 5;
 
-PlistValue historyEntry(const PlistDictionary& state, const std::string& date) {
-  const std::array entries{
-      std::pair{"DisplayState", state.get("DisplayState").shallowCopy()},
-      std::pair{"Display", state.get("Display").shallowCopy()},
-      std::pair{"ExtraInfo", state.get("ExtraInfo").shallowCopy()},
-      std::pair{"Date", PlistValue(date)},
-      std::pair{"Description", PlistValue("Snapshot (" + date + ")")},
-  };
-  const auto entry = PlistDictionary::make();
-  for (const auto& [key, value] : entries) {
-    if (value.isAbsent()) break;
-    entry->set(key, value);
+std::string dateText(const void*, std::int64_t seconds) {
+  return description(PlistDate{std::bit_cast<double>(seconds)});
+}
+
+std::string snapshotText(const void*, std::int64_t seconds) {
+  return "Snapshot (" + dateText(nullptr, seconds) + ")";
+}
+
+// A shallow copy, written over one that nobody else holds.
+void copyOver(PlistValue& copy, const PlistValue& value) {
+  if (value.dictionary() && copy.dictionary() && !copy.isShared()) {
+    *copy.dictionary() = *value.dictionary();
+  } else {
+    copy = value.shallowCopy();
   }
-  return entry;
+}
+
+void writeHistoryEntry(PlistDictionary& entry, const PlistDictionary& state, PlistDate date) {
+  const auto seconds = std::bit_cast<std::int64_t>(date.secondsSince1970);
+  const std::array values{
+      std::pair{"DisplayState", state.get("DisplayState")},
+      std::pair{"Display", state.get("Display")},
+      std::pair{"ExtraInfo", state.get("ExtraInfo")},
+      std::pair{"Date", PlistValue(DeferredText{dateText, nullptr, seconds})},
+      std::pair{"Description", PlistValue(DeferredText{snapshotText, nullptr, seconds})},
+  };
+  std::size_t place = 0;
+  for (const auto& [key, value] : values) {
+    if (value.isAbsent()) break;
+    copyOver(entry.rewrite(key, place), value);
+  }
+  entry.truncate(place);
 }
 
 }  // namespace
@@ -59,11 +78,18 @@ bool LogGenerator::ownsDisplay(const PlistDictionary&) const {
 
 void LogGenerator::describe(RowCatalog&) const {}
 
+// The oldest entry becomes the newest one, unless somebody else holds it.
 void LogGenerator::updateHistoryInState(PlistDictionary& state, const Clock& clock) {
   if (!state.get("History").array()) state.set("History", PlistArray::make());
   PlistArray& history = *state.get("History").array();
-  if (history.size() >= historyLimit) history.removeFirst(history.size() - (historyLimit - 1));
-  history.append(historyEntry(state, description(clock.now())));
+  PlistValue entry;
+  if (history.size() >= historyLimit) {
+    entry = history.at(0);
+    history.removeFirst(history.size() - (historyLimit - 1));
+  }
+  if (!entry.dictionary() || entry.isShared()) entry = PlistDictionary::make();
+  writeHistoryEntry(*entry.dictionary(), state, clock.now());
+  history.append(std::move(entry));
 }
 
 }  // namespace kelvasi

@@ -41,7 +41,9 @@ void OrvaneLogGenerator::appendRawMessage(std::span<const std::uint8_t> message)
 }
 
 void OrvaneLogGenerator::moveRawMessagesInto(PlistDictionary& state) {
+  const std::size_t size = binData_.size();
   state.set("DisplayState", std::exchange(binData_, {}));
+  binData_.reserve(size);  // the next interval is likely to be as large
 }
 
 }  // namespace kelvasi

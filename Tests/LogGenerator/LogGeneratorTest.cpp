@@ -76,6 +76,21 @@ TEST(History, TheSixthEntryDropsTheOldest) {
   EXPECT_EQ(*historyOf(state).at(4).dictionary()->get("DisplayState").integer(), 6);
 }
 
+TEST(History, AnEntryIsWrittenOverWhenNobodyElseHoldsIt) {
+  const test::FakeClock clock;
+  PlistDictionary state{{"DisplayState", Bytes{}}, {"Display", PlistDictionary::make({{"row", 1}})}};
+  for (int number = 1; number <= 5; ++number) LogGenerator::updateHistoryInState(state, clock);
+  const PlistDictionary* oldest = historyOf(state).at(0).dictionary();
+  const PlistValue held = historyOf(state).at(1);
+  state.set("Display", PlistDictionary::make({{"row", 2}, {"other", 3}}));
+  LogGenerator::updateHistoryInState(state, clock);
+  EXPECT_EQ(historyOf(state).at(4).dictionary(), oldest);
+  EXPECT_EQ(oldest->get("Display"), state.get("Display"));
+  LogGenerator::updateHistoryInState(state, clock);
+  EXPECT_NE(historyOf(state).at(4).dictionary(), held.dictionary());
+  EXPECT_EQ(held.dictionary()->get("Display"), PlistValue(PlistDictionary::make({{"row", 1}})));
+}
+
 TEST(History, ALongHistoryIsCutToFourBeforeTheNewEntry) {
   const test::FakeClock clock;
   const auto history = PlistArray::make({1, 2, 3, 4, 5, 6, 7, 8, 9});
