@@ -2,8 +2,11 @@
 // Remembers what the last bytes parsed gave, so that the decoders that read one record parse it once.
 //
 // What it hands out is shared: readers may pass parts of it on, and change none of it. What they have let go
-// of by the next record is written over. For one thread.
+// of by the next list of the same kind is written over: lists whose first keys are the same. For one thread.
 #pragma once
+
+#include <string>
+#include <vector>
 
 #include "Platform/PlistSerialiser.h"
 
@@ -23,10 +26,17 @@ class LastParsed : public PlistSerialiser {
   }
 
  private:
+  struct Kind {
+    std::string firstKey;
+    bool hasParsed = false;
+    Bytes bytes;
+    PlistValue parsed;  // absent: no property list
+  };
+
+  Kind& kindOf(std::string_view firstKey) const;
+
   const PlistSerialiser& serialiser_;
-  mutable bool hasParsed_ = false;
-  mutable Bytes bytes_;
-  mutable PlistValue parsed_;  // absent: no property list
+  mutable std::vector<Kind> kinds_;
 };
 
 }  // namespace kelvasi

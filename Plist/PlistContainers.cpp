@@ -54,7 +54,7 @@ void PlistDictionary::removeAll() {
 
 template <typename Text>
 std::size_t PlistDictionary::setAnyText(std::string_view key, Text text, std::size_t place) {
-  if (place >= size() || entries_[place].first != key) place = placeOf(key);
+  if (place >= size() || std::string_view(entries_[place].first) != key) place = placeOf(key);
   if (place == size()) return append(key, text);
   entries_[place].second.set(text);
   return place + 1;
@@ -62,7 +62,7 @@ std::size_t PlistDictionary::setAnyText(std::string_view key, Text text, std::si
 
 template <typename Text>
 std::size_t PlistDictionary::rewriteAnyText(std::string_view key, Text text, std::size_t place) {
-  if (place < size() && entries_[place].first != key) truncate(place);
+  if (place < size() && std::string_view(entries_[place].first) != key) truncate(place);
   return setAnyText(key, text, place);
 }
 

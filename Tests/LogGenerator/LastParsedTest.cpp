@@ -71,6 +71,30 @@ TEST(LastParsed, WritesOverWhatNobodyHolds) {
   EXPECT_EQ(*third, PlistValue(PlistArray::make({3})));
 }
 
+Bytes withFirstKey(std::string key, std::size_t size) {
+  const std::string text = "<dict><key>" + key + "</key>" + std::string(size, ' ');
+  return {text.begin(), text.end()};
+}
+
+TEST(LastParsed, KeepsAValueForEachKind) {
+  const OverwritingSerialiser serialiser;
+  const LastParsed lastParsed(serialiser);
+  const PlistArray* cells = lastParsed.parse(withFirstKey("MCC", 1))->array();
+  const PlistArray* contexts = lastParsed.parse(withFirstKey("APN", 1))->array();
+  EXPECT_NE(contexts, cells);
+  EXPECT_EQ(lastParsed.parse(withFirstKey("MCC", 2))->array(), cells);
+  EXPECT_EQ(lastParsed.parse(withFirstKey("APN", 1))->array(), contexts);
+}
+
+TEST(LastParsed, KindsBeyondTheFirstFewShareAPlace) {
+  const OverwritingSerialiser serialiser;
+  const LastParsed lastParsed(serialiser);
+  for (std::size_t size = 1; size < 20; ++size) {
+    const Bytes bytes = withFirstKey(std::to_string(size), size);
+    EXPECT_EQ(*lastParsed.parse(bytes), PlistValue(PlistArray::make({bytes.size()})));
+  }
+}
+
 TEST(LastParsed, SerialisesThroughWhatItWasGiven) {
   const CountingSerialiser serialiser;
   EXPECT_EQ(LastParsed(serialiser).serialiseXml("text"), hex("AB"));
