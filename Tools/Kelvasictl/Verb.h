@@ -26,6 +26,7 @@ Action declareFields(OptionSet verb);
 Action declareMonitor(OptionSet verb);
 Action declareReadings(OptionSet verb);
 Action declareRecord(OptionSet verb);
+Action declareRedact(OptionSet verb);
 Action declareTop(OptionSet verb);
 
 struct Verb {
