@@ -12,8 +12,8 @@ import re
 import sys
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent
-HOUSE = ["Plist", "Platform", "Radio", "Telvon", "Dlf", "LogGenerator", "Model", "Survey", "Redaction", "Cockpit", "App",
-         "Capture", "Modem", "Simulator", "Tools"]
+HOUSE = ["Plist", "Platform", "Radio", "Telvon", "Dlf", "LogGenerator", "Model", "Survey", "Redaction", "Report", "Cockpit",
+         "App", "Capture", "Modem", "Simulator", "Tools"]
 # Rooms of LogGenerator/ and Simulator/, and beside them in Tests/ and Bench/.
 TECHNOLOGIES = {"GSM", "LTE", "UTRAN", "C2K", "ObjectStream"}
 MIRRORS = ["Tests", "Bench"]

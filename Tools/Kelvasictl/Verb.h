@@ -27,6 +27,7 @@ Action declareMonitor(OptionSet verb);
 Action declareReadings(OptionSet verb);
 Action declareRecord(OptionSet verb);
 Action declareRedact(OptionSet verb);
+Action declareReport(OptionSet verb);
 Action declareTop(OptionSet verb);
 
 struct Verb {

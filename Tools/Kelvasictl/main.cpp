@@ -29,6 +29,7 @@ constexpr std::array verbs{
     Verb{"dissector", "print a dissector for Wireshark, made from the tables of the decoders",
          declareDissector},
     Verb{"extcap", "make live links appear among the interfaces of Wireshark", declareExtcap},
+    Verb{"report", "a drive on one page, for a browser or paper", declareReport},
     Verb{"redact", "write a capture anew without what says of whom it is", declareRedact},
     Verb{"fields", "list every row of every technology, and what stands behind it", declareFields},
 };
