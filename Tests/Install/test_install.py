@@ -130,7 +130,7 @@ class Installed(LiveTest):
         found = {"WIRESHARK_PLUGIN_DIR": f"{self.prefix}/lib/wireshark/plugins", "HOME": self.directory.name}
         shown = subprocess.run([*AS_A_USER, "tshark", "-r", capture, "-Y", 'kelvasi.gsm.process_cs.mm_state == "MM_IDLE"'],
                                env=self.environment | found, capture_output=True, text=True, timeout=PATIENCE, check=True)
-        self.assertIn("GSM 0x7131 Process CS", shown.stdout)
+        self.assertIn("GSM 0x7131 Process CO, Process CS", shown.stdout)
         script = (self.prefix / "lib/wireshark/extcap/kelvasi-extcap").read_text(encoding="utf-8")
         self.assertEqual(script.splitlines()[-1], 'exec "/opt/kelvasi/bin/kelvasictl" extcap "$@"')
         made = self.run_installed("kelvasictl", "dissector")
