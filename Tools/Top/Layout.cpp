@@ -50,6 +50,7 @@ void stack(const std::array<Part, count>& parts, const std::array<std::size_t, c
 constexpr int all = 10'000;
 
 void layOutOne(Layout& layout, const Wishes& wishes, Area room) {
+  const int leastPanes = room.rows < 20 ? 5 : 7;
   const std::array parts{
       Part{&layout.head, 2, wishes.head, false},
       Part{&layout.alarms, 1, wishes.alarms, false},
@@ -59,11 +60,12 @@ void layOutOne(Layout& layout, const Wishes& wishes, Area room) {
       Part{&layout.cells, 4, wishes.cells, true},
       Part{&layout.carriers, 0, wishes.carriers, true},
       Part{&layout.events, 2, std::min(wishes.events, 3), true},
-      Part{&layout.panes, room.rows < 20 ? 5 : 7, all, true},
+      Part{&layout.panes, leastPanes, std::max(wishes.panes, leastPanes), true},
   };
   // From the last one needed to have a whole screen backwards: head, levels and panes are there on the
   // smallest.
   stack(parts, std::array<std::size_t, 9>{0, 2, 8, 1, 4, 5, 7, 3, 6}, room);
+  if (layout.panes.rows > 0) layout.panes.rows = room.row + room.rows - layout.panes.row;
 }
 
 void layOutCockpit(Layout& layout, const Wishes& wishes, Area room, bool hasEvents) {

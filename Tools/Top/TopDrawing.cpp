@@ -24,6 +24,13 @@ std::string moreWords(int count, int room) {
   return room > 0 && count > room ? std::to_string(room) + " of " + std::to_string(count) : "";
 }
 
+// What orders the first of them, and its unit.
+std::string cellsTitle(const cockpit::Snapshot& face) {
+  if (face.cells.empty()) return "Cells";
+  const cockpit::Level& level = face.cells.front().level;
+  return "Cells, " + std::string(level.name) + " in " + std::string(level.unit) + ", and dB to serving";
+}
+
 void drawDivider(Grid& grid, int column, int rows, const Look& look) {
   const auto bar = terminal::glyphsOf("\u2502", look.set).front();
   for (int row = 0; row < rows; ++row) grid.set({column, row}, bar, {.role = Role::line});
@@ -82,7 +89,7 @@ void Top::drawMain(Grid& grid, const cockpit::Snapshot& face, const Look& look) 
   drawLines(grid, layout_.levels, levels, look);
   if (face.second) drawTitled(grid, layout_.second, face.second->title, second, look);
   drawTitled(grid, layout_.pins, "Pins", pins, look);
-  drawTitled(grid, layout_.cells, "Cells, dBm, and dB to serving", cells, look);
+  drawTitled(grid, layout_.cells, cellsTitle(face), cells, look);
   drawTitled(grid, layout_.carriers, "Carriers", carriers, look);
   drawTitled(grid, layout_.events, "Events", events, look);
   const auto room = static_cast<std::size_t>(std::max(layout_.panes.rows, 0));

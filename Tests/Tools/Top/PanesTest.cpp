@@ -86,7 +86,7 @@ TEST(Panes, ALongValueCanBeMoved) {
   panes.reload(tree(PlistDictionary::make({{"APN", "a.very.long.name.of.an.access.point"}})));
   EXPECT_EQ(text(panes), "APN  a.very.long.na…\n");
   EXPECT_TRUE(panes.slide(16));
-  EXPECT_EQ(asText(panes.lines(20, 10, {}, true), 20), "ong.name.of.an.acce…\n");
+  EXPECT_EQ(asText(panes.lines(20, 10, {}, true), 20), ".name.of.an.access.…\n");
   EXPECT_TRUE(panes.slide(-16));
   EXPECT_FALSE(panes.slide(-16));
 }
