@@ -47,7 +47,7 @@ int run(const ReportOptions& options, MessageTally& tally) {
 Action declareReport(OptionSet verb) {
   const auto options = std::make_shared<ReportOptions>();
   options->InputOptions::addTo(verb, "All of them are one drive");
-  verb.add("-o,--output", options->output, "the HTML file; - is the standard output").required();
+  verb.add("-o,--output", options->output, "the HTML file; - is the standard output").type("FILE").required();
   verb.setFooter(footer);
   return [options](MessageTally& tally) { return run(*options, tally); };
 }
