@@ -177,6 +177,8 @@ void CursesTerminal::Library::suspend() {
   takeSize();
   ::clearok(::curscr, TRUE);
   ::refresh();
+  ::keypad(::stdscr,
+           TRUE);  // ncurses says it to the terminal with the next key only, and an arrow may be that one
 }
 
 void CursesTerminal::Library::write(const std::string& bytes) const {

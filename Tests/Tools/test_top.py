@@ -202,6 +202,7 @@ class Ends(TopTest):
         terminal.press("enter")
         terminal.await_text("RSRP", "── Kelvasi ──")
         self.assertEqual(termios.tcgetattr(terminal.side), modes)
+        self.assertGreater(terminal.received.rindex(b"\x1b[?1h"), terminal.received.rindex(b"\x1b[?1l"))  # arrows' keys
         terminal.press("q")
         terminal.await_text("ENDED 0")
 

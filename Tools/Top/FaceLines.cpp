@@ -55,11 +55,15 @@ TextLine levelLine(const Level& level, const LevelColumns& columns, int width, c
   line.left = {{padRight(std::string(level.name), columns.name + 2, look), secondary},
                {padLeft(level.text, columns.value, look), style},
                {" " + padRight(std::string(level.unit), columns.unit, look) + " ", secondary}};
+  const bool isOld = level.age.fade != Fade::none;
   const int course = courseColumns(width - used);
-  if (course > 0) line.left.push_back({courseOf(level.line, course) + "  ", {.role = Role::accent}});
+  if (course > 0)
+    line.left.push_back({courseOf(level.line, course) + "  ", isOld ? stale : Style{.role = Role::accent}});
   line.left.push_back(signOf(level.verdict));
-  line.left.push_back({" " + padRight(std::string(level.verdictWord), 9, look) + " "});
-  if (level.age.fade != Fade::none) {
+  if (isOld) line.left.back().style = stale;
+  line.left.push_back(
+      {" " + padRight(std::string(level.verdictWord), 9, look) + " ", isOld ? stale : Style{}});
+  if (isOld) {
     line.left.push_back({level.age.text, stale});
   } else {
     line.left.push_back({arrowOf(level.trend), secondary});

@@ -47,7 +47,7 @@ class HelpPage : public ListPage {
 
  protected:
   Lines rows(int columns, const Look& look) override {
-    const int column = std::min(28, columns / 2);
+    const int column = std::min(28, columns * 7 / 10);
     Lines lines;
     for (const KeyWords& key : keyTable) {
       const auto words = wrapped(key.words, columns - column, look);

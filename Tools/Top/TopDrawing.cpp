@@ -13,7 +13,8 @@ namespace {
 
 using terminal::Grid;
 
-constexpr int highTimeline = 20;  // rows of a screen from which a timeline has three
+constexpr std::size_t mostEvents = 1000;  // that are counted in the title
+constexpr int highTimeline = 20;          // rows of a screen from which a timeline has three
 
 int rowsOf(const Lines& lines) {
   return static_cast<int>(lines.size());
@@ -72,7 +73,7 @@ void Top::drawMain(Grid& grid, const cockpit::Snapshot& face, const Look& look) 
   const Lines pins = pinLines(face, look);
   const Lines cells = cellLines(face, columns, look);
   const Lines carriers = carrierLines(face);
-  const auto newest = scene_.events(static_cast<std::size_t>(std::max(size.rows, 0)));
+  const auto newest = scene_.events(mostEvents);
   const Lines events = eventLines(newest, face.eventsWhy);
   layout_ = layOut(size, {.head = rowsOf(head),
                           .levels = rowsOf(levels),
