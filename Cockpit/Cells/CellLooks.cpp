@@ -71,8 +71,10 @@ std::vector<CellOrder::Candidate> candidatesOf(const View& view, const ServingCe
     const auto kind = mainLevel(cell.identity.family);
     if (!kind || serves(serving, cell) || timeSince(cell.last, now) >= forgottenAge) continue;
     const auto level = latest(view, cell, *kind);
-    if (!level) continue;
-    const int group = groupOf(serving, cell.identity.family) + (isGone(cell, lists, now) ? gone : 0);
+    // A cell that is spoken of without its level is no newer for it.
+    if (!level || timeSince(level->time, now) >= forgottenAge) continue;
+    const bool isOut = isGone(cell, lists, now) || timeSince(level->time, now) >= goneAge;
+    const int group = groupOf(serving, cell.identity.family) + (isOut ? gone : 0);
     candidates.push_back({cell.number, group, level->value});
   }
   return candidates;

@@ -89,6 +89,19 @@ TEST(CellLines, ACellThatIsSpokenOfWithoutItsLevelHasNoLevelOfNow) {
   }
 }
 
+TEST(CellLines, ACellWhoseLevelIsGoneStandsBehindThosePresentAndIsForgotten) {
+  Fed fed;
+  fed.take(listed(0s, {{cell362, -80}}));
+  for (const auto after : {40s, 60s}) {
+    Message message = served(after, cell404, -95);
+    message.neighbour(cell362, quantity::pci, 362).neighbour(cell257, quantity::rsrp, -100);
+    fed.take(message);
+    Texts lines{"PCI 257 -100 -5 live"};
+    if (after == 40s) lines.emplace_back("PCI 362 -80  gone 40 s");
+    EXPECT_EQ(shown(fed.at(after)), lines);
+  }
+}
+
 TEST(CellLines, StayWhereTheyAreWhileHeld) {
   Fed fed;
   fed.take(listed(0s, {{cell362, -90}, {cell257, -100}}));
