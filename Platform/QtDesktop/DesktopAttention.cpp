@@ -13,7 +13,7 @@ namespace kelvasi {
 
 namespace {
 
-// Names of the freedesktop sound naming specification, which feedback themes use too.
+// Names of the freedesktop.org sound naming, which feedback themes use too.
 const QString event = QStringLiteral("alarm-clock-elapsed");
 const QString application = QStringLiteral("org.kelvasi.Kelvasi");
 constexpr uchar critical = 2;  // stays until it is dismissed
